@@ -1,0 +1,49 @@
+# How a target of this project is built; every target goes through one of these functions.
+
+function(nvldm_compile_options target)
+    target_compile_features(${target} PUBLIC cxx_std_20)
+    target_compile_options(${target} PRIVATE
+        -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wold-style-cast -Wcast-qual
+        $<$<BOOL:${NVLDM_WERROR}>:-Werror>)
+endfunction()
+
+# A static library of one folder. PUBLIC and PRIVATE name what it may include: a header of a library that is
+# not linked here is not on the include path.
+#   nvldm_library(name SOURCES … [PUBLIC …] [PRIVATE …])
+function(nvldm_library name)
+    cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
+    add_library(${name} STATIC ${ARG_SOURCES})
+    target_include_directories(${name} PUBLIC "${CMAKE_CURRENT_SOURCE_DIR}")
+    target_link_libraries(${name} PUBLIC ${ARG_PUBLIC} PRIVATE ${ARG_PRIVATE})
+    nvldm_compile_options(${name})
+endfunction()
+
+# The same for a library of Qt code: moc and uic run, strings stay QString on purpose, and log lines carry
+# their source line in release builds too.
+function(nvldm_qt_library name)
+    nvldm_library(${name} ${ARGN})
+    nvldm_qt_options(${name})
+endfunction()
+
+function(nvldm_qt_options target)
+    set_target_properties(${target} PROPERTIES AUTOMOC ON AUTOUIC ON)
+    target_compile_definitions(${target} PRIVATE
+        QT_MESSAGELOGCONTEXT QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_DISABLE_DEPRECATED_BEFORE=0x060400)
+endfunction()
+
+# A Qt Test program, registered with ctest under its own name, off screen.
+#   nvldm_test(tst_name LIBS … [SOURCES …] [TIMEOUT s])
+function(nvldm_test name)
+    cmake_parse_arguments(ARG "" "TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    add_executable(${name} ${name}.cpp ${ARG_SOURCES})
+    target_link_libraries(${name} PRIVATE ${ARG_LIBS} Qt6::Test)
+    nvldm_compile_options(${name})
+    nvldm_qt_options(${name})
+    add_test(NAME ${name} COMMAND ${name})
+    if(NOT ARG_TIMEOUT)
+        set(ARG_TIMEOUT 120)
+    endif()
+    set_tests_properties(${name} PROPERTIES
+        TIMEOUT ${ARG_TIMEOUT}
+        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;LC_ALL=C.UTF-8;NVLDM_EMULATOR=$<TARGET_FILE:nvldm-emulator>")
+endfunction()
