@@ -1,0 +1,14 @@
+#pragma once
+
+#include <QString>
+
+/// Folders and files that belong to the user alone (0700 and 0600 where the system knows modes).
+namespace PrivateFiles {
+
+/// Creates the folder with its missing parents. False when it cannot be had.
+bool ensureFolder(const QString &folder);
+
+/// Creates an empty file unless there is one, and its folder. False when it cannot be had.
+bool ensureFile(const QString &path);
+
+} // namespace PrivateFiles

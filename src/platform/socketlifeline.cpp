@@ -1,0 +1,69 @@
+#include "socketlifeline.h"
+
+#include <utility>
+
+#ifdef _WIN32
+#include <winsock2.h>
+#else
+#include <sys/socket.h>
+#include <unistd.h>
+#endif
+
+#ifdef _WIN32
+
+namespace {
+
+long long duplicate(long long socket) {
+    WSAPROTOCOL_INFOW info;
+    if (WSADuplicateSocketW(static_cast<SOCKET>(socket), GetCurrentProcessId(), &info) != 0)
+        return -1;
+    return static_cast<long long>(
+        WSASocketW(FROM_PROTOCOL_INFO, FROM_PROTOCOL_INFO, FROM_PROTOCOL_INFO, &info, 0, 0));
+}
+
+void shutDown(long long socket) {
+    ::shutdown(static_cast<SOCKET>(socket), SD_BOTH);
+}
+void closeHandle(long long socket) {
+    ::closesocket(static_cast<SOCKET>(socket));
+}
+
+} // namespace
+
+#else
+
+namespace {
+
+long long duplicate(long long socket) {
+    return ::dup(static_cast<int>(socket));
+}
+void shutDown(long long socket) {
+    ::shutdown(static_cast<int>(socket), SHUT_RDWR);
+}
+void closeHandle(long long socket) {
+    ::close(static_cast<int>(socket));
+}
+
+} // namespace
+
+#endif
+
+SocketLifeline::SocketLifeline(long long socket) : m_handle(duplicate(socket)) {}
+
+SocketLifeline::~SocketLifeline() {
+    if (m_handle >= 0)
+        closeHandle(m_handle);
+}
+
+SocketLifeline::SocketLifeline(SocketLifeline &&other) noexcept
+    : m_handle(std::exchange(other.m_handle, -1)) {}
+
+SocketLifeline &SocketLifeline::operator=(SocketLifeline &&other) noexcept {
+    std::swap(m_handle, other.m_handle);
+    return *this;
+}
+
+void SocketLifeline::cut() {
+    if (m_handle >= 0)
+        shutDown(m_handle);
+}

@@ -1,0 +1,20 @@
+#pragma once
+
+/// Ends the traffic of a socket from another thread, whatever its owner waits for at that moment.
+///
+/// Holds a handle of its own, so that a number the owner has closed and the system has given out again is
+/// never touched. Not copyable; a default one holds nothing.
+class SocketLifeline {
+public:
+    SocketLifeline() = default;
+    explicit SocketLifeline(long long socket);
+    ~SocketLifeline();
+    SocketLifeline(SocketLifeline &&other) noexcept;
+    SocketLifeline &operator=(SocketLifeline &&other) noexcept;
+
+    /// Shuts the connection down in both directions; a waiting owner returns with an error.
+    void cut();
+
+private:
+    long long m_handle = -1;
+};
