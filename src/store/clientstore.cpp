@@ -1,0 +1,118 @@
+#include "clientstore.h"
+
+#include "apppaths.h"
+#include "ciphers.h"
+#include "nvldmstore.h"
+
+#include <QDebug>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+const QString kIsThisComputer = QStringLiteral("kIsThisComputer");
+const QString kIsLoginRememberMe = QStringLiteral("kIsLoginRememberMe");
+const QString kThisComputerAccountInfo = QStringLiteral("kThisComputerAccountInfo");
+const QString kRemoteComputerAccountInfo = QStringLiteral("kRemoteComputerAccountInfo");
+
+constexpr const char *serverColumns =
+    "id TEXT PRIMARY KEY, svrname TEXT, info TEXT, acc TEXT, pass TEXT, remember TEXT";
+constexpr const char *serverTable = "svrsMainT";
+constexpr const char *scratchTable = "tempSvrsMainT";
+
+std::string text(const JSON &object, const char *name) {
+    const auto member = object.is_object() ? object.find(name) : object.end();
+    return member != object.end() && member->is_string() ? member->get<std::string>() : std::string();
+}
+
+/// The row as it is stored: a password leaves memory as cipher text only, and only if it is wanted again.
+JSON storedRow(const JSON &server) {
+    JSON row;
+    for (const char *name : {"id", "svrname", "info", "acc", "remember"})
+        row[name] = text(server, name);
+    const bool remember = text(server, "remember") == "YES";
+    row["pass"] = remember ? Ciphers::sealSecret(text(server, "pass")).value_or("") : "";
+    return row;
+}
+
+} // namespace
+
+CClientStore &CClientStore::instance() {
+    static CClientStore store;
+    return store;
+}
+
+CClientStore::CClientStore()
+    : m_store(AppPaths::clientStoreFolder() + QStringLiteral("/nvldmgr.sdb"), QStringLiteral("appMainT")),
+      m_serverFile((AppPaths::clientStoreFolder() + QStringLiteral("/ndclisvrs.sdb")).toUtf8()) {
+    nvldmstore::createDBTable(m_serverFile.constData(), serverTable, serverColumns);
+}
+
+bool CClientStore::isThisComputer() const {
+    return m_store.queryFlag(kIsThisComputer);
+}
+
+bool CClientStore::setThisComputer(bool on) {
+    return m_store.replaceFlag(kIsThisComputer, on);
+}
+
+bool CClientStore::isLoginRememberMe() const {
+    return m_store.queryFlag(kIsLoginRememberMe);
+}
+
+bool CClientStore::setLoginRememberMe(bool on) {
+    return m_store.replaceFlag(kIsLoginRememberMe, on);
+}
+
+AccountInfo CClientStore::thisComputerAccount() const {
+    return account(kThisComputerAccountInfo);
+}
+
+bool CClientStore::setThisComputerAccount(const AccountInfo &info) {
+    return setAccount(kThisComputerAccountInfo, info);
+}
+
+AccountInfo CClientStore::remoteComputerAccount() const {
+    return account(kRemoteComputerAccountInfo);
+}
+
+bool CClientStore::setRemoteComputerAccount(const AccountInfo &info) {
+    return setAccount(kRemoteComputerAccountInfo, info);
+}
+
+AccountInfo CClientStore::account(const QString &key) const {
+    const JSON object = JSON::parse(m_store.query(key).toStdString(), nullptr, false);
+    return {QString::fromStdString(text(object, "server")), QString::fromStdString(text(object, "email")),
+            QString::fromStdString(Ciphers::openSecret(text(object, "pass")).value_or(""))};
+}
+
+bool CClientStore::setAccount(const QString &key, const AccountInfo &account) {
+    const JSON object = {{"server", account.server.toStdString()},
+                         {"email", account.email.toStdString()},
+                         {"pass", Ciphers::sealSecret(account.password.toStdString()).value_or("")}};
+    return m_store.replace(key, QString::fromStdString(dumpJson(object)));
+}
+
+unsigned CClientStore::loadServerList(JSON &servers) const {
+    servers = JSON::array();
+    std::string rows;
+    if (nvldmstore::queryData(m_serverFile.constData(), serverTable, "", rows) != 0)
+        return serverListUnreadable;
+    servers = JSON::parse(rows, nullptr, false);
+    if (!servers.is_array()) {
+        servers = JSON::array();
+        return serverListUnreadable;
+    }
+    for (JSON &server : servers)
+        server["pass"] = Ciphers::openSecret(text(server, "pass")).value_or("");
+    return 0;
+}
+
+bool CClientStore::saveServerList(const JSON &servers) {
+    JSON rows = JSON::array();
+    for (const JSON &server : servers)
+        rows.push_back(storedRow(server));
+    return nvldmstore::createDBTable(m_serverFile.constData(), scratchTable, serverColumns) == 0 &&
+           nvldmstore::insertListData(m_serverFile.constData(), scratchTable, dumpJson(rows).c_str()) == 0 &&
+           nvldmstore::replaceTable(m_serverFile.constData(), scratchTable, serverTable) == 0;
+}

@@ -1,0 +1,85 @@
+#include "localstore.h"
+
+#include "apppaths.h"
+#include "ciphers.h"
+#include "messagelog.h"
+
+#include <QDebug>
+
+namespace {
+const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
+
+QByteArray cipherOf(const QByteArray &rawToken) {
+    qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
+    const auto cipher =
+        Ciphers::sealSecret({rawToken.constData(), static_cast<std::size_t>(rawToken.size())});
+    const QByteArray token = QByteArray::fromStdString(cipher.value_or(""));
+    qDebug("CLocalStore::setAccess > szCipherToken: %s", MessageLog::secret(token).constData());
+    return token;
+}
+} // namespace
+
+CLocalStore &CLocalStore::instance() {
+    static CLocalStore store;
+    return store;
+}
+
+CLocalStore::CLocalStore()
+    : m_store(AppPaths::clientStoreFolder() + QStringLiteral("/nvldmuio.sdb"), QStringLiteral("appMainT")) {}
+
+bool CLocalStore::isLocalServiceInstalled() const {
+    const std::lock_guard lock(m_mutex);
+    return m_localServiceInstalled;
+}
+
+void CLocalStore::setLocalServiceInstalled(bool installed) {
+    const std::lock_guard lock(m_mutex);
+    m_localServiceInstalled = installed;
+}
+
+void CLocalStore::setLoginInfo(const QString &address, quint32 port, const QString &account,
+                               const QByteArray &token) {
+    qDebug("CLocalStore::setLoginInfo > strToken: %s", MessageLog::secret(token).constData());
+    const std::lock_guard lock(m_mutex);
+    m_login = {address, port, account, token, m_login.generation + 1};
+    m_access = token;
+}
+
+LoginInfo CLocalStore::loginInfo() const {
+    const std::lock_guard lock(m_mutex);
+    return m_login;
+}
+
+void CLocalStore::clearLoginInfo() {
+    const std::lock_guard lock(m_mutex);
+    m_login = {{}, 0, {}, {}, m_login.generation + 1};
+    m_access.clear();
+}
+
+void CLocalStore::setAccess(const QByteArray &rawToken) {
+    const QByteArray token = cipherOf(rawToken);
+    const std::lock_guard lock(m_mutex);
+    m_access = token;
+}
+
+void CLocalStore::renewAccess(const QByteArray &rawToken, quint64 generation) {
+    const QByteArray token = cipherOf(rawToken);
+    const std::lock_guard lock(m_mutex);
+    if (m_login.generation != generation || token.isEmpty())
+        return;
+    m_access = token;
+    m_login.token = token;
+}
+
+QByteArray CLocalStore::access() const {
+    const std::lock_guard lock(m_mutex);
+    return m_access;
+}
+
+QString CLocalStore::defaultFilePath() const {
+    return m_store.query(kDefaultFilePath);
+}
+
+bool CLocalStore::setDefaultFilePath(const QString &folder) {
+    return m_store.replace(kDefaultFilePath, folder);
+}

@@ -1,0 +1,52 @@
+#pragma once
+
+#include "basestore.h"
+
+#include <QByteArray>
+
+#include <mutex>
+
+/// A session with a service as every request needs it.
+struct LoginInfo {
+    QString address;
+    quint32 port = 0;
+    QString account;
+    QByteArray token;       ///< the access token in cipher form
+    quint64 generation = 0; ///< raised by every log-in and log-off; tells an old session from the present one
+
+    /// True when there is all that a request needs.
+    bool isComplete() const { return !address.isEmpty() && !account.isEmpty() && !token.isEmpty(); }
+};
+
+/// The client's user-interface options, and the present session (in memory only). Any thread.
+class CLocalStore {
+public:
+    static CLocalStore &instance();
+
+    bool isLocalServiceInstalled() const;
+    void setLocalServiceInstalled(bool installed);
+
+    /// Begins a session; the token is in cipher form, as access() gives it.
+    void setLoginInfo(const QString &address, quint32 port, const QString &account, const QByteArray &token);
+    LoginInfo loginInfo() const;
+    /// Ends the session; answers that are still on their way belong to nobody from now on.
+    void clearLoginInfo();
+
+    /// Ciphers a raw token and keeps it as the present one.
+    void setAccess(const QByteArray &rawToken);
+    /// The same for a token that the service renewed, unless its session was ended meanwhile.
+    void renewAccess(const QByteArray &rawToken, quint64 generation);
+    QByteArray access() const;
+
+    QString defaultFilePath() const;
+    bool setDefaultFilePath(const QString &folder);
+
+private:
+    CLocalStore();
+
+    CBaseStore m_store;
+    mutable std::mutex m_mutex;
+    bool m_localServiceInstalled = false;
+    LoginInfo m_login;
+    QByteArray m_access;
+};
