@@ -1,0 +1,146 @@
+#include "apiclient.h"
+
+#include "ciphers.h"
+#include "httpexchange.h"
+#include "messagelog.h"
+
+#include <QDebug>
+
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+#include <iostream>
+#include <stdexcept>
+
+namespace {
+
+constexpr std::size_t shortestToken = 16;
+constexpr std::size_t longestToken = 256;
+
+const char *textOrEmpty(const char *text) {
+    return text ? text : "";
+}
+
+/// Header values come percent-decoded, so anything may stand in one; a token is base64url.
+bool isToken(const std::string &text) {
+    const auto isTokenCharacter = [](unsigned char c) { return std::isalnum(c) || c == '-' || c == '_'; };
+    return text.size() >= shortestToken && text.size() <= longestToken &&
+           std::all_of(text.begin(), text.end(), isTokenCharacter);
+}
+
+unsigned judgeUsualCode(int code) {
+    switch (code) {
+    case 0:
+        return ApiOk;
+    case 105:
+        return ApiCode105;
+    case 108:
+        return ApiCode108;
+    default:
+        return ApiServerError;
+    }
+}
+
+JSON decipher(const JSON &data) {
+    const std::optional<std::string> plain = Ciphers::openData(data.get_ref<const std::string &>());
+    if (!plain)
+        throw std::runtime_error("data cannot be deciphered");
+    return parseJson(*plain);
+}
+
+} // namespace
+
+CApiClient::CApiClient(const char *szHost, std::uint32_t uPort)
+    : m_strHost(textOrEmpty(szHost)), m_uPort(uPort) {}
+
+CApiClient::~CApiClient() = default;
+
+bool CApiClient::setAccessToken(const char *szToken) {
+    qDebug("CApiClient::setAccessToken > szToken: %s", MessageLog::secret(QByteArray(szToken)).constData());
+    if (!szToken)
+        return false;
+    const std::optional<std::string> token = Ciphers::openSecret(szToken);
+    qDebug("CApiClient::setAccessToken > szRawToken: %s", MessageLog::secret(token.value_or("")).constData());
+    if (!token) {
+        qDebug("CApiClient::setAccessToken > fail to create szRawToken");
+        return false;
+    }
+    m_strAccess = *token;
+    qDebug("CApiClient::setAccessToken end");
+    return true;
+}
+
+bool CApiClient::setAccount(const char *szAccount) {
+    if (!szAccount)
+        return false;
+    m_strAccount = szAccount;
+    return true;
+}
+
+bool CApiClient::hasSession() const {
+    return !m_strAccess.empty() && !m_strAccount.empty();
+}
+
+unsigned CApiClient::postAsAccount(const Call &call, JSON body, JSON *output) {
+    if (!hasSession())
+        return ApiInvalidArgument;
+    body["id"] = m_strAccount;
+    return post(call, body, output);
+}
+
+unsigned CApiClient::post(const Call &call, const JSON &body, JSON *output) {
+    try {
+        HttpRequest request;
+        request.host = m_strHost;
+        request.port = m_uPort;
+        request.verb = "POST";
+        request.path = call.path;
+        // The service wants this type although the body is JSON.
+        request.contentType = "application/x-www-form-urlencoded";
+        request.authorization = call.genericToken ? Ciphers::genericToken().value_or("") : m_strAccess;
+        request.body = dumpJson(body);
+        request.totalTimeout = m_totalTimeout;
+        qDebug("CApiClient::%s > Set authorization to %s", call.method,
+               MessageLog::secret(request.authorization).constData());
+        const HttpAnswer answer = exchangeHttp(request);
+        if (!answer.arrived) {
+            std::cout << "HTTP error: " << answer.error << std::endl;
+            if (call.logTransportError)
+                call.logTransportError(call, answer.error);
+            return ApiTransportError;
+        }
+        return judge(call, answer, output);
+    } catch (const std::exception &error) {
+        std::cout << "API Client Error: " << error.what() << std::endl;
+    } catch (...) {
+        std::cout << "API Client Error: Unknown exception" << std::endl;
+    }
+    return ApiException;
+}
+
+unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, JSON *output) {
+    if (answer.status != 200)
+        return ApiHttpStatusError;
+    const JSON body = parseJson(answer.body);
+    const unsigned result = (call.judgeCode ? call.judgeCode : judgeUsualCode)(body.at("code").get<int>());
+    if (result != ApiOk)
+        return result;
+    if (!answer.authorization.empty())
+        renewToken(call, answer.authorization);
+    if (call.payload == Payload::None || !output)
+        return ApiOk;
+    const auto data = body.find("data");
+    if (data == body.end())
+        return ApiMissingData;
+    *output = call.payload == Payload::Ciphered ? decipher(*data) : *data;
+    return ApiOk;
+}
+
+void CApiClient::renewToken(const Call &call, const std::string &token) {
+    if (!isToken(token)) {
+        qWarning("CApiClient::%s > the renewed token is malformed and was not taken", call.method);
+        return;
+    }
+    m_strAccess = token;
+    qDebug("CApiClient::%s > m_strAccess: %s", call.method, MessageLog::secret(m_strAccess).constData());
+}

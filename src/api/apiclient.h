@@ -1,0 +1,117 @@
+#pragma once
+
+#include "apiresult.h"
+#include "json.h"
+
+#include <chrono>
+#include <cstdint>
+#include <string>
+
+struct HttpAnswer;
+
+/// One request to the device manager service.
+///
+/// A short-lived object: construct it with the service's address, set account and token, call one method,
+/// look at its result, destroy it. Every method opens its own HTTPS connection, blocks for at most a minute,
+/// and returns an ApiResult; no exception leaves it. Used by one thread for one call.
+///
+/// Unless a method says otherwise it needs a token and an account (ApiInvalidArgument without them, nothing
+/// sent), and outputs are filled only with ApiOk.
+class CApiClient {
+public:
+    /// host: IPv4 address or host name; null counts as empty.
+    CApiClient(const char *szHost, std::uint32_t uPort);
+    virtual ~CApiClient();
+    CApiClient(const CApiClient &) = delete;
+    CApiClient &operator=(const CApiClient &) = delete;
+
+    /// Takes the token as the local store keeps it, in cipher form. False for null and for what does not
+    /// decipher.
+    bool setAccessToken(const char *szToken);
+    /// False for null.
+    bool setAccount(const char *szAccount);
+    /// The time that a call may take altogether, in place of a minute.
+    void setTotalTimeout(std::chrono::milliseconds timeout) { m_totalTimeout = timeout; }
+    /// The raw token: as set, or as the service renewed it in the last call.
+    const std::string &accessToken() const { return m_strAccess; }
+
+    // Session and server
+
+    /// Liveness probe: needs neither token nor account, waits two seconds at most for a connection and for an
+    /// answer. uOnline: 1 when the service answered with status 200, else 0.
+    virtual unsigned isServerOnline(std::uint32_t &uOnline);
+    /// Opens a session and hands its token to CLocalStore::setAccess. Needs no token.
+    virtual unsigned loginServer(const char *szAccount, const char *szPassword);
+    /// szSession: any text; only its presence is looked at.
+    virtual unsigned logoutServer(const char *szSession);
+
+    // Sites
+
+    /// szParent: null or empty for a top-level site. strSiteId: the new site's id.
+    virtual unsigned addSite(const char *szName, const char *szParent, std::string &strSiteId);
+    virtual unsigned updateSite(const char *szSiteId, const char *szName, const char *szParent);
+    virtual unsigned removeSite(const char *szSiteId);
+    /// A page of site records; nStart counts from 0.
+    virtual unsigned listSites(int nStart, int nCount, JSON &sites);
+    /// szStage: "all", "start", "update" or "end".
+    virtual unsigned commitSites(const JSON &sites, const char *szStage);
+
+    // Devices
+
+    /// A page of device records; nStart counts from 0.
+    virtual unsigned listDevices(int nStart, int nCount, JSON &devices);
+    /// devices: array of records. szStage: "all", "start", "update" or "end".
+    virtual unsigned commitDevices(const JSON &devices, const char *szStage);
+    /// The three discoveries start a scan of nTimeout seconds on the service and return at once.
+    virtual unsigned deviceDiscovery(int nTimeout);
+    virtual unsigned deviceDiscoverByIP(const char *szIp, int nTimeout);
+    virtual unsigned deviceDiscoverByIPs(const char *szFirst, const char *szLast, int nTimeout);
+    /// What the last scan has found so far.
+    virtual unsigned discoveredDevices(JSON &devices);
+    virtual unsigned setPassPolicy(const JSON &devices, const char *szType, int nMinLength,
+                                   const char *szTaskId);
+    virtual unsigned authDevices(const JSON &devices, const char *szAccount, const char *szPassword);
+    /// A page of status records; nStart counts from 0.
+    virtual unsigned listDeviceStatus(int nStart, int nCount, JSON &statuses);
+
+    // Service settings
+
+    virtual unsigned loadServerSettings(JSON &settings);
+    /// Sends those members of the object that are settings of the service, nothing else.
+    virtual unsigned saveServerSettings(const JSON &settings);
+
+protected:
+    enum class Payload { None, Plain, Ciphered };
+
+    /// What tells one request from another; the rest of the road is the same for all.
+    struct Call {
+        const char *method; ///< as it stands in the log lines
+        const char *path;
+        Payload payload = Payload::None;
+        bool genericToken = false; ///< a fresh token of its own in place of the session's
+        void (*logTransportError)(const Call &call, const std::string &error) = nullptr;
+        unsigned (*judgeCode)(int code) = nullptr; ///< in place of the usual judging of "code"
+    };
+
+    /// Sends body to the call's path by POST and judges the answer. output: set where the call has a payload.
+    unsigned post(const Call &call, const JSON &body, JSON *output = nullptr);
+    /// The same for an authenticated method: checks the preconditions and adds "id" to the body.
+    unsigned postAsAccount(const Call &call, JSON body, JSON *output = nullptr);
+
+    /// True when there is what every authenticated method needs.
+    bool hasSession() const;
+
+    /// An argument that has to be there.
+    static bool isEmpty(const char *szText) { return !szText || !*szText; }
+
+private:
+    unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
+    void renewToken(const Call &call, const std::string &token);
+
+    std::string m_strHost;
+    std::uint32_t m_uPort;
+    std::string m_strAccess;
+    std::string m_strPassCipher;
+    std::string m_strAccount;
+    std::chrono::milliseconds m_totalTimeout{60000};
+};

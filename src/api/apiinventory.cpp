@@ -1,0 +1,121 @@
+// Sites, devices, discovery and device states.
+
+#include "apiclient.h"
+
+#include "ciphers.h"
+
+#include <nlohmann/json.hpp>
+
+#include <string_view>
+
+namespace {
+
+constexpr const char *siteRoot = "SR000000000000";
+
+bool isStage(const char *szStage) {
+    const std::string_view stage = szStage ? szStage : "";
+    return stage == "all" || stage == "start" || stage == "update" || stage == "end";
+}
+
+JSON page(int nStart, int nCount) {
+    return {{"start", nStart}, {"count", nCount}};
+}
+
+const char *orRoot(const char *szParent) {
+    return szParent && *szParent ? szParent : siteRoot;
+}
+
+} // namespace
+
+unsigned CApiClient::addSite(const char *szName, const char *szParent, std::string &strSiteId) {
+    if (isEmpty(szName))
+        return ApiInvalidArgument;
+    JSON data;
+    const unsigned result = postAsAccount({"addSite", "/v1/site/new", Payload::Ciphered},
+                                          {{"sitename", szName}, {"parentid", orRoot(szParent)}}, &data);
+    if (result != ApiOk)
+        return result;
+    const auto id = data.is_object() ? data.find("siteid") : data.end();
+    if (id == data.end() || !id->is_string())
+        return ApiMissingData;
+    strSiteId = id->get<std::string>();
+    return ApiOk;
+}
+
+unsigned CApiClient::updateSite(const char *szSiteId, const char *szName, const char *szParent) {
+    if (isEmpty(szSiteId) || isEmpty(szName))
+        return ApiInvalidArgument;
+    return postAsAccount({"updateSite", "/v1/site/update"},
+                         {{"siteid", szSiteId}, {"sitename", szName}, {"parentid", orRoot(szParent)}});
+}
+
+unsigned CApiClient::removeSite(const char *szSiteId) {
+    if (isEmpty(szSiteId))
+        return ApiInvalidArgument;
+    return postAsAccount({"removeSite", "/v1/site/rms"}, {{"siteid", szSiteId}});
+}
+
+unsigned CApiClient::listSites(int nStart, int nCount, JSON &sites) {
+    return postAsAccount({"listSites", "/v1/site/list", Payload::Ciphered}, page(nStart, nCount), &sites);
+}
+
+unsigned CApiClient::commitSites(const JSON &sites, const char *szStage) {
+    if (!isStage(szStage) || !sites.is_array())
+        return ApiInvalidArgument;
+    return postAsAccount({"commitSites", "/v1/site/commit"}, {{"state", szStage}, {"sites", sites}});
+}
+
+unsigned CApiClient::listDevices(int nStart, int nCount, JSON &devices) {
+    return postAsAccount({"listDevices", "/v1/dev/list", Payload::Ciphered}, page(nStart, nCount), &devices);
+}
+
+unsigned CApiClient::commitDevices(const JSON &devices, const char *szStage) {
+    if (!isStage(szStage) || !devices.is_array())
+        return ApiInvalidArgument;
+    return postAsAccount({"commitDevices", "/v1/dev/commit"}, {{"state", szStage}, {"devices", devices}});
+}
+
+unsigned CApiClient::deviceDiscovery(int nTimeout) {
+    return postAsAccount({"deviceDiscovery", "/v1/dev/scan"}, {{"timeout", nTimeout}});
+}
+
+unsigned CApiClient::deviceDiscoverByIP(const char *szIp, int nTimeout) {
+    if (isEmpty(szIp))
+        return ApiInvalidArgument;
+    return postAsAccount({"deviceDiscoverByIP", "/v1/dev/scanip"}, {{"ip", szIp}, {"timeout", nTimeout}});
+}
+
+unsigned CApiClient::deviceDiscoverByIPs(const char *szFirst, const char *szLast, int nTimeout) {
+    if (isEmpty(szFirst) || isEmpty(szLast))
+        return ApiInvalidArgument;
+    return postAsAccount({"deviceDicoverByIPs", "/v1/dev/scanips"},
+                         {{"ip_start", szFirst}, {"ip_end", szLast}, {"timeout", nTimeout}});
+}
+
+unsigned CApiClient::discoveredDevices(JSON &devices) {
+    return postAsAccount({"discoveredDevices", "/v1/dev/scanout", Payload::Ciphered}, JSON::object(),
+                         &devices);
+}
+
+unsigned CApiClient::setPassPolicy(const JSON &devices, const char *szType, int nMinLength,
+                                   const char *szTaskId) {
+    if (!devices.is_array() || isEmpty(szType) || isEmpty(szTaskId))
+        return ApiInvalidArgument;
+    return postAsAccount({"setPassPolicy", "/v1/dev/setpolicy"},
+                         {{"devices", devices}, {"plen", nMinLength}, {"type", szType}, {"tid", szTaskId}});
+}
+
+unsigned CApiClient::authDevices(const JSON &devices, const char *szAccount, const char *szPassword) {
+    if (!hasSession() || !devices.is_array() || isEmpty(szAccount) || !szPassword)
+        return ApiInvalidArgument;
+    const std::optional<std::string> cipher = Ciphers::sealSecret(szPassword);
+    if (!cipher)
+        return ApiCipherFailure;
+    return postAsAccount({"authDevices", "/v1/dev/auth"},
+                         {{"devices", devices}, {"acc", szAccount}, {"pass", *cipher}});
+}
+
+unsigned CApiClient::listDeviceStatus(int nStart, int nCount, JSON &statuses) {
+    return postAsAccount({"listDeviceStatus", "/v1/dstatus/list", Payload::Ciphered}, page(nStart, nCount),
+                         &statuses);
+}

@@ -1,0 +1,82 @@
+#include "nettask.h"
+
+#include <QDeadlineTimer>
+#include <QDebug>
+#include <QMutex>
+
+#include <algorithm>
+#include <vector>
+
+namespace {
+
+constexpr int turnWaitMs = 30000;
+/// The transport matches status lines with a recursive expression; a long line needs a deep stack.
+constexpr uint stackBytes = 64u << 20;
+
+QMutex turnMutex;
+
+/// Every runner that exists; touched in the user-interface thread only.
+std::vector<NetTask *> &runners() {
+    static std::vector<NetTask *> all;
+    return all;
+}
+
+} // namespace
+
+void NetTask::LetGo::operator()(NetTask *runner) const {
+    if (!runner->isRunning()) {
+        delete runner;
+        return;
+    }
+    QObject::connect(runner, &QThread::finished, runner, &QObject::deleteLater);
+}
+
+NetTask::NetTask(QObject *parent) : QThread(parent) {
+    setStackSize(stackBytes);
+    runners().push_back(this);
+}
+
+NetTask::~NetTask() {
+    // Deleting a running thread would end the program, and terminating it would keep the turn for ever.
+    wait();
+    std::erase(runners(), this);
+}
+
+void NetTask::setUp(quintptr context, Job job, Preparation preparation) {
+    m_context = context;
+    m_job = std::move(job);
+    m_preparation = std::move(preparation);
+}
+
+void NetTask::run() {
+    try {
+        if (m_preparation)
+            m_preparation();
+        runJob();
+    } catch (const std::exception &error) {
+        qWarning("Encountered unexpected error in NetTask: %s", error.what());
+    } catch (...) {
+        qWarning("Encountered unexpected error in NetTask: Unknown exception");
+    }
+}
+
+void NetTask::runJob() {
+    if (!turnMutex.tryLock(turnWaitMs))
+        return;
+    const std::unique_lock lock(turnMutex, std::adopt_lock);
+    if (m_job)
+        m_job(m_context);
+}
+
+bool NetTask::waitForAll(int milliseconds) {
+    const QDeadlineTimer deadline(milliseconds);
+    const std::vector<NetTask *> all = runners();
+    return std::all_of(all.begin(), all.end(), [&](NetTask *runner) { return runner->wait(deadline); });
+}
+
+void NetTask::runAndWait(const std::function<void()> &function) {
+    const std::unique_ptr<QThread> thread(QThread::create(function));
+    thread->setStackSize(stackBytes);
+    thread->start();
+    thread->wait();
+}

@@ -1,0 +1,116 @@
+#include "requestdeadline.h"
+
+#include "socketlifeline.h"
+
+#include <algorithm>
+#include <condition_variable>
+#include <map>
+#include <mutex>
+#include <thread>
+
+namespace {
+
+using Clock = std::chrono::steady_clock;
+
+struct Watched {
+    Clock::time_point end;
+    SocketLifeline connection;
+    bool over = false;
+};
+
+/// The one watchdog thread. It is never joined with: the object lives until the process ends.
+class Watchdog {
+public:
+    static Watchdog &instance() {
+        static auto *const watchdog = new Watchdog;
+        return *watchdog;
+    }
+
+    std::uint64_t add(Clock::time_point end) {
+        const std::lock_guard lock(m_mutex);
+        m_watched.emplace(++m_lastId, Watched{m_cutAll ? Clock::now() : end, {}, m_cutAll});
+        m_changed.notify_one();
+        return m_lastId;
+    }
+
+    void remove(std::uint64_t id) {
+        const std::lock_guard lock(m_mutex);
+        m_watched.erase(id);
+    }
+
+    void connect(std::uint64_t id, SocketLifeline connection) {
+        const std::lock_guard lock(m_mutex);
+        Watched &watched = m_watched.at(id);
+        watched.connection = std::move(connection);
+        if (watched.over)
+            watched.connection.cut();
+    }
+
+    bool isOver(std::uint64_t id) {
+        const std::lock_guard lock(m_mutex);
+        return m_watched.at(id).over;
+    }
+
+    void cutAll() {
+        const std::lock_guard lock(m_mutex);
+        m_cutAll = true;
+        for (auto &[id, watched] : m_watched)
+            cut(watched);
+    }
+
+private:
+    Watchdog() {
+        std::thread([this] { watch(); }).detach();
+    }
+
+    static void cut(Watched &watched) {
+        watched.over = true;
+        watched.connection.cut();
+    }
+
+    void watch() {
+        std::unique_lock lock(m_mutex);
+        while (true) {
+            Clock::time_point next = Clock::time_point::max();
+            for (auto &[id, watched] : m_watched) {
+                if (watched.over)
+                    continue;
+                if (watched.end <= Clock::now())
+                    cut(watched);
+                else
+                    next = std::min(next, watched.end);
+            }
+            if (next == Clock::time_point::max())
+                m_changed.wait(lock);
+            else
+                m_changed.wait_until(lock, next);
+        }
+    }
+
+    std::mutex m_mutex;
+    std::condition_variable m_changed;
+    std::map<std::uint64_t, Watched> m_watched;
+    std::uint64_t m_lastId = 0;
+    bool m_cutAll = false;
+};
+
+} // namespace
+
+RequestDeadline::RequestDeadline(std::chrono::milliseconds total)
+    : m_id(Watchdog::instance().add(Clock::now() + total)) {}
+
+RequestDeadline::~RequestDeadline() {
+    Watchdog::instance().remove(m_id);
+}
+
+void RequestDeadline::watch(long long socket) {
+    Watchdog::instance().connect(m_id, SocketLifeline(socket));
+}
+
+bool RequestDeadline::isOver() const {
+    return Watchdog::instance().isOver(m_id);
+}
+
+void RequestDeadline::cutAll() {
+    Watchdog::instance().cutAll();
+}

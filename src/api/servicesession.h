@@ -1,0 +1,29 @@
+#pragma once
+
+#include "apiclient.h"
+#include "localstore.h"
+
+#include <functional>
+
+/// The stored session as a job uses it: every call goes out on a fresh client, carries the latest token, and
+/// leaves a renewed one in the local store. Used by one thread at a time.
+class ServiceSession {
+public:
+    explicit ServiceSession(LoginInfo login);
+
+    /// Makes one call and returns its result. Nothing is sent, and ApiInvalidArgument returned, when the
+    /// session was ended meanwhile.
+    unsigned call(const std::function<unsigned(CApiClient &)> &endpoint);
+
+    /// True when the service has told that it does not know the session any more.
+    bool isLost() const { return m_lost; }
+
+    /// True while the stored session is still the one that this object began with.
+    bool isPresent() const;
+
+    const LoginInfo &login() const { return m_login; }
+
+private:
+    LoginInfo m_login;
+    bool m_lost = false;
+};
