@@ -1,0 +1,22 @@
+#pragma once
+
+#include <QTableWidget>
+
+/// The common look of the console's tables: whole rows selected, fixed row heights, a hovered row, no grid.
+class CustomTable : public QTableWidget {
+    Q_OBJECT
+
+public:
+    explicit CustomTable(QWidget *parent = nullptr);
+
+    /// The row under the pointer, or -1.
+    int hoveredRow() const { return m_hoveredRow; }
+
+protected:
+    bool viewportEvent(QEvent *event) override;
+
+private:
+    void setHoveredRow(int row);
+
+    int m_hoveredRow = -1;
+};

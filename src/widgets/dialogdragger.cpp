@@ -1,0 +1,7 @@
+#include "dialogdragger.h"
+
+#include <QMouseEvent>
+
+void DialogDragger::mouseDoubleClickEvent(QMouseEvent *event) {
+    event->accept();
+}

@@ -1,0 +1,38 @@
+#pragma once
+
+#include <QDialog>
+
+class QLabel;
+class QToolButton;
+class QVBoxLayout;
+
+/// A dialog in the program's own frame: title area with a close cross, below it the content of a form.
+///
+/// Its parts carry the object names "dialogWindow", "dialogFrame", "dialogDragger", "dialogTitleLabel" and
+/// "dialogCloseButton".
+class FramelessDialog : public QDialog {
+    Q_OBJECT
+
+public:
+    explicit FramelessDialog(QWidget *parent = nullptr);
+
+    /// The widget that a form's setupUi fills.
+    QWidget *content() const { return m_content; }
+
+    /// Takes the close cross away where the dialog must be answered.
+    void setClosable(bool closable);
+
+    /// Puts the dialog over the middle of its parent's window.
+    void centreOverParent();
+
+protected:
+    void showEvent(QShowEvent *event) override;
+    void keyPressEvent(QKeyEvent *event) override;
+    void changeEvent(QEvent *event) override;
+
+private:
+    QLabel *m_title;
+    QToolButton *m_close;
+    QWidget *m_content;
+    bool m_closable = true;
+};

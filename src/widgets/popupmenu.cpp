@@ -1,0 +1,6 @@
+#include "popupmenu.h"
+
+PopupMenu::PopupMenu(QWidget *parent) : QMenu(parent) {
+    setWindowFlag(Qt::NoDropShadowWindowHint);
+    setToolTipsVisible(true);
+}

@@ -1,0 +1,86 @@
+#include "theme.h"
+
+#include <QFile>
+#include <QFontDatabase>
+#include <QGuiApplication>
+
+#include <utility>
+
+namespace Theme {
+
+namespace {
+
+QString cssColour(const QColor &colour) {
+    return QStringLiteral("rgba(%1, %2, %3, %4)")
+        .arg(colour.red())
+        .arg(colour.green())
+        .arg(colour.blue())
+        .arg(colour.alphaF(), 0, 'f', 3);
+}
+
+QString readSheet(const char *name) {
+    QFile file(QStringLiteral(":/styles/%1.qss").arg(QLatin1String(name)));
+    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
+}
+
+QString withColours(QString sheet) {
+    const std::pair<const char *, QColor> colours[] = {{"background", background},
+                                                       {"raised", raised},
+                                                       {"hover", hover},
+                                                       {"line", line},
+                                                       {"text", text},
+                                                       {"textDim", textDim},
+                                                       {"textQuiet", textQuiet},
+                                                       {"textOff", textOff},
+                                                       {"accent", accent},
+                                                       {"accentHover", accent.lighter(115)},
+                                                       {"accentPressed", accent.darker(120)},
+                                                       {"warning", warning},
+                                                       {"error", error}};
+    for (const auto &[name, colour] : colours)
+        sheet.replace(QLatin1Char('@') + QLatin1String(name) + QLatin1Char('@'), cssColour(colour));
+    return sheet;
+}
+
+} // namespace
+
+QString fontFamily() {
+    return QStringLiteral("Segoe UI Variable Static Small");
+}
+
+void installFonts() {
+    QFontDatabase::addApplicationFont(QStringLiteral(":/fonts/Segoe-UI-Variable-Static-Small.ttf"));
+    QFontDatabase::addApplicationFont(QStringLiteral(":/fonts/Segoe-UI-Variable-Static-Small-Semibold.ttf"));
+    QFontDatabase::addApplicationFont(QStringLiteral(":/fonts/Segoe-UI-Symbol.ttf"));
+    QFont::insertSubstitutions(fontFamily(), {QStringLiteral("Inter"), QStringLiteral("Segoe UI")});
+    // Letters come from the text family; the symbol family only fills in what that has not.
+    QFont::insertSubstitutions(QStringLiteral("Segoe UI Symbol"),
+                               {QStringLiteral("Inter"), QStringLiteral("Symbola")});
+    QFont font(fontFamily());
+    font.setPixelSize(13);
+    QGuiApplication::setFont(font);
+}
+
+QPalette palette() {
+    QPalette palette(raised, background);
+    palette.setColor(QPalette::Base, background);
+    palette.setColor(QPalette::AlternateBase, raised);
+    palette.setColor(QPalette::Highlight, accent);
+    for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText,
+                            QPalette::HighlightedText, QPalette::ToolTipText})
+        palette.setColor(role, text);
+    for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
+        palette.setColor(QPalette::Disabled, role, textOff);
+    palette.setColor(QPalette::PlaceholderText, textQuiet);
+    palette.setColor(QPalette::ToolTipBase, raised);
+    return palette;
+}
+
+QString styleSheet() {
+    QString sheet;
+    for (const char *name : {"combobox", "checkbox", "spinbox", "radiobutton", "base"})
+        sheet += readSheet(name);
+    return withColours(sheet);
+}
+
+} // namespace Theme

@@ -1,0 +1,25 @@
+#pragma once
+
+#include <QPixmap>
+#include <QTimer>
+#include <QWidget>
+
+/// A turning ring that says that work is under way; it turns only while it is visible.
+class WaitingSpinner : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit WaitingSpinner(QWidget *parent = nullptr);
+
+    QSize sizeHint() const override;
+
+protected:
+    void paintEvent(QPaintEvent *event) override;
+    void showEvent(QShowEvent *event) override;
+    void hideEvent(QHideEvent *event) override;
+
+private:
+    QTimer m_turn;
+    int m_angle = 0;
+    QPixmap m_ring;
+};
