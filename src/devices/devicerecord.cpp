@@ -1,0 +1,255 @@
+#include "devicerecord.h"
+
+#include <QCoreApplication>
+
+#include <nlohmann/json.hpp>
+
+#include <optional>
+
+namespace DeviceRecords {
+
+namespace {
+
+constexpr const char *context = "DeviceRecords";
+const QString unknownText = QStringLiteral("--");
+
+const JSON *member(const JSON &record, const char *name) {
+    const auto found = record.find(name);
+    return found != record.end() && !found->is_null() ? &*found : nullptr;
+}
+
+QString rawText(const JSON &record, const char *name) {
+    const JSON *value = member(record, name);
+    return value && value->is_string() ? QString::fromStdString(value->get_ref<const std::string &>())
+                                       : QString();
+}
+
+std::optional<qint64> wholeNumber(const JSON &record, const char *name) {
+    const JSON *value = member(record, name);
+    if (!value)
+        return std::nullopt;
+    if (value->is_number_integer())
+        return value->get<qint64>();
+    bool ok = false;
+    const qint64 number =
+        value->is_string() ? QString::fromStdString(value->get<std::string>()).toLongLong(&ok) : 0;
+    return ok ? std::optional(number) : std::nullopt;
+}
+
+std::optional<bool> flag(const JSON &record, const char *name) {
+    const JSON *value = member(record, name);
+    if (value && value->is_boolean())
+        return value->get<bool>();
+    const std::optional<qint64> number = wholeNumber(record, name);
+    return number && (*number == 0 || *number == 1) ? std::optional(*number == 1) : std::nullopt;
+}
+
+QString orUnknown(const QString &text) {
+    return text.isEmpty() ? unknownText : text;
+}
+
+/// The first letters without case, as one number; what they leave open the texts decide.
+quint64 letterKey(const QString &text) {
+    if (text == unknownText)
+        return DeviceRecord::unknownKey;
+    quint64 key = 0;
+    for (int i = 0; i < 4; ++i)
+        key = key << 16 | (i < text.size() ? text[i].toCaseFolded().unicode() : 0u);
+    return key;
+}
+
+/// "2.4.10" as one number, sixteen bits a part.
+quint64 versionKey(const QString &text) {
+    quint64 key = 0;
+    qsizetype at = 0;
+    for (int part = 0; part < 4; ++part) {
+        quint64 number = 0;
+        const qsizetype begin = at;
+        for (; at < text.size() && text[at].isDigit() && number < 0xFFFF; ++at)
+            number = number * 10 + static_cast<quint64>(text[at].digitValue());
+        if (part == 0 && at == begin)
+            return letterKey(text);
+        key = key << 16 | std::min<quint64>(number, 0xFFFF);
+        if (at < text.size())
+            ++at;
+    }
+    return key;
+}
+
+/// All digits of a text as one decimal number: orders "yyyy/MM/dd hh:mm:ss" by time.
+quint64 digitsKey(const QString &text) {
+    quint64 key = 0;
+    int digits = 0;
+    for (const QChar c : text) {
+        if (c.isDigit() && ++digits <= 18)
+            key = key * 10 + static_cast<quint64>(c.digitValue());
+    }
+    return digits ? key : DeviceRecord::unknownKey;
+}
+
+quint64 macKey(const QString &text) {
+    bool ok = false;
+    const quint64 key = QString(text).remove(u':').remove(u'-').remove(u'.').toULongLong(&ok, 16);
+    return ok ? key : DeviceRecord::unknownKey;
+}
+
+/// One value of a record while it is read: text and sort key of a column.
+class Columns {
+public:
+    explicit Columns(DeviceRecord &record) : m_record(record) {}
+
+    void set(DeviceColumn column, const QString &text, quint64 key) {
+        m_record.texts[static_cast<std::size_t>(column)] = text;
+        m_record.sortKeys[static_cast<std::size_t>(column)] = key;
+    }
+    void setText(DeviceColumn column, const QString &value) {
+        const QString text = orUnknown(value);
+        set(column, text, letterKey(text));
+    }
+    void setNumber(DeviceColumn column, std::optional<qint64> number) {
+        const bool known = number && *number >= 0;
+        set(column, known ? QString::number(*number) : unknownText,
+            known ? static_cast<quint64>(*number) : DeviceRecord::unknownKey);
+    }
+    void setFlag(DeviceColumn column, std::optional<bool> on) {
+        setText(column, !on   ? QString()
+                        : *on ? QCoreApplication::translate(context, "Enabled")
+                              : QCoreApplication::translate(context, "Disabled"));
+    }
+
+private:
+    DeviceRecord &m_record;
+};
+
+DeviceClass classOf(const QString &serverType) {
+    if (serverType == QLatin1String("Camera"))
+        return DeviceClass::Camera;
+    return serverType == QLatin1String("NVR") ? DeviceClass::Nvr : DeviceClass::Others;
+}
+
+QString cardStatusText(const QString &status) {
+    // A write-protected card can be read, so it counts as ready.
+    if (status == QLatin1String("ready") || status == QLatin1String("readonly"))
+        return QCoreApplication::translate(context, "Ready");
+    if (status == QLatin1String("Error"))
+        return QCoreApplication::translate(context, "Error");
+    if (status == QLatin1String("detached"))
+        return QCoreApplication::translate(context, "Detached");
+    if (status == QLatin1String("Empty"))
+        return QCoreApplication::translate(context, "Empty");
+    return status;
+}
+
+QString audioText(const QString &audio) {
+    if (audio == QLatin1String("mute"))
+        return QCoreApplication::translate(context, "Mute");
+    if (audio == QLatin1String("unmute"))
+        return QCoreApplication::translate(context, "Unmute");
+    return audio;
+}
+
+/// The site ids: an array, or a text that holds one.
+QStringList siteIdsOf(const JSON &record) {
+    const JSON *value = member(record, "siteid");
+    JSON parsed;
+    if (value && value->is_string()) {
+        parsed = JSON::parse(value->get_ref<const std::string &>(), nullptr, false);
+        value = &parsed;
+    }
+    QStringList ids;
+    if (!value || !value->is_array())
+        return ids;
+    for (const JSON &id : *value) {
+        if (id.is_string())
+            ids.append(QString::fromStdString(id.get_ref<const std::string &>()));
+    }
+    return ids;
+}
+
+void readColumns(const JSON &value, DeviceRecord &record) {
+    Columns columns(record);
+    columns.setText(DeviceColumn::Model, rawText(value, "d_model"));
+    columns.setText(DeviceColumn::HostName, rawText(value, "d_hostname"));
+    const QString ip = rawText(value, "d_ip");
+    const quint64 ipKey = ipSortKey(ip);
+    columns.set(DeviceColumn::Ip, ipKey == DeviceRecord::unknownKey ? unknownText : ip, ipKey);
+    const QString mac = rawText(value, "d_mac");
+    columns.set(DeviceColumn::Mac, orUnknown(mac), macKey(mac));
+    const QString firmware = orUnknown(rawText(value, "d_fw"));
+    columns.set(DeviceColumn::Firmware, firmware, versionKey(firmware));
+    columns.setNumber(DeviceColumn::HttpPort, wholeNumber(value, "d_http"));
+    columns.setNumber(DeviceColumn::HttpsPort, wholeNumber(value, "d_https"));
+    columns.setFlag(DeviceColumn::Https, flag(value, "https_enable"));
+    columns.setFlag(DeviceColumn::Ieee8021x, flag(value, "ieee8021x_enable"));
+    columns.setText(DeviceColumn::SdCardStatus, cardStatusText(rawText(value, "d_sdstatus")));
+    columns.setNumber(DeviceColumn::SdCardUsage, wholeNumber(value, "d_sdusage"));
+    const QString time = orUnknown(rawText(value, "d_dtime"));
+    columns.set(DeviceColumn::DateTime, time, digitsKey(time));
+    columns.setNumber(DeviceColumn::PowerFrequency, wholeNumber(value, "d_powerfreq"));
+    columns.setText(DeviceColumn::Audio, audioText(rawText(value, "d_audio")));
+}
+
+} // namespace
+
+quint64 ipSortKey(QStringView text) {
+    quint64 key = 0;
+    int part = 0;
+    int digits = 0;
+    quint64 number = 0;
+    for (qsizetype i = 0; i <= text.size(); ++i) {
+        if (i == text.size() || text[i] == u'.') {
+            if (digits == 0 || number > 255 || ++part > 4)
+                return DeviceRecord::unknownKey;
+            key = key << 8 | number;
+            number = 0;
+            digits = 0;
+        } else if (text[i] >= u'0' && text[i] <= u'9' && ++digits <= 3) {
+            number = number * 10 + (text[i].unicode() - u'0');
+        } else {
+            return DeviceRecord::unknownKey;
+        }
+    }
+    return part == 4 ? key : DeviceRecord::unknownKey;
+}
+
+QString identityOf(const JSON &value) {
+    if (!value.is_object())
+        return {};
+    if (const QString id = rawText(value, "id"); !id.isEmpty())
+        return id;
+    return rawText(value, "d_mac").toUpper().remove(u':').remove(u'-').remove(u'.');
+}
+
+DeviceRecordPtr parse(const JSON &value) {
+    auto record = std::make_shared<DeviceRecord>();
+    record->id = identityOf(value);
+    if (record->id.isEmpty())
+        return nullptr;
+    record->deviceClass = classOf(rawText(value, "d_svrtype"));
+    record->siteIds = siteIdsOf(value);
+    readColumns(value, *record);
+    record->json = dumpJson(value);
+    return record;
+}
+
+QString columnTitle(DeviceColumn column) {
+    static constexpr std::array<const char *, deviceColumnCount> titles{
+        QT_TRANSLATE_NOOP("DeviceRecords", "Status"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "Model"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "Host Name"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "IP"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "MAC"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "Firmware"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "HTTP Port"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "HTTPS Port"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "HTTPS"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "IEEE 802.1X"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "SD Card Status"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "SD Card Usage(%)"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "Date/Time"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "Power Frequency(Hz)"),
+        QT_TRANSLATE_NOOP("DeviceRecords", "Audio")};
+    return QCoreApplication::translate(context, titles[static_cast<std::size_t>(column)]);
+}
+
+} // namespace DeviceRecords

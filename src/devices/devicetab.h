@@ -1,0 +1,43 @@
+#pragma once
+
+#include "devicerecord.h"
+
+#include <QStackedWidget>
+
+class DeviceInventory;
+class MainConsoleTable;
+class QLabel;
+class QPushButton;
+
+/// One tab of the console: a device table, or in its place why there is nothing to show.
+class DeviceTab : public QStackedWidget {
+    Q_OBJECT
+
+public:
+    enum class Content {
+        Loading, ///< nothing was read yet
+        Failed,  ///< the first reading has failed
+        Read     ///< the table, or that there is no device
+    };
+
+    DeviceTab(DeviceClass deviceClass, const DeviceInventory *inventory, QWidget *parent = nullptr);
+
+    MainConsoleTable *table() const { return m_table; }
+
+    /// Shows the right page for what is known of the devices.
+    void showContent(Content content, bool isSite);
+
+signals:
+    void addDeviceRequested();
+
+private:
+    QWidget *makeEmptyPage();
+    QWidget *makeLoadingPage();
+    QWidget *makeFailedPage();
+
+    MainConsoleTable *m_table;
+    QWidget *m_emptyPage;
+    QWidget *m_loadingPage;
+    QWidget *m_failedPage;
+    QLabel *m_siteHint = nullptr;
+};

@@ -1,0 +1,136 @@
+#include "devicetoolbar.h"
+
+#include "icons.h"
+#include "popupmenu.h"
+#include "theme.h"
+
+#include <QCoreApplication>
+#include <QHBoxLayout>
+#include <QPainter>
+#include <QStyleOptionToolButton>
+#include <QStylePainter>
+#include <QToolButton>
+
+namespace {
+
+constexpr QSize pictureSize{18, 18};
+constexpr int buttonWidth = 63;
+constexpr int buttonHeight = 58;
+constexpr int textHeight = 28;
+
+/// A button whose text stands under the icon in up to two lines, with a small arrow when it has a menu.
+class OperationButton : public QToolButton {
+public:
+    using QToolButton::QToolButton;
+
+    QSize sizeHint() const override { return {buttonWidth, buttonHeight}; }
+    QSize minimumSizeHint() const override { return {48, buttonHeight}; }
+
+protected:
+    void paintEvent(QPaintEvent *) override {
+        QStyleOptionToolButton option;
+        initStyleOption(&option);
+        option.text.clear();
+        option.icon = {};
+        option.features &= ~QStyleOptionToolButton::HasMenu;
+        QStylePainter painter(this);
+        painter.drawComplexControl(QStyle::CC_ToolButton, option);
+        const QRect iconPlace((width() - pictureSize.width()) / 2, 8, pictureSize.width(),
+                              pictureSize.height());
+        const QIcon::Mode mode = !isEnabled()   ? QIcon::Disabled
+                                 : underMouse() ? QIcon::Active
+                                                : QIcon::Normal;
+        icon().paint(&painter, iconPlace, Qt::AlignCenter, mode);
+        if (menu())
+            paintArrow(painter, iconPlace);
+        painter.setPen(isEnabled() ? Theme::textStrong : Theme::textOff);
+        painter.drawText(QRect(2, height() - textHeight - 2, width() - 4, textHeight),
+                         Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap, text());
+    }
+
+private:
+    void paintArrow(QPainter &painter, const QRect &iconPlace) const {
+        const QPointF tip(iconPlace.right() + 9.0, iconPlace.center().y() + 2.5);
+        const QPointF points[] = {tip, tip + QPointF(-3, -3.5), tip + QPointF(3, -3.5)};
+        painter.setRenderHint(QPainter::Antialiasing);
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(isEnabled() ? Theme::textDim : Theme::textOff);
+        painter.drawPolygon(points, 3);
+    }
+};
+
+struct Operation {
+    const char *name;
+    const char *text;
+    const char *icon;
+    bool groupBegins = false;
+};
+
+constexpr Operation operations[] = {
+    {"addDeviceButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Add Device"), "tool_add_device_line"},
+    {"authorizeButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Authorize Device"), "tool_authorize_line"},
+    {"setPasswordButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Set Password"), "tool_set_password_line"},
+    {"ipButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Assign IP Address"), "tool_assign_ip_line"},
+    {"uploadButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Upload"), "tool_upload_line", true},
+    {"quickSettingButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Quick Setup"), "tool_quick_setup_line"},
+    {"setConfigurationButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Set Configuration"),
+     "tool_set_configuration_line"},
+    {"backupConfigurationButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Backup Configuration"),
+     "tool_backup_configuration_line"},
+    {"restartButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Restart Device"), "tool_restart_line", true},
+    {"restoreButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Restore Device"), "tool_restore_line"},
+    {"replaceButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Replace Device"), "tool_replace_line"},
+    {"exportButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Export"), "tool_export_line", true},
+    {"refreshButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Refresh"), "tool_refresh_line"},
+    {"deleteButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Delete Device"), "tool_delete_line"},
+};
+
+void addEntries(QMenu *menu, std::initializer_list<QString> entries) {
+    for (const QString &entry : entries)
+        menu->addAction(entry)->setEnabled(false);
+}
+
+} // namespace
+
+DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
+    setObjectName(QStringLiteral("deviceToolBar"));
+    auto *layout = new QHBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 6);
+    layout->setSpacing(1);
+    for (const Operation &operation : operations) {
+        if (operation.groupBegins)
+            layout->addSpacing(8);
+        auto *button = new OperationButton(this);
+        button->setObjectName(QLatin1String(operation.name));
+        button->setText(QCoreApplication::translate("DeviceToolBar", operation.text));
+        button->setAccessibleName(button->text());
+        button->setIcon(
+            Icons::icon(QStringLiteral(":/images/%1.svg").arg(QLatin1String(operation.icon)), pictureSize));
+        button->setPopupMode(QToolButton::InstantPopup);
+        button->setFocusPolicy(Qt::TabFocus);
+        button->setEnabled(false);
+        layout->addWidget(button);
+    }
+    layout->addStretch();
+
+    auto *exportMenu = new PopupMenu(this);
+    addEntries(exportMenu, {tr("Export Device List"), tr("Export Debug Info")});
+    button(QStringLiteral("exportButton"))->setMenu(exportMenu);
+    auto *uploadMenu = new PopupMenu(this);
+    addEntries(uploadMenu, {tr("Upload Firmware"), tr("Upload Package"), tr("Upload Configuration File")});
+    auto *certificateMenu = new PopupMenu(uploadMenu);
+    certificateMenu->setTitle(tr("Upload Certificate"));
+    addEntries(certificateMenu, {tr("HTTPS"), tr("IEEE 802.1x")});
+    uploadMenu->addMenu(certificateMenu);
+    button(QStringLiteral("uploadButton"))->setMenu(uploadMenu);
+    auto *configurationMenu = new PopupMenu(this);
+    addEntries(configurationMenu, {tr("Create Template"), tr("Import Template")});
+    button(QStringLiteral("setConfigurationButton"))->setMenu(configurationMenu);
+    auto *restoreMenu = new PopupMenu(this);
+    addEntries(restoreMenu, {tr("Restore to Restore Point"), tr("Restore to Factory Default")});
+    button(QStringLiteral("restoreButton"))->setMenu(restoreMenu);
+}
+
+QToolButton *DeviceToolBar::button(const QString &objectName) const {
+    return findChild<QToolButton *>(objectName);
+}

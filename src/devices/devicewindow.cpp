@@ -1,0 +1,368 @@
+#include "devicewindow.h"
+
+#include "clientstore.h"
+#include "devicefooter.h"
+#include "devicelog.h"
+#include "devicemonitor.h"
+#include "devicetab.h"
+#include "devicetoolbar.h"
+#include "icons.h"
+#include "mainconsoletable.h"
+#include "reconnectingdialog.h"
+#include "refreshdevicedialog.h"
+#include "servicerequest.h"
+#include "sitetree.h"
+#include "transientmessage.h"
+
+#include <QComboBox>
+#include <QDebug>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QLocale>
+#include <QPushButton>
+#include <QSplitter>
+#include <QTabBar>
+#include <QTabWidget>
+#include <QTimer>
+#include <QToolButton>
+#include <QVBoxLayout>
+
+#include <nlohmann/json.hpp>
+
+#include <chrono>
+#include <new>
+#include <thread>
+
+using namespace std::chrono_literals;
+
+namespace {
+
+constexpr auto refreshDelay = 2000ms;
+constexpr auto selectionLogDelay = 200ms;
+constexpr int siteTreeWidth = 248;
+
+} // namespace
+
+DeviceWindow::DeviceWindow(QWidget *parent)
+    : QWidget(parent),
+      m_monitor(std::make_unique<DeviceMonitor>(m_inventory)),
+      m_netTask(new (std::nothrow) NetTask),
+      m_refreshTask(new (std::nothrow) NetTask),
+      m_siteTree(new SiteTree),
+      m_toolBar(new DeviceToolBar),
+      m_remoteCombo(new QComboBox),
+      m_tabs(new QTabWidget),
+      m_footer(new DeviceFooter),
+      m_selectionLogDelay(new QTimer(this)) {
+    qDebug("DeviceWindow constructor");
+    setObjectName(QStringLiteral("DeviceWindow"));
+    if (!m_netTask || !m_refreshTask)
+        qDebug("net task create failed!should not be this case!");
+    m_selectionLogDelay->setSingleShot(true);
+    m_selectionLogDelay->setInterval(selectionLogDelay);
+    buildTabs();
+    buildLayout();
+    connectParts();
+    showCounts();
+    m_footer->clear();
+}
+
+DeviceWindow::~DeviceWindow() {
+    qDebug("DeviceWindow destructor");
+}
+
+void DeviceWindow::buildTabs() {
+    m_tabs->setObjectName(QStringLiteral("deviceTabs"));
+    m_tabs->setDocumentMode(true);
+    m_tabs->tabBar()->setExpanding(false);
+    const std::pair<QString, const char *> tabs[] = {
+        {tr("Camera"), "cameraTable"}, {tr("NVR"), "nvrTable"}, {tr("Others"), "othersTable"}};
+    for (int i = 0; i < deviceClassCount; ++i) {
+        auto *tab = new DeviceTab(static_cast<DeviceClass>(i), &m_inventory);
+        tab->table()->setObjectName(QLatin1String(tabs[i].second));
+        tab->table()->setAccessibleName(tabs[i].first);
+        m_tabs->addTab(tab, tabs[i].first);
+        m_deviceTabs.push_back(tab);
+        // The count stands beside the tab's name, so that the name stays what it is.
+        auto *count = new QLabel;
+        count->setProperty("role", QStringLiteral("quiet"));
+        m_tabs->tabBar()->setTabButton(i, QTabBar::RightSide, count);
+        m_tabCounts.push_back(count);
+    }
+    m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
+    m_remoteCombo->setAccessibleName(tr("Remote connection"));
+    m_remoteCombo->setPlaceholderText(tr("Remote connection"));
+    m_remoteCombo->setMinimumWidth(200);
+    auto *corner = new QWidget;
+    auto *cornerLayout = new QHBoxLayout(corner);
+    cornerLayout->setContentsMargins(0, 0, 0, 4);
+    cornerLayout->addWidget(m_remoteCombo);
+    m_tabs->setCornerWidget(corner);
+}
+
+QWidget *DeviceWindow::buildNoticeBar() {
+    m_noticeBar = new QFrame;
+    m_noticeBar->setObjectName(QStringLiteral("noticeBar"));
+    auto *icon = new QLabel;
+    icon->setPixmap(Icons::pixmap(QStringLiteral(":images/icon_general_tip_solid_blue.svg"), {16, 16}, 2.0));
+    auto *text = new QLabel(tr("Site changes detected. Update changes to the server promptly by clicking"));
+    auto *apply = new QPushButton(tr("Apply"));
+    apply->setObjectName(QStringLiteral("noticeApplyButton"));
+    auto *layout = new QHBoxLayout(m_noticeBar);
+    layout->setContentsMargins(12, 6, 12, 6);
+    layout->addWidget(icon);
+    layout->addWidget(text);
+    layout->addWidget(apply);
+    layout->addStretch();
+    m_noticeBar->hide();
+    return m_noticeBar;
+}
+
+void DeviceWindow::buildLayout() {
+    auto *console = new QWidget;
+    auto *consoleLayout = new QVBoxLayout(console);
+    consoleLayout->setContentsMargins(14, 10, 14, 0);
+    consoleLayout->setSpacing(8);
+    consoleLayout->addWidget(m_toolBar);
+    consoleLayout->addWidget(buildNoticeBar());
+    consoleLayout->addWidget(m_tabs, 1);
+    consoleLayout->addWidget(m_footer);
+
+    auto *splitter = new QSplitter;
+    splitter->setChildrenCollapsible(false);
+    splitter->setHandleWidth(1);
+    splitter->addWidget(m_siteTree);
+    splitter->addWidget(console);
+    splitter->setStretchFactor(1, 1);
+    splitter->setSizes({siteTreeWidth, 1000});
+    m_siteTree->setMinimumWidth(180);
+    auto *layout = new QHBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(splitter);
+}
+
+void DeviceWindow::connectParts() {
+    connect(m_monitor.get(), &DeviceMonitor::updateStatus, this, &DeviceWindow::onUpdateDeviceStatus);
+    connect(m_monitor.get(), &DeviceMonitor::serverAnswered, this, &DeviceWindow::onServerAnswered);
+    connect(m_monitor.get(), &DeviceMonitor::serverLost, this, &DeviceWindow::onServerLost);
+    connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
+    connect(m_tabs, &QTabWidget::currentChanged, this, &DeviceWindow::onSelectionChanged);
+    for (const DeviceTab *tab : m_deviceTabs)
+        connect(tab->table(), &MainConsoleTable::selectedDevicesChanged, this,
+                &DeviceWindow::onSelectionChanged);
+    connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(m_selected); });
+    connect(this, &DeviceWindow::onShowAnimatedMsgDlg, this, &DeviceWindow::showDefAnimateMsgDlg);
+    connect(m_remoteCombo, &QComboBox::activated, this, [this](int index) {
+        const QString id = m_remoteCombo->itemData(index).toString();
+        m_remoteCombo->setCurrentIndex(-1);
+        emit remoteServerChosen(id);
+    });
+    QToolButton *refresh = m_toolBar->button(QStringLiteral("refreshButton"));
+    connect(refresh, &QToolButton::clicked, this, &DeviceWindow::openRefreshDialog);
+}
+
+void DeviceWindow::startWork() {
+    loadRemoteServers();
+    m_online = false;
+    m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(true);
+    reload();
+    m_monitor->start();
+}
+
+void DeviceWindow::stopWork() {
+    m_monitor->stop();
+    m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(false);
+    if (m_reconnecting)
+        m_reconnecting->close();
+    if (m_refreshing)
+        m_refreshing->close();
+    m_reloadWanted = false;
+    m_everRead = false;
+    m_lastReadFailed = false;
+    m_online = false;
+    m_inventory.replace(std::make_shared<DeviceSnapshot>(), {});
+    m_siteTree->setSites({});
+    for (const DeviceTab *tab : m_deviceTabs)
+        tab->table()->refill();
+    showCounts();
+    showContent();
+    m_footer->clear();
+}
+
+void DeviceWindow::loadRemoteServers() {
+    m_remoteCombo->clear();
+    JSON servers;
+    CClientStore::instance().loadServerList(servers);
+    for (const JSON &server : servers)
+        m_remoteCombo->addItem(QString::fromStdString(server.value("svrname", std::string())),
+                               QString::fromStdString(server.value("id", std::string())));
+    m_remoteCombo->setCurrentIndex(-1);
+    m_remoteCombo->setEnabled(m_remoteCombo->count() > 0);
+}
+
+void DeviceWindow::reload() {
+    if (m_reloading) {
+        m_reloadWanted = true;
+        return;
+    }
+    const auto read = [snapshot = m_inventory.snapshot(),
+                       codes = m_inventory.statuses()](ServiceSession &session) {
+        return InventoryReader::readAll(session, snapshot, codes);
+    };
+    m_reloadWanted = false;
+    m_reloading = ServiceRequest::post(
+        m_netTask.get(), this, read, [this](const InventoryReader::Reading &reading) { onReading(reading); },
+        [this](JobEnd end) {
+            m_reloading = false;
+            if (end != JobEnd::Delivered && end != JobEnd::SessionGone) {
+                m_lastReadFailed = true;
+                showContent();
+            }
+            if (m_reloadWanted)
+                reload();
+        });
+    // The runner may still be busy with the last answer of a session that has ended.
+    m_reloadWanted = !m_reloading;
+}
+
+void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
+    qDebug("update site info");
+    qDebug("update device info");
+    if (reading.sites)
+        m_siteTree->setSites(*reading.sites);
+    m_lastReadFailed = !reading.devices;
+    if (reading.devices) {
+        const DeviceSnapshotPtr previous = m_inventory.snapshot();
+        m_inventory.replace(reading.devices, reading.codes);
+        m_everRead = true;
+        for (const DeviceTab *tab : m_deviceTabs)
+            tab->table()->refill();
+        DeviceLog::tablesFilled(reading.devices, previous);
+        m_footer->markUpdated();
+    }
+    m_siteTree->setCounts(*m_inventory.snapshot());
+    showCounts();
+    showContent();
+    onSelectionChanged();
+}
+
+void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
+    m_footer->markUpdated();
+    if (update.devicesDiffer)
+        reload();
+    if (!m_inventory.apply(update) || update.changes.empty())
+        return;
+    for (const DeviceTab *tab : m_deviceTabs)
+        tab->table()->refreshStatus();
+    m_footer->setStatuses(m_inventory.statuses());
+}
+
+void DeviceWindow::onServerAnswered() {
+    if (m_reconnecting && m_reconnecting->isVisible()) {
+        m_reconnecting->setStatusVisible(false);
+        m_reconnecting->close();
+    }
+    if (!m_online && !m_refreshing)
+        openRefreshDialog();
+}
+
+void DeviceWindow::onServerLost() {
+    m_online = false;
+    if (m_reconnecting && m_reconnecting->isVisible())
+        return;
+    if (m_refreshing)
+        m_refreshing->close();
+    if (!m_reconnecting) {
+        m_reconnecting = new ReconnectingDialog(this);
+        connect(m_reconnecting, &ReconnectingDialog::disconnectBtnClicked, this,
+                &DeviceWindow::disconnectRequested);
+    }
+    m_reconnecting->setStatusVisible(true);
+    m_reconnecting->show();
+}
+
+void DeviceWindow::openRefreshDialog() {
+    if (m_refreshing)
+        return;
+    m_refreshing = new RefreshDeviceDialog(this);
+    m_refreshing->setAttribute(Qt::WA_DeleteOnClose);
+    connect(m_refreshing, &RefreshDeviceDialog::refresh, this, &DeviceWindow::onRefreshDevice);
+    connect(m_refreshing, &QDialog::accepted, this, &DeviceWindow::onRefreshDone);
+    connect(m_refreshing, &QDialog::rejected, this, &DeviceWindow::onRefreshDone);
+    m_refreshing->open();
+}
+
+void DeviceWindow::onRefreshDevice() {
+    qDebug("onRefreshDevice@@@@@");
+    const auto read = [snapshot = m_inventory.snapshot(),
+                       codes = m_inventory.statuses()](ServiceSession &session) {
+        return InventoryReader::readStatus(session, snapshot, codes);
+    };
+    const QPointer<RefreshDeviceDialog> dialog = m_refreshing;
+    const bool started = ServiceRequest::post(
+        m_refreshTask.get(), this, read,
+        [this](const std::optional<DeviceStatusUpdate> &update) {
+            if (update)
+                onUpdateDeviceStatus(*update);
+            else
+                emit onShowAnimatedMsgDlg(tr("The device states could not be read. Try again."));
+        },
+        [dialog](JobEnd) {
+            if (dialog)
+                dialog->finish();
+        },
+        // The devices need a moment to settle; the wait must not keep other jobs from their turn.
+        [] { std::this_thread::sleep_for(refreshDelay); });
+    if (!started && dialog)
+        dialog->finish();
+}
+
+void DeviceWindow::onRefreshDone() {
+    if (!CLocalStore::instance().loginInfo().isComplete() || (m_reconnecting && m_reconnecting->isVisible()))
+        return;
+    m_online = true;
+    reload();
+}
+
+void DeviceWindow::onSiteChanged(const QString &siteId) {
+    for (const DeviceTab *tab : m_deviceTabs)
+        tab->table()->setSite(siteId);
+    showCounts();
+    showContent();
+    onSelectionChanged();
+}
+
+void DeviceWindow::onSelectionChanged() {
+    const MainConsoleTable *table = currentTab()->table();
+    m_selected.clear();
+    for (const int device : table->selectedDevices())
+        m_selected.push_back(m_inventory.snapshot()->at(device));
+    qDebug("device selected: %d", static_cast<int>(m_selected.size()));
+    m_selectionLogDelay->start();
+    m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount());
+}
+
+void DeviceWindow::showCounts() {
+    const QLocale locale;
+    for (std::size_t i = 0; i < m_deviceTabs.size(); ++i) {
+        m_tabCounts[i]->setText(locale.toString(m_deviceTabs[i]->table()->rowCount()));
+        m_tabCounts[i]->adjustSize();
+    }
+    m_footer->setStatuses(m_inventory.statuses());
+}
+
+void DeviceWindow::showContent() {
+    const auto content = m_everRead         ? DeviceTab::Content::Read
+                         : m_lastReadFailed ? DeviceTab::Content::Failed
+                                            : DeviceTab::Content::Loading;
+    for (DeviceTab *tab : m_deviceTabs)
+        tab->showContent(content, m_siteTree->currentSite() != Sites::overviewId);
+}
+
+DeviceTab *DeviceWindow::currentTab() const {
+    return m_deviceTabs[static_cast<std::size_t>(m_tabs->currentIndex())];
+}
+
+void DeviceWindow::showDefAnimateMsgDlg(const QString &message) {
+    TransientMessage::show(this, message);
+}

@@ -1,0 +1,100 @@
+#pragma once
+
+#include "deviceinventory.h"
+#include "inventoryreader.h"
+#include "nettask.h"
+
+#include <QPointer>
+#include <QWidget>
+
+#include <memory>
+
+class DeviceFooter;
+class DeviceMonitor;
+class DeviceTab;
+class DeviceToolBar;
+class MainConsoleTable;
+class QComboBox;
+class QFrame;
+class QLabel;
+class QTabWidget;
+class QTimer;
+class ReconnectingDialog;
+class RefreshDeviceDialog;
+class SiteTree;
+
+/// The device console: the site tree, the tool bar, the three device tables and what keeps them current.
+class DeviceWindow : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit DeviceWindow(QWidget *parent = nullptr);
+    ~DeviceWindow() override;
+
+    /// Reads the inventory of the present session and begins to follow it.
+    void startWork();
+    /// Ends that and forgets everything that was shown.
+    void stopWork();
+
+    /// The devices that operations work on, in the order of their rows.
+    const std::vector<DeviceRecordPtr> &selectedDevices() const { return m_selected; }
+
+public slots:
+    /// Reads sites and devices again.
+    void reload();
+    /// Shows a transient message.
+    void showDefAnimateMsgDlg(const QString &message);
+
+signals:
+    void onShowAnimatedMsgDlg(const QString &message);
+    /// The user gives the lost server up.
+    void disconnectRequested();
+    /// A server of the saved list was chosen in place of the present one.
+    void remoteServerChosen(const QString &serverId);
+
+private:
+    void buildLayout();
+    QWidget *buildNoticeBar();
+    void buildTabs();
+    void connectParts();
+
+    void onReading(const InventoryReader::Reading &reading);
+    void onUpdateDeviceStatus(const DeviceStatusUpdate &update);
+    void onServerAnswered();
+    void onServerLost();
+    void onSelectionChanged();
+    void onSiteChanged(const QString &siteId);
+
+    void openRefreshDialog();
+    void onRefreshDevice();
+    void onRefreshDone();
+
+    void loadRemoteServers();
+    void showContent();
+    void showCounts();
+    DeviceTab *currentTab() const;
+
+    DeviceInventory m_inventory;
+    std::unique_ptr<DeviceMonitor> m_monitor;
+    NetTask::Owner m_netTask;
+    NetTask::Owner m_refreshTask;
+
+    SiteTree *m_siteTree;
+    DeviceToolBar *m_toolBar;
+    QFrame *m_noticeBar = nullptr;
+    QComboBox *m_remoteCombo;
+    QTabWidget *m_tabs;
+    std::vector<DeviceTab *> m_deviceTabs;
+    std::vector<QLabel *> m_tabCounts;
+    DeviceFooter *m_footer;
+    QTimer *m_selectionLogDelay;
+
+    QPointer<ReconnectingDialog> m_reconnecting;
+    QPointer<RefreshDeviceDialog> m_refreshing;
+    std::vector<DeviceRecordPtr> m_selected;
+    bool m_online = false;
+    bool m_reloading = false;
+    bool m_reloadWanted = false;
+    bool m_everRead = false;
+    bool m_lastReadFailed = false;
+};

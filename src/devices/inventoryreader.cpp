@@ -1,0 +1,173 @@
+#include "inventoryreader.h"
+
+#include "servicesession.h"
+
+#include <QDebug>
+
+#include <nlohmann/json.hpp>
+
+namespace InventoryReader {
+
+namespace {
+
+constexpr int pageSize = 500;
+/// A service whose pages never end is not followed for ever.
+constexpr int pageLimit = 400;
+
+using ListCall = unsigned (CApiClient::*)(int, int, JSON &);
+
+/// Hands every page to the taker until one is short. Returns the first result that is not ApiOk.
+unsigned readPages(ServiceSession &session, ListCall list, const std::function<void(JSON &)> &take) {
+    for (int page = 0; page < pageLimit; ++page) {
+        JSON records;
+        const unsigned result = session.call(
+            [&](CApiClient &client) { return (client.*list)(page * pageSize, pageSize, records); });
+        if (result != ApiOk)
+            return result;
+        if (!records.is_array())
+            return ApiMissingData;
+        const std::size_t count = records.size();
+        take(records);
+        if (count < pageSize)
+            break;
+    }
+    return ApiOk;
+}
+
+std::optional<Sites::List> readSites(ServiceSession &session) {
+    JSON all = JSON::array();
+    const unsigned result = readPages(session, &CApiClient::listSites, [&](JSON &page) {
+        for (JSON &site : page)
+            all.push_back(std::move(site));
+    });
+    if (result != ApiOk) {
+        qDebug("HTTP API(listSites) failed!");
+        return std::nullopt;
+    }
+    if (all.empty())
+        qDebug("no site found!");
+    qDebug("site list size: %d, dump: %s", static_cast<int>(all.size()), dumpJson(all).c_str());
+    return Sites::parse(all);
+}
+
+/// The record as it was, when it says the same: then nothing has to be read, kept or painted anew.
+DeviceRecordPtr recordOf(const JSON &value, const DeviceSnapshot &previous) {
+    const int index = previous.indexOf(DeviceRecords::identityOf(value));
+    if (index >= 0 && previous.at(index)->json == dumpJson(value))
+        return previous.at(index);
+    return DeviceRecords::parse(value);
+}
+
+bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
+    if (a.size() != b.size())
+        return false;
+    for (int i = 0; i < a.size(); ++i) {
+        if (a.at(i) != b.at(i))
+            return false;
+    }
+    return true;
+}
+
+DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous) {
+    std::vector<DeviceRecordPtr> records;
+    int unreadable = 0;
+    const unsigned result = readPages(session, &CApiClient::listDevices, [&](JSON &page) {
+        for (const JSON &value : page) {
+            if (DeviceRecordPtr record = recordOf(value, *previous))
+                records.push_back(std::move(record));
+            else
+                ++unreadable;
+        }
+    });
+    if (result != ApiOk) {
+        qDebug("HTTP API(listDevices) failed!");
+        return nullptr;
+    }
+    if (unreadable > 0)
+        qWarning("%d device records have neither id nor MAC address and are not shown", unreadable);
+    auto snapshot = std::make_shared<const DeviceSnapshot>(std::move(records));
+    return isSame(*snapshot, *previous) ? previous : snapshot;
+}
+
+std::string_view textOf(const JSON &record, const char *name) {
+    const auto found = record.find(name);
+    return found != record.end() && found->is_string()
+               ? std::string_view(found->get_ref<const std::string &>())
+               : std::string_view();
+}
+
+struct StatusReading {
+    std::vector<DeviceStatusCode> codes;
+    bool devicesDiffer = false;
+};
+
+/// The states of a snapshot's devices; one that the list misses counts as unauthorized.
+std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnapshot &snapshot) {
+    const auto size = static_cast<std::size_t>(snapshot.size());
+    StatusReading reading{std::vector<DeviceStatusCode>(size, DeviceStatusCode::Unauthorized)};
+    std::vector<bool> seen(size, false);
+    const unsigned result = readPages(session, &CApiClient::listDeviceStatus, [&](JSON &page) {
+        for (const JSON &record : page) {
+            const int index = record.is_object() ? snapshot.indexOf(std::string(textOf(record, "id"))) : -1;
+            if (index < 0) {
+                reading.devicesDiffer = true;
+                continue;
+            }
+            const auto place = static_cast<std::size_t>(index);
+            seen[place] = true;
+            reading.codes[place] =
+                DeviceStatus::codeOf(textOf(record, "connect_status"), textOf(record, "auth_status"),
+                                     textOf(record, "action_status"));
+        }
+    });
+    if (result != ApiOk) {
+        qDebug("HTTP API(listDeviceStatus) failed! (%d)", static_cast<int>(result));
+        return std::nullopt;
+    }
+    reading.devicesDiffer = reading.devicesDiffer || std::find(seen.begin(), seen.end(), false) != seen.end();
+    return reading;
+}
+
+/// The states to show while the new ones could not be read: as before, for the devices that stayed.
+std::vector<DeviceStatusCode> carriedOver(const DeviceSnapshot &snapshot, const DeviceSnapshot &previous,
+                                          const std::vector<DeviceStatusCode> &previousCodes) {
+    std::vector<DeviceStatusCode> codes(static_cast<std::size_t>(snapshot.size()),
+                                        DeviceStatusCode::Unauthorized);
+    for (int i = 0; i < snapshot.size(); ++i) {
+        const auto before = static_cast<std::size_t>(previous.indexOf(snapshot.at(i)->id));
+        if (before < previousCodes.size())
+            codes[static_cast<std::size_t>(i)] = previousCodes[before];
+    }
+    return codes;
+}
+
+} // namespace
+
+Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
+                std::vector<DeviceStatusCode> previousCodes) {
+    Reading reading;
+    reading.sites = readSites(session);
+    reading.devices = readDevices(session, previous);
+    if (!reading.devices)
+        return reading;
+    if (std::optional<StatusReading> status = readCodes(session, *reading.devices))
+        reading.codes = std::move(status->codes);
+    else
+        reading.codes = carriedOver(*reading.devices, *previous, previousCodes);
+    return reading;
+}
+
+std::optional<DeviceStatusUpdate> readStatus(ServiceSession &session, const DeviceSnapshotPtr &snapshot,
+                                             const std::vector<DeviceStatusCode> &codes) {
+    const std::optional<StatusReading> reading = readCodes(session, *snapshot);
+    if (!reading)
+        return std::nullopt;
+    DeviceStatusUpdate update{snapshot, {}, reading->devicesDiffer};
+    for (std::size_t i = 0; i < reading->codes.size() && i < codes.size(); ++i) {
+        if (reading->codes[i] != codes[i])
+            update.changes.emplace_back(static_cast<int>(i), reading->codes[i]);
+    }
+    return update;
+}
+
+} // namespace InventoryReader

@@ -1,0 +1,29 @@
+#pragma once
+
+#include "deviceinventory.h"
+#include "sitelist.h"
+
+#include <optional>
+
+class ServiceSession;
+
+/// Reads sites, devices and their states from the service, page by page. For a runner's thread.
+namespace InventoryReader {
+
+/// A reading of everything the console shows.
+struct Reading {
+    std::optional<Sites::List> sites;    ///< nothing when they could not be read
+    DeviceSnapshotPtr devices;           ///< null when they could not be read
+    std::vector<DeviceStatusCode> codes; ///< one a device, in their order
+};
+
+/// Reads all three. Records that are as before are taken over from the previous reading; when all are, the
+/// very same snapshot comes back.
+Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
+                std::vector<DeviceStatusCode> previousCodes);
+
+/// Reads the states and compares them with those of a snapshot. Nothing when they could not be read.
+std::optional<DeviceStatusUpdate> readStatus(ServiceSession &session, const DeviceSnapshotPtr &snapshot,
+                                             const std::vector<DeviceStatusCode> &codes);
+
+} // namespace InventoryReader

@@ -1,0 +1,288 @@
+#include "mainconsoletable.h"
+
+#include "sitelist.h"
+#include "sortableiptablewidgetitem.h"
+#include "theme.h"
+
+#include <QElapsedTimer>
+#include <QHeaderView>
+#include <QScrollBar>
+#include <QSignalBlocker>
+#include <QTimerEvent>
+
+#include <algorithm>
+
+namespace {
+
+/// How long the user-interface thread may make items at a time.
+constexpr int fillBudgetMs = 6;
+constexpr int rowsBetweenClockLooks = 64;
+constexpr int widthSample = 200;
+constexpr int widestColumn = 260;
+constexpr int cellMargins = 20;
+constexpr int sortArrowSpace = 14;
+constexpr int statusIconSpace = 12;
+constexpr int longestSampledText = 80;
+
+/// An item that knows its place and asks the table for what stands there.
+template <typename Base>
+class PlaceItem : public Base {
+public:
+    PlaceItem(int row, int column) : m_row(row), m_column(column) {}
+
+    QVariant data(int role) const override {
+        const auto *table = static_cast<const MainConsoleTable *>(this->tableWidget());
+        return table ? table->cellData(m_row, m_column, role) : QVariant();
+    }
+
+private:
+    int m_row;
+    int m_column;
+};
+
+QTableWidgetItem *makeItem(int row, int column) {
+    if (column == static_cast<int>(DeviceColumn::Ip))
+        return new PlaceItem<SortableIpTableWidgetItem>(row, column);
+    return new PlaceItem<QTableWidgetItem>(row, column);
+}
+
+} // namespace
+
+/// Devices by their places in the reading that was shown, since rows mean nothing in another order.
+struct MainConsoleTable::Place {
+    static constexpr int none = -1;
+
+    DeviceSnapshotPtr snapshot;
+    std::vector<bool> selected; ///< empty when nothing is
+    int current = none;
+    int currentColumn = 0;
+    int top = none; ///< the device in the first visible row
+    int topOffset = 0;
+    std::vector<int> order;
+};
+
+MainConsoleTable::MainConsoleTable(DeviceClass deviceClass, QWidget *parent)
+    : CustomTable(parent), m_filter{deviceClass, Sites::overviewId} {
+    setColumnCount(deviceColumnCount);
+    QStringList titles;
+    for (int column = 0; column < deviceColumnCount; ++column)
+        titles.append(DeviceRecords::columnTitle(static_cast<DeviceColumn>(column)));
+    setHorizontalHeaderLabels(titles);
+    horizontalHeader()->setSortIndicatorShown(false);
+    horizontalHeader()->setSectionsMovable(true);
+    connect(horizontalHeader(), &QHeaderView::sectionClicked, this, &MainConsoleTable::sortBy);
+    connect(this, &QTableWidget::itemSelectionChanged, this, &MainConsoleTable::selectedDevicesChanged);
+}
+
+void MainConsoleTable::setInventory(const DeviceInventory *inventory) {
+    m_inventory = inventory;
+    refill();
+}
+
+void MainConsoleTable::setSite(const QString &siteId) {
+    if (siteId == m_filter.siteId)
+        return;
+    m_filter.siteId = siteId;
+    refill();
+}
+
+void MainConsoleTable::refill() {
+    if (!m_inventory)
+        return;
+    const Place place = rememberPlace();
+    arrange();
+    const int rows = static_cast<int>(m_order.size());
+    {
+        // Selections of rows that go are put right below, in one step.
+        const QSignalBlocker blocker(selectionModel());
+        setRowCount(rows);
+    }
+    m_filledRows = std::min(m_filledRows, rows);
+    fillItems(fillBudgetMs);
+    fitColumns();
+    restorePlace(place);
+    viewport()->update();
+}
+
+void MainConsoleTable::refreshStatus() {
+    if (m_sort.column == static_cast<int>(DeviceColumn::Status))
+        refill();
+    else
+        viewport()->update();
+}
+
+void MainConsoleTable::arrange() {
+    m_shown = m_inventory->snapshot();
+    m_order = DeviceOrder::arrange(*m_inventory, m_filter, m_sort);
+}
+
+MainConsoleTable::Place MainConsoleTable::rememberPlace() const {
+    Place place;
+    place.snapshot = m_shown;
+    place.order = m_order;
+    if (!m_shown)
+        return place;
+    const auto deviceAt = [this](int row) {
+        const auto at = static_cast<std::size_t>(row);
+        return row >= 0 && at < m_order.size() ? m_order[at] : Place::none;
+    };
+    const std::vector<int> devices = selectedDevices();
+    if (!devices.empty()) {
+        place.selected.resize(static_cast<std::size_t>(m_shown->size()));
+        for (const int device : devices)
+            place.selected[static_cast<std::size_t>(device)] = true;
+    }
+    place.current = deviceAt(currentRow());
+    place.currentColumn = std::max(0, currentColumn());
+    const int topRow = rowAt(0);
+    place.top = verticalScrollBar()->value() > 0 ? deviceAt(topRow) : Place::none;
+    place.topOffset = topRow >= 0 ? rowViewportPosition(topRow) : 0;
+    return place;
+}
+
+bool MainConsoleTable::isSameOrder(const Place &place) const {
+    if (place.order.size() != m_order.size() || !place.snapshot)
+        return false;
+    if (place.snapshot == m_shown)
+        return place.order == m_order;
+    for (std::size_t row = 0; row < m_order.size(); ++row) {
+        if (place.snapshot->at(place.order[row])->id != m_shown->at(m_order[row])->id)
+            return false;
+    }
+    return true;
+}
+
+void MainConsoleTable::restorePlace(const Place &place) {
+    if (!place.snapshot || isSameOrder(place))
+        return;
+    const bool sameReading = place.snapshot == m_shown;
+    QItemSelection selection;
+    int selectedBefore = 0;
+    int selectedNow = 0;
+    int rangeStart = -1;
+    int currentRow = Place::none;
+    int topRow = Place::none;
+    const int rows = rowCount();
+    for (int row = 0; row <= rows; ++row) {
+        bool selected = false;
+        if (row < rows) {
+            const int device = m_order[static_cast<std::size_t>(row)];
+            const int before = sameReading ? device : place.snapshot->indexOf(m_shown->at(device)->id);
+            selected =
+                before >= 0 && !place.selected.empty() && place.selected[static_cast<std::size_t>(before)];
+            currentRow = before >= 0 && before == place.current ? row : currentRow;
+            topRow = before >= 0 && before == place.top ? row : topRow;
+        }
+        selectedNow += selected;
+        if (selected && rangeStart < 0)
+            rangeStart = row;
+        if (!selected && rangeStart >= 0) {
+            selection.append(QItemSelectionRange(model()->index(rangeStart, 0),
+                                                 model()->index(row - 1, deviceColumnCount - 1)));
+            rangeStart = -1;
+        }
+    }
+    selectedBefore = static_cast<int>(std::count(place.selected.begin(), place.selected.end(), true));
+    {
+        // Selecting from scratch is linear; comparing two selections of many ranges is not.
+        const QSignalBlocker blocker(selectionModel());
+        selectionModel()->reset();
+        if (currentRow >= 0)
+            selectionModel()->setCurrentIndex(model()->index(currentRow, place.currentColumn),
+                                              QItemSelectionModel::NoUpdate);
+        selectionModel()->select(selection, QItemSelectionModel::Select);
+    }
+    if (topRow >= 0)
+        verticalScrollBar()->setValue(topRow * Theme::rowHeight - place.topOffset);
+    if (selectedNow != selectedBefore)
+        emit selectedDevicesChanged();
+}
+
+/// Widths from the titles and a sample of the rows, once: later fills must not make columns jump.
+void MainConsoleTable::fitColumns() {
+    if (m_columnsFitted || m_order.empty())
+        return;
+    m_columnsFitted = true;
+    const QFontMetrics metrics = fontMetrics();
+    const QFontMetrics headerMetrics(horizontalHeader()->font());
+    for (int column = 0; column < deviceColumnCount; ++column) {
+        int width = headerMetrics.horizontalAdvance(horizontalHeaderItem(column)->text()) + sortArrowSpace;
+        for (int row = 0; row < std::min(rowCount(), widthSample); ++row) {
+            const QString text = cellData(row, column, Qt::DisplayRole).toString().left(longestSampledText);
+            width = std::max(width, metrics.horizontalAdvance(text) + (column == 0 ? statusIconSpace : 0));
+        }
+        setColumnWidth(column, std::min(width + cellMargins, widestColumn));
+    }
+}
+
+void MainConsoleTable::sortBy(int column) {
+    const bool same = column == m_sort.column;
+    m_sort.order = same && m_sort.order == Qt::AscendingOrder ? Qt::DescendingOrder : Qt::AscendingOrder;
+    m_sort.column = column;
+    horizontalHeader()->setSortIndicatorShown(true);
+    horizontalHeader()->setSortIndicator(column, m_sort.order);
+    refill();
+}
+
+void MainConsoleTable::fillItems(int budgetMs) {
+    QElapsedTimer clock;
+    clock.start();
+    // Setting an item announces a change; nobody needs to hear that of an item that has no data of its own.
+    const QSignalBlocker blocker(model());
+    const int rows = rowCount();
+    for (; m_filledRows < rows; ++m_filledRows) {
+        if (m_filledRows % rowsBetweenClockLooks == 0 && clock.elapsed() >= budgetMs)
+            break;
+        for (int column = 0; column < deviceColumnCount; ++column)
+            setItem(m_filledRows, column, makeItem(m_filledRows, column));
+    }
+    if (m_filledRows < rows)
+        m_fillTimer.start(0, this);
+    else
+        m_fillTimer.stop();
+}
+
+void MainConsoleTable::timerEvent(QTimerEvent *event) {
+    if (event->timerId() != m_fillTimer.timerId()) {
+        CustomTable::timerEvent(event);
+        return;
+    }
+    fillItems(fillBudgetMs);
+    viewport()->update();
+}
+
+QVariant MainConsoleTable::cellData(int row, int column, int role) const {
+    if (!m_inventory || row < 0 || static_cast<std::size_t>(row) >= m_order.size())
+        return {};
+    const int index = m_order[static_cast<std::size_t>(row)];
+    const DeviceRecord &record = *m_shown->at(index);
+    const auto which = static_cast<DeviceColumn>(column);
+    const bool isStatus = which == DeviceColumn::Status;
+    switch (role) {
+    case Qt::DisplayRole:
+        return isStatus ? DeviceStatus::text(m_inventory->status(index)) : record.text(which);
+    case Qt::DecorationRole:
+        return isStatus ? QVariant(DeviceStatus::icon(m_inventory->status(index))) : QVariant();
+    case deviceIdRole:
+        return record.id;
+    default:
+        return {};
+    }
+}
+
+std::vector<int> MainConsoleTable::selectedDevices() const {
+    std::vector<int> rows;
+    for (const QItemSelectionRange &range : selectionModel()->selection()) {
+        for (int row = range.top(); row <= range.bottom(); ++row)
+            rows.push_back(row);
+    }
+    std::sort(rows.begin(), rows.end());
+    rows.erase(std::unique(rows.begin(), rows.end()), rows.end());
+    std::vector<int> devices;
+    devices.reserve(rows.size());
+    for (const int row : rows) {
+        if (static_cast<std::size_t>(row) < m_order.size())
+            devices.push_back(m_order[static_cast<std::size_t>(row)]);
+    }
+    return devices;
+}

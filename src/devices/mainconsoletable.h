@@ -1,0 +1,66 @@
+#pragma once
+
+#include "customtable.h"
+#include "deviceorder.h"
+
+#include <QBasicTimer>
+#include <QStringList>
+
+/// A device table of the console: the devices of one class, in fifteen columns.
+///
+/// It shows an inventory that belongs to somebody else. Its items are bound to their places and answer from
+/// the record that the order puts into their row, so refilling, sorting and polling move no item. Selection,
+/// current device and scroll position stay with the devices, not with the rows.
+class MainConsoleTable : public CustomTable {
+    Q_OBJECT
+
+public:
+    /// Role of the device's id, at every cell of its row.
+    static constexpr int deviceIdRole = Qt::UserRole;
+
+    explicit MainConsoleTable(DeviceClass deviceClass, QWidget *parent = nullptr);
+
+    /// The inventory must outlive the table.
+    void setInventory(const DeviceInventory *inventory);
+    /// Shows the devices of a site, or all for the overview's id.
+    void setSite(const QString &siteId);
+
+    /// To be called after the inventory's devices have changed.
+    void refill();
+    /// To be called after states have changed: paints again, and sorts again when the states decide the
+    /// order.
+    void refreshStatus();
+
+    /// The devices of the selected rows, as places in the inventory, in the order of the rows.
+    std::vector<int> selectedDevices() const;
+
+    /// What an item of the table answers.
+    QVariant cellData(int row, int column, int role) const;
+
+signals:
+    /// Other devices are selected than before.
+    void selectedDevicesChanged();
+
+protected:
+    void timerEvent(QTimerEvent *event) override;
+
+private:
+    struct Place; // what has to survive a new order
+    Place rememberPlace() const;
+    void restorePlace(const Place &place);
+    bool isSameOrder(const Place &place) const;
+
+    void arrange();
+    void sortBy(int column);
+    void fillItems(int budgetMs);
+    void fitColumns();
+
+    const DeviceInventory *m_inventory = nullptr;
+    DeviceSnapshotPtr m_shown; ///< the reading whose places m_order holds
+    DeviceFilter m_filter;
+    DeviceSort m_sort;
+    std::vector<int> m_order;
+    int m_filledRows = 0;
+    QBasicTimer m_fillTimer;
+    bool m_columnsFitted = false;
+};

@@ -1,0 +1,17 @@
+#include "reconnectingdialog.h"
+
+#include "ui_reconnectingdialog.h"
+
+ReconnectingDialog::ReconnectingDialog(QWidget *parent)
+    : FramelessDialog(parent), m_ui(std::make_unique<Ui::ReconnectingDialog>()) {
+    setObjectName(QStringLiteral("ReconnectingDialog"));
+    m_ui->setupUi(content());
+    setWindowTitle(tr("Reconnecting"));
+    connect(m_ui->disconnectButton, &QPushButton::clicked, this, &ReconnectingDialog::disconnectBtnClicked);
+}
+
+ReconnectingDialog::~ReconnectingDialog() = default;
+
+void ReconnectingDialog::setStatusVisible(bool visible) {
+    m_ui->statusWidget->setVisible(visible);
+}

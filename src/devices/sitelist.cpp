@@ -1,0 +1,87 @@
+#include "sitelist.h"
+
+#include <QHash>
+#include <QSet>
+
+#include <nlohmann/json.hpp>
+
+namespace Sites {
+
+namespace {
+
+QString text(const JSON &record, const char *name) {
+    const auto found = record.find(name);
+    return found != record.end() && found->is_string() ? QString::fromStdString(found->get<std::string>())
+                                                       : QString();
+}
+
+List readRecords(const JSON &records) {
+    List sites;
+    QSet<QString> seen;
+    for (const JSON &record : records) {
+        if (!record.is_object())
+            continue;
+        const QString id = text(record, "siteid");
+        if (id.isEmpty() || id == rootId || id == overviewId || seen.contains(id))
+            continue;
+        seen.insert(id);
+        sites.push_back({id, text(record, "parentid"), text(record, "sitename")});
+    }
+    return sites;
+}
+
+/// Appends the sites below a parent, level by level; no recursion, since the depth is the service's.
+void appendBelow(const QString &root, const QMultiHash<QString, Site> &byParent, QSet<QString> &placed,
+                 List &ordered) {
+    List level;
+    const auto childrenOf = [&](const QString &parent) {
+        // A multi-hash gives the latest first; the service's order is the one to keep.
+        const QList<Site> children = byParent.values(parent);
+        return List(children.crbegin(), children.crend());
+    };
+    level = childrenOf(root);
+    while (!level.empty()) {
+        List next;
+        for (const Site &site : level) {
+            if (placed.contains(site.id))
+                continue;
+            placed.insert(site.id);
+            ordered.push_back(site);
+            const List children = childrenOf(site.id);
+            next.insert(next.end(), children.begin(), children.end());
+        }
+        level = std::move(next);
+    }
+}
+
+} // namespace
+
+List parse(const JSON &records) {
+    if (!records.is_array())
+        return {};
+    List sites = readRecords(records);
+    QSet<QString> known{rootId};
+    for (const Site &site : sites)
+        known.insert(site.id);
+    QMultiHash<QString, Site> byParent;
+    for (Site &site : sites) {
+        if (!known.contains(site.parentId))
+            site.parentId = rootId;
+        byParent.insert(site.parentId, site);
+    }
+    List ordered;
+    QSet<QString> placed;
+    appendBelow(rootId, byParent, placed, ordered);
+    // What is left hangs in a cycle: its first member becomes a top-level site, which breaks the cycle.
+    for (Site site : sites) {
+        if (placed.contains(site.id))
+            continue;
+        site.parentId = rootId;
+        placed.insert(site.id);
+        ordered.push_back(site);
+        appendBelow(site.id, byParent, placed, ordered);
+    }
+    return ordered;
+}
+
+} // namespace Sites
