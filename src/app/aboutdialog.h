@@ -1,0 +1,21 @@
+#pragma once
+
+#include "framelessdialog.h"
+
+#include <memory>
+
+namespace Ui {
+class AboutDialog;
+}
+
+/// Name and version of the program.
+class AboutDialog : public FramelessDialog {
+    Q_OBJECT
+
+public:
+    explicit AboutDialog(QWidget *parent = nullptr);
+    ~AboutDialog() override;
+
+private:
+    std::unique_ptr<Ui::AboutDialog> m_ui;
+};

@@ -1,0 +1,348 @@
+#include "framelesswindow.h"
+
+#include "aboutdialog.h"
+#include "accountsetupdialog.h"
+#include "confirmdialog.h"
+#include "devicewindow.h"
+#include "idlewatch.h"
+#include "localstore.h"
+#include "logindialog.h"
+#include "mainwindow.h"
+#include "popupmenu.h"
+#include "servicecontrol.h"
+#include "servicerequest.h"
+#include "startcheck.h"
+#include "titlebar.h"
+#include "welcomepage.h"
+
+#include <QApplication>
+#include <QDebug>
+#include <QMouseEvent>
+#include <QStackedWidget>
+#include <QTimer>
+#include <QToolButton>
+#include <QVBoxLayout>
+#include <QWindow>
+
+#include <chrono>
+
+using namespace std::chrono_literals;
+
+namespace {
+
+constexpr int resizeMargin = 4;
+constexpr QSize startSize{1280, 720};
+constexpr QSize smallestSize{1100, 640};
+constexpr auto finalLogOffTime = 3000ms;
+
+unsigned logOut(CApiClient &client, const LoginInfo &login) {
+    client.setTotalTimeout(finalLogOffTime);
+    return client.logoutServer(login.token.constData());
+}
+
+} // namespace
+
+FramelessWindow::FramelessWindow(QWidget *parent)
+    : QWidget(parent,
+              Qt::Window | Qt::FramelessWindowHint | Qt::WindowSystemMenuHint | Qt::WindowMinimizeButtonHint),
+      m_titleBar(new TitleBar),
+      m_stack(new QStackedWidget),
+      m_welcome(new WelcomePage),
+      m_startCheck(new StartCheck(this)),
+      m_idle(new IdleWatch(this)) {
+    setObjectName(QStringLiteral("FramelessWindow"));
+    setWindowTitle(QCoreApplication::applicationName());
+    buildLayout();
+    probeLocalService();
+    connectParts();
+    qApp->installEventFilter(this);
+    QTimer::singleShot(0, this, &FramelessWindow::checkLoginDialog);
+}
+
+FramelessWindow::~FramelessWindow() {
+    qDebug("FramelessWindow destructor");
+    qApp->removeEventFilter(this);
+    const LoginInfo login = CLocalStore::instance().loginInfo();
+    if (!login.isComplete())
+        return;
+    unsigned result = ApiOk;
+    NetTask::runAndWait([&] {
+        result = ServiceSession(login).call([&](CApiClient &client) { return logOut(client, login); });
+    });
+    if (result != ApiOk)
+        qWarning("Encountered unexpected error when onLogOff() while FramelessWindow");
+}
+
+void FramelessWindow::buildLayout() {
+    setMouseTracking(true);
+    auto *frame = new QFrame;
+    frame->setObjectName(QStringLiteral("windowFrame"));
+    frame->setCursor(Qt::ArrowCursor);
+    auto *content = new QWidget;
+    content->setObjectName(QStringLiteral("windowContent"));
+    auto *contentLayout = new QVBoxLayout(content);
+    contentLayout->setContentsMargins(0, 0, 0, 0);
+    contentLayout->addWidget(m_stack);
+    m_stack->addWidget(m_welcome);
+    auto *frameLayout = new QVBoxLayout(frame);
+    frameLayout->setContentsMargins(1, 1, 1, 1);
+    frameLayout->setSpacing(0);
+    frameLayout->addWidget(m_titleBar);
+    frameLayout->addWidget(content, 1);
+    auto *layout = new QVBoxLayout(this);
+    layout->setContentsMargins(resizeMargin, resizeMargin, resizeMargin, resizeMargin);
+    layout->addWidget(frame);
+    setMinimumSize(smallestSize);
+    resize(startSize);
+    m_titleBar->helpButton()->hide();
+    m_titleBar->accountButton()->hide();
+}
+
+void FramelessWindow::probeLocalService() {
+    const bool installed = ServiceControl::queryLocalService() != LocalServiceState::NotInstalled;
+    CLocalStore::instance().setLocalServiceInstalled(installed);
+    if (!installed)
+        m_titleBar->accountManagementAction()->setEnabled(false);
+}
+
+void FramelessWindow::connectParts() {
+    connect(qApp, &QGuiApplication::applicationStateChanged, this,
+            &FramelessWindow::on_applicationStateChanged);
+    connect(m_titleBar, &WindowDragger::doubleClicked, this,
+            &FramelessWindow::on_windowTitlebar_doubleClicked);
+    connect(m_titleBar->minimizeButton(), &QToolButton::clicked, this,
+            &FramelessWindow::on_minimizeButton_clicked);
+    connect(m_titleBar->maximizeButton(), &QToolButton::clicked, this,
+            &FramelessWindow::on_maximizeButton_clicked);
+    connect(m_titleBar->restoreButton(), &QToolButton::clicked, this,
+            &FramelessWindow::on_restoreButton_clicked);
+    connect(m_titleBar->closeButton(), &QToolButton::clicked, this, &FramelessWindow::on_closeButton_clicked);
+    connect(m_titleBar->aboutAction(), &QAction::triggered, this, &FramelessWindow::onAbout);
+    connect(m_titleBar->logOffAction(), &QAction::triggered, this, &FramelessWindow::onLogOff);
+    connect(m_startCheck, &StartCheck::accountSetupNeeded, this, &FramelessWindow::openAccountSetupDialog);
+    connect(m_startCheck, &StartCheck::loginNeeded, this, &FramelessWindow::openLoginDialog);
+    connect(m_welcome, &WelcomePage::loginRequested, this, &FramelessWindow::checkLoginDialog);
+    connect(m_idle, &IdleWatch::idle, this, &FramelessWindow::logoutIfIdle);
+    connect(&SessionEvents::instance(), &SessionEvents::sessionLost, this, &FramelessWindow::onSessionLost);
+}
+
+void FramelessWindow::setContent(MainWindow *content) {
+    m_content = content;
+    m_stack->addWidget(content);
+    connect(content->deviceWindow(), &DeviceWindow::disconnectRequested, this, &FramelessWindow::onLogOff);
+    connect(content->deviceWindow(), &DeviceWindow::remoteServerChosen, this,
+            &FramelessWindow::onRemoteServerChosen);
+}
+
+void FramelessWindow::setWindowTitle(const QString &title) {
+    QWidget::setWindowTitle(title);
+}
+
+void FramelessWindow::setWindowIcon(const QIcon &icon) {
+    QWidget::setWindowIcon(icon);
+}
+
+void FramelessWindow::topWindow() {
+    setWindowState(windowState() & ~Qt::WindowMinimized);
+    show();
+    raise();
+    activateWindow();
+}
+
+void FramelessWindow::on_applicationStateChanged(Qt::ApplicationState state) {
+    // A dialog of a minimised program may come back below its window.
+    if (state == Qt::ApplicationActive && m_dialog)
+        m_dialog->raise();
+}
+
+void FramelessWindow::on_minimizeButton_clicked() {
+    setWindowState((windowState() & ~Qt::WindowFullScreen) | Qt::WindowMinimized);
+}
+
+void FramelessWindow::on_maximizeButton_clicked() {
+    setWindowState(Qt::WindowMaximized);
+}
+
+void FramelessWindow::on_restoreButton_clicked() {
+    setWindowState(Qt::WindowNoState);
+}
+
+void FramelessWindow::on_closeButton_clicked() {
+    close();
+}
+
+void FramelessWindow::on_windowTitlebar_doubleClicked() {
+    if (isMaximized())
+        on_restoreButton_clicked();
+    else
+        on_maximizeButton_clicked();
+}
+
+void FramelessWindow::checkLoginDialog() {
+    if (!m_dialog)
+        m_startCheck->start();
+}
+
+void FramelessWindow::openLoginDialog(const QString &loginTip) {
+    if (m_loggedIn || m_dialog)
+        return;
+    auto *dialog = new LoginDialog(loginTip, this);
+    connect(dialog, &LoginDialog::loginSuccess, this, &FramelessWindow::onLoginSuccess);
+    showDialog(dialog);
+}
+
+void FramelessWindow::openAccountSetupDialog() {
+    if (m_loggedIn || m_dialog)
+        return;
+    auto *dialog = new AccountSetupDialog(this);
+    connect(dialog, &AccountSetupDialog::accountCreated, this, &FramelessWindow::onAccountCreated);
+    showDialog(dialog);
+}
+
+void FramelessWindow::showDialog(FramelessDialog *dialog) {
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    m_dialog = dialog;
+    dialog->show();
+}
+
+void FramelessWindow::onAccountCreated() {
+    if (m_dialog)
+        m_dialog->close();
+    m_dialog = nullptr;
+    openLoginDialog({});
+}
+
+void FramelessWindow::onLoginSuccess() {
+    m_loggedIn = true;
+    m_titleBar->accountButton()->show();
+    m_titleBar->helpButton()->show();
+    if (m_content) {
+        m_stack->setCurrentWidget(m_content);
+        m_content->deviceWindow()->startWork();
+    }
+    if (m_dialog)
+        m_dialog->close();
+    m_dialog = nullptr;
+    m_idle->start();
+}
+
+void FramelessWindow::onAbout() {
+    auto *dialog = new AboutDialog(this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->open();
+}
+
+void FramelessWindow::onLogOff() {
+    if (!m_loggedIn)
+        return;
+    endSession(Notice::TellService);
+    checkLoginDialog();
+}
+
+void FramelessWindow::logoutIfIdle() {
+    if (m_idle->wasActiveSinceLastTick() || !m_loggedIn)
+        return;
+    endSession(Notice::TellService);
+    openLoginDialog(tr("Session Timeout"));
+}
+
+void FramelessWindow::onSessionLost() {
+    if (!m_loggedIn)
+        return;
+    endSession(Notice::Silent);
+    openLoginDialog(tr("Session Timeout"));
+}
+
+void FramelessWindow::onRemoteServerChosen(const QString &serverId) {
+    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::SwitchServer, this);
+    confirm->setAttribute(Qt::WA_DeleteOnClose);
+    connect(confirm, &QDialog::accepted, this, [this, serverId] {
+        endSession(Notice::TellService);
+        openLoginDialog({});
+        if (auto *login = qobject_cast<LoginDialog *>(m_dialog))
+            login->chooseServer(serverId);
+    });
+    confirm->open();
+}
+
+void FramelessWindow::endSession(Notice notice) {
+    if (m_content)
+        m_content->deviceWindow()->stopWork();
+    // Dialogs of the session that is over go with it.
+    for (QDialog *dialog : findChildren<QDialog *>())
+        dialog->close();
+    if (notice == Notice::TellService)
+        tellLogOff();
+    CLocalStore::instance().clearLoginInfo();
+    m_loggedIn = false;
+    m_idle->stop();
+    m_titleBar->accountButton()->hide();
+    m_titleBar->helpButton()->hide();
+    m_stack->setCurrentWidget(m_welcome);
+    emit didLogOff();
+}
+
+void FramelessWindow::tellLogOff() {
+    // The stored session is cleared right after this, so the request takes its own copy along.
+    const LoginInfo login = CLocalStore::instance().loginInfo();
+    NetJob::post(
+        NetJob::createRunner("onLogOff() in FramelessWindow"), this,
+        [login] {
+            CApiClient client(login.address.toUtf8().constData(), login.port);
+            client.setAccount(login.account.toUtf8().constData());
+            client.setAccessToken(login.token.constData());
+            return logOut(client, login);
+        },
+        [](unsigned result) {
+            if (result != ApiOk)
+                qWarning("Encountered unexpected error when onLogOff() while FramelessWindow");
+        });
+}
+
+bool FramelessWindow::eventFilter(QObject *watched, QEvent *event) {
+    if (event->type() == QEvent::MouseButtonPress && m_loggedIn)
+        m_idle->noteActivity();
+    return QWidget::eventFilter(watched, event);
+}
+
+void FramelessWindow::changeEvent(QEvent *event) {
+    QWidget::changeEvent(event);
+    if (event->type() != QEvent::WindowStateChange)
+        return;
+    const int margin = isMaximized() || isFullScreen() ? 0 : resizeMargin;
+    layout()->setContentsMargins(margin, margin, margin, margin);
+    m_titleBar->setMaximized(isMaximized());
+    if (m_dialog)
+        QTimer::singleShot(0, m_dialog, &FramelessDialog::centreOverParent);
+}
+
+Qt::Edges FramelessWindow::edgesAt(const QPoint &position) const {
+    if (isMaximized() || isFullScreen())
+        return {};
+    Qt::Edges edges;
+    edges.setFlag(Qt::LeftEdge, position.x() < resizeMargin);
+    edges.setFlag(Qt::RightEdge, position.x() >= width() - resizeMargin);
+    edges.setFlag(Qt::TopEdge, position.y() < resizeMargin);
+    edges.setFlag(Qt::BottomEdge, position.y() >= height() - resizeMargin);
+    return edges;
+}
+
+void FramelessWindow::mousePressEvent(QMouseEvent *event) {
+    const Qt::Edges edges = edgesAt(event->position().toPoint());
+    if (event->button() == Qt::LeftButton && edges && windowHandle())
+        windowHandle()->startSystemResize(edges);
+}
+
+void FramelessWindow::mouseMoveEvent(QMouseEvent *event) {
+    const Qt::Edges edges = edgesAt(event->position().toPoint());
+    if (edges == (Qt::LeftEdge | Qt::TopEdge) || edges == (Qt::RightEdge | Qt::BottomEdge))
+        setCursor(Qt::SizeFDiagCursor);
+    else if (edges == (Qt::RightEdge | Qt::TopEdge) || edges == (Qt::LeftEdge | Qt::BottomEdge))
+        setCursor(Qt::SizeBDiagCursor);
+    else if (edges & (Qt::LeftEdge | Qt::RightEdge))
+        setCursor(Qt::SizeHorCursor);
+    else if (edges)
+        setCursor(Qt::SizeVerCursor);
+    else
+        unsetCursor();
+}

@@ -1,0 +1,87 @@
+#pragma once
+
+#include "nettask.h"
+
+#include <QPointer>
+#include <QWidget>
+
+class IdleWatch;
+class FramelessDialog;
+class LoginDialog;
+class MainWindow;
+class QStackedWidget;
+class StartCheck;
+class TitleBar;
+class WelcomePage;
+
+/// The program's outer window: title bar, account menu, and the life of the login session.
+class FramelessWindow : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit FramelessWindow(QWidget *parent = nullptr);
+    /// Ends the session on the service too, and waits for the answer for a few seconds at most.
+    ~FramelessWindow() override;
+
+    /// Takes the main window over as the frame's content.
+    void setContent(MainWindow *content);
+
+    IdleWatch *idleWatch() const { return m_idle; }
+    bool isLoggedIn() const { return m_loggedIn; }
+
+public slots:
+    void setWindowTitle(const QString &title);
+    void setWindowIcon(const QIcon &icon);
+    /// Brings the window to the front.
+    void topWindow();
+
+    void on_applicationStateChanged(Qt::ApplicationState state);
+    void on_minimizeButton_clicked();
+    void on_restoreButton_clicked();
+    void on_maximizeButton_clicked();
+    void on_closeButton_clicked();
+    void on_windowTitlebar_doubleClicked();
+
+    /// Decides what the user sees first while nobody is logged in.
+    void checkLoginDialog();
+    void openLoginDialog(const QString &loginTip);
+    void onLoginSuccess();
+    void onAccountCreated();
+    void onAbout();
+    /// Ends the session and shows the login dialog.
+    void onLogOff();
+    /// Logs off unless somebody was active since the idle timer's last tick.
+    void logoutIfIdle();
+
+signals:
+    void didLogOff();
+
+protected:
+    bool eventFilter(QObject *watched, QEvent *event) override;
+    void changeEvent(QEvent *event) override;
+    void mousePressEvent(QMouseEvent *event) override;
+    void mouseMoveEvent(QMouseEvent *event) override;
+
+private:
+    enum class Notice { TellService, Silent };
+
+    void buildLayout();
+    void connectParts();
+    void probeLocalService();
+    void endSession(Notice notice);
+    void tellLogOff();
+    void openAccountSetupDialog();
+    void onSessionLost();
+    void onRemoteServerChosen(const QString &serverId);
+    void showDialog(FramelessDialog *dialog);
+    Qt::Edges edgesAt(const QPoint &position) const;
+
+    TitleBar *m_titleBar;
+    QStackedWidget *m_stack;
+    WelcomePage *m_welcome;
+    MainWindow *m_content = nullptr;
+    QPointer<FramelessDialog> m_dialog; ///< the login or account set-up dialog that is shown
+    StartCheck *m_startCheck;
+    IdleWatch *m_idle;
+    bool m_loggedIn = false;
+};

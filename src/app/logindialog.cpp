@@ -1,0 +1,241 @@
+#include "logindialog.h"
+
+#include "apiclient.h"
+#include "clientstore.h"
+#include "configstore.h"
+#include "localstore.h"
+#include "messagelog.h"
+#include "netjob.h"
+#include "remoteconnectiondialog.h"
+#include "ui_logindialog.h"
+
+#include <QDebug>
+#include <QLineEdit>
+
+#include <nlohmann/json.hpp>
+
+/// What the fields say; everything after reading them happens on the runner.
+struct LoginDialog::Credentials {
+    bool thisComputer = false;
+    QString serverText;
+    ServerAddress server;
+    QString account;
+    QString password;
+};
+
+struct LoginDialog::Outcome {
+    unsigned result = ApiException;
+    QString address;
+    quint32 port = 0;
+    QString account;
+    QByteArray token; ///< in cipher form
+};
+
+namespace {
+
+std::unique_ptr<Ui::LoginDialog> madeUi(QWidget *content) {
+    auto ui = std::make_unique<Ui::LoginDialog>();
+    ui->setupUi(content);
+    return ui;
+}
+
+QString text(const JSON &object, const char *name) {
+    const auto member = object.find(name);
+    return member != object.end() && member->is_string() ? QString::fromStdString(member->get<std::string>())
+                                                         : QString();
+}
+
+} // namespace
+
+LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
+    : FramelessDialog(parent),
+      m_ui(madeUi(content())),
+      m_tip(m_ui->msgWarningIcon, m_ui->tipLabel),
+      m_runner(new NetTask),
+      m_servers(std::make_unique<JSON>(JSON::array())) {
+    setObjectName(QStringLiteral("LoginDialog"));
+    setWindowTitle(tr("Login"));
+    m_ui->remoteComboBox->lineEdit()->setPlaceholderText(tr("IP:Port/Domain Name"));
+    // The style's own check for a completion would replace what the user types.
+    m_ui->remoteComboBox->setCompleter(nullptr);
+    connect(m_ui->loginButton, &QPushButton::clicked, this, &LoginDialog::on_loginButton_clicked);
+    connect(m_ui->remoteComboBox, &QComboBox::currentIndexChanged, this,
+            &LoginDialog::on_remoteComboBox_currentIndexChanged);
+    connect(m_ui->localRadio, &QRadioButton::toggled, this, &LoginDialog::showChosenFields);
+    connect(m_ui->manageServersButton, &QToolButton::clicked, this, &LoginDialog::manageServers);
+    connect(this, &LoginDialog::loginFail, this, [this](const QString &reason) { m_tip.setText(reason); });
+    onUpdateSvr();
+    offerKnownAccounts();
+    m_tip.setText(tip);
+}
+
+LoginDialog::~LoginDialog() = default;
+
+void LoginDialog::offerKnownAccounts() {
+    const CClientStore &store = CClientStore::instance();
+    const AccountInfo local = store.thisComputerAccount();
+    m_ui->localEmailEdit->setText(local.email);
+    m_ui->localPassEdit->setText(local.password);
+    const AccountInfo remote = store.remoteComputerAccount();
+    if (!remote.server.isEmpty()) {
+        m_ui->remoteComboBox->setEditText(remote.server);
+        m_ui->remoteEmailEdit->setText(remote.email);
+        m_ui->remotePassEdit->setText(remote.password);
+    }
+    const bool installed = CLocalStore::instance().isLocalServiceInstalled();
+    const bool remoteBefore = !store.isThisComputer() && !remote.server.isEmpty();
+    m_ui->localRadio->setEnabled(installed);
+    (installed && !remoteBefore ? m_ui->localRadio : m_ui->remoteRadio)->setChecked(true);
+    showChosenFields();
+}
+
+void LoginDialog::showChosenFields() {
+    const bool local = m_ui->localRadio->isChecked();
+    m_ui->localFields->setVisible(local);
+    m_ui->remoteFields->setVisible(!local);
+    QLineEdit *email = local ? m_ui->localEmailEdit : m_ui->remoteEmailEdit;
+    QLineEdit *password = local ? m_ui->localPassEdit : m_ui->remotePassEdit;
+    if (!local && m_ui->remoteComboBox->currentText().isEmpty())
+        m_ui->remoteComboBox->setFocus();
+    else
+        (email->text().isEmpty() ? email : password)->setFocus();
+    adjustSize();
+}
+
+void LoginDialog::chooseServer(const QString &serverId) {
+    m_ui->remoteRadio->setChecked(true);
+    for (std::size_t i = 0; i < m_servers->size(); ++i) {
+        if (text((*m_servers)[i], "id") == serverId)
+            m_ui->remoteComboBox->setCurrentIndex(static_cast<int>(i));
+    }
+    showChosenFields();
+}
+
+void LoginDialog::on_loginButton_clicked() {
+    Credentials credentials;
+    credentials.thisComputer = m_ui->localRadio->isChecked();
+    credentials.account =
+        (credentials.thisComputer ? m_ui->localEmailEdit : m_ui->remoteEmailEdit)->text().trimmed();
+    credentials.password = (credentials.thisComputer ? m_ui->localPassEdit : m_ui->remotePassEdit)->text();
+    if (credentials.account.isEmpty() || credentials.password.isEmpty()) {
+        m_tip.setText(tr("The field can't be empty."));
+        return;
+    }
+    if (!credentials.thisComputer) {
+        credentials.serverText = m_ui->remoteComboBox->currentText().trimmed();
+        const std::optional<ServerAddress> server = ServerAddress::parse(credentials.serverText);
+        if (!server) {
+            m_tip.setText(
+                credentials.serverText.isEmpty()
+                    ? tr("The field can't be empty.")
+                    : tr("Enter the server as an address or a name, with a port from 1 to 65535 behind a "
+                         "colon where it is not %1.")
+                          .arg(ServerAddress::defaultPort));
+            return;
+        }
+        credentials.server = *server;
+        qDebug("parse ip: %s, port: %d", qUtf8Printable(server->host), server->port);
+    }
+    startLogin(credentials);
+}
+
+void LoginDialog::startLogin(const Credentials &credentials) {
+    // Looked up before the job takes its turn: a slow name server must not hold up other requests.
+    auto address = std::make_shared<QString>(QStringLiteral("127.0.0.1"));
+    NetTask::Preparation lookUp;
+    if (!credentials.thisComputer)
+        lookUp = [address, server = credentials.server] { *address = server.resolved(); };
+    const bool started = NetJob::post(
+        m_runner.get(), this, [credentials, address] { return logIn(credentials, *address); },
+        [this](const Outcome &outcome) { onOutcome(outcome); },
+        [this](JobEnd end) {
+            setBusy(false);
+            if (end != JobEnd::Delivered)
+                emit loginFail(tr("The login could not be carried out. Try again."));
+        },
+        lookUp);
+    if (!started)
+        return;
+    m_tip.setText({});
+    setBusy(true);
+}
+
+LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QString &address) {
+    Outcome outcome{ApiException, address, credentials.server.port, credentials.account, {}};
+    if (credentials.thisComputer) {
+        outcome.port = CConfigStore().serverPort();
+        qDebug("get local server port: %d", static_cast<int>(outcome.port));
+        qDebug("login local server! acc: %s, pass: %s", qUtf8Printable(credentials.account),
+               MessageLog::secret(credentials.password).constData());
+    } else {
+        qDebug("login remote server: %s:%d! acc: %s, pass: %s", qUtf8Printable(address),
+               static_cast<int>(outcome.port), qUtf8Printable(credentials.account),
+               MessageLog::secret(credentials.password).constData());
+    }
+    CApiClient client(address.toUtf8().constData(), outcome.port);
+    outcome.result = client.loginServer(credentials.account.toUtf8().constData(),
+                                        credentials.password.toUtf8().constData());
+    if (outcome.result != ApiOk || client.accessToken().empty())
+        return outcome;
+    outcome.token = CLocalStore::instance().access();
+    CClientStore &store = CClientStore::instance();
+    store.setThisComputer(credentials.thisComputer);
+    const AccountInfo account{credentials.serverText, credentials.account,
+                              store.isLoginRememberMe() ? credentials.password : QString()};
+    if (credentials.thisComputer)
+        store.setThisComputerAccount(account);
+    else
+        store.setRemoteComputerAccount(account);
+    return outcome;
+}
+
+void LoginDialog::onOutcome(const Outcome &outcome) {
+    if (outcome.result == ApiOk && outcome.token.isEmpty()) {
+        emit loginFail(tr("The server did not open a session. Try again."));
+        return;
+    }
+    if (outcome.result != ApiOk) {
+        qDebug("login failed! res: %d", static_cast<int>(outcome.result));
+        emit loginFail(outcome.result == ApiCode108 ? tr("Server full.")
+                                                    : tr("Incorrect email or password. Try again."));
+        return;
+    }
+    CLocalStore::instance().setLoginInfo(outcome.address, outcome.port, outcome.account, outcome.token);
+    qDebug("login successfully! ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(outcome.address),
+           static_cast<int>(outcome.port), qUtf8Printable(outcome.account),
+           MessageLog::secret(outcome.token).constData());
+    emit loginSuccess();
+}
+
+void LoginDialog::setBusy(bool busy) {
+    m_ui->loginButton->setEnabled(!busy);
+    m_ui->loginButton->setText(busy ? tr("Logging in...") : tr("Log in"));
+}
+
+void LoginDialog::onUpdateSvr() {
+    const QString typed = m_ui->remoteComboBox->currentText();
+    CClientStore::instance().loadServerList(*m_servers);
+    const QSignalBlocker blocker(m_ui->remoteComboBox);
+    m_ui->remoteComboBox->clear();
+    for (const JSON &server : *m_servers)
+        m_ui->remoteComboBox->addItem(text(server, "info"));
+    m_ui->remoteComboBox->setCurrentIndex(-1);
+    m_ui->remoteComboBox->setEditText(typed);
+}
+
+void LoginDialog::on_remoteComboBox_currentIndexChanged(int index) {
+    qDebug("LoginDialog::on_remoteComboBox_currentIndexChanged");
+    if (index < 0 || static_cast<std::size_t>(index) >= m_servers->size())
+        return;
+    const JSON &server = (*m_servers)[static_cast<std::size_t>(index)];
+    m_ui->remoteEmailEdit->setText(text(server, "acc"));
+    m_ui->remotePassEdit->setText(text(server, "remember") == QLatin1String("YES") ? text(server, "pass")
+                                                                                   : QString());
+}
+
+void LoginDialog::manageServers() {
+    auto *dialog = new RemoteConnectionDialog(this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    connect(dialog, &RemoteConnectionDialog::updateSvr, this, &LoginDialog::onUpdateSvr);
+    dialog->open();
+}

@@ -1,0 +1,55 @@
+#pragma once
+
+#include "framelessdialog.h"
+#include "json.h"
+#include "nettask.h"
+#include "serveraddress.h"
+#include "warningline.h"
+
+#include <memory>
+
+namespace Ui {
+class LoginDialog;
+}
+
+/// Logs in to the service on this computer or on a remote server.
+class LoginDialog : public FramelessDialog {
+    Q_OBJECT
+
+public:
+    /// tip: what to tell first, or empty.
+    explicit LoginDialog(const QString &tip, QWidget *parent = nullptr);
+    ~LoginDialog() override;
+
+    /// Chooses a server of the saved list.
+    void chooseServer(const QString &serverId);
+
+signals:
+    /// The session is in the local store.
+    void loginSuccess();
+    void loginFail(const QString &reason);
+
+public slots:
+    void on_loginButton_clicked();
+    void on_remoteComboBox_currentIndexChanged(int index);
+    /// The saved list has changed.
+    void onUpdateSvr();
+
+private:
+    struct Credentials;
+    struct Outcome;
+
+    void offerKnownAccounts();
+    void showChosenFields();
+    void startLogin(const Credentials &credentials);
+    void onOutcome(const Outcome &outcome);
+    void setBusy(bool busy);
+    void manageServers();
+
+    static Outcome logIn(const Credentials &credentials, const QString &address);
+
+    std::unique_ptr<Ui::LoginDialog> m_ui;
+    WarningLine m_tip;
+    NetTask::Owner m_runner;
+    std::unique_ptr<JSON> m_servers;
+};

@@ -1,0 +1,180 @@
+#include "remoteconnectiondialog.h"
+
+#include "clientstore.h"
+#include "messagelog.h"
+#include "plaintext.h"
+#include "serverdialog.h"
+#include "ui_remoteconnectiondialog.h"
+
+#include <QDateTime>
+#include <QDebug>
+#include <QHeaderView>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+std::unique_ptr<Ui::RemoteConnectionDialog> madeUi(QWidget *content) {
+    auto ui = std::make_unique<Ui::RemoteConnectionDialog>();
+    ui->setupUi(content);
+    return ui;
+}
+
+QString text(const JSON &server, const char *name) {
+    return QString::fromStdString(server.value(name, std::string()));
+}
+
+/// The list as a log line carries it.
+QByteArray logText(JSON servers) {
+    for (JSON &server : servers)
+        server["pass"] = MessageLog::secret(server.value("pass", std::string())).toStdString();
+    return QByteArray::fromStdString(dumpJson(servers));
+}
+
+JSON record(const QString &id, const QString &remember, const QString &name, const QString &info,
+            const QString &email, const QString &password) {
+    return {{"id", id.toStdString()},         {"svrname", name.toStdString()},
+            {"info", info.toStdString()},     {"acc", email.toStdString()},
+            {"pass", password.toStdString()}, {"remember", remember.toStdString()}};
+}
+
+QTableWidgetItem *cell(const QString &value) {
+    auto *item = new QTableWidgetItem(value);
+    item->setToolTip(PlainText::toolTip(value));
+    return item;
+}
+
+} // namespace
+
+RemoteConnectionDialog::RemoteConnectionDialog(QWidget *parent)
+    : FramelessDialog(parent),
+      m_ui(madeUi(content())),
+      m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
+      m_servers(std::make_unique<JSON>(JSON::array())) {
+    setObjectName(QStringLiteral("RemoteConnectionDialog"));
+    setWindowTitle(tr("Remote Connection"));
+    m_ui->tableWidget->setColumnCount(2);
+    m_ui->tableWidget->setHorizontalHeaderLabels({tr("Server Name"), tr("Server Information")});
+    m_ui->tableWidget->setSelectionMode(QAbstractItemView::SingleSelection);
+    m_ui->tableWidget->setColumnWidth(0, 240);
+    connect(m_ui->remoteSearchEdit, &QLineEdit::textChanged, this, &RemoteConnectionDialog::filterRows);
+    connect(m_ui->tableWidget, &QTableWidget::itemSelectionChanged, this,
+            &RemoteConnectionDialog::updateButtons);
+    connect(m_ui->tableWidget, &QTableWidget::cellDoubleClicked, this,
+            &RemoteConnectionDialog::openEditDialog);
+    connect(m_ui->addButton, &QPushButton::clicked, this, &RemoteConnectionDialog::openAddDialog);
+    connect(m_ui->editButton, &QPushButton::clicked, this, &RemoteConnectionDialog::openEditDialog);
+    connect(m_ui->deleteButton, &QPushButton::clicked, this, &RemoteConnectionDialog::deleteSelected);
+    connect(m_ui->saveButton, &QPushButton::clicked, this, &RemoteConnectionDialog::save);
+    connect(m_ui->cancelButton, &QPushButton::clicked, this, &QDialog::reject);
+    load();
+}
+
+RemoteConnectionDialog::~RemoteConnectionDialog() = default;
+
+void RemoteConnectionDialog::load() {
+    if (CClientStore::instance().loadServerList(*m_servers) != 0)
+        m_warning.setText(tr("The saved servers could not be read."));
+    qDebug("list server: %s, size: %d", logText(*m_servers).constData(), static_cast<int>(m_servers->size()));
+    fillTable();
+}
+
+void RemoteConnectionDialog::fillTable() {
+    m_ui->tableWidget->setRowCount(static_cast<int>(m_servers->size()));
+    int row = 0;
+    for (const JSON &server : *m_servers) {
+        qDebug("server name: %s, information: %s", qUtf8Printable(text(server, "svrname")),
+               qUtf8Printable(text(server, "info")));
+        m_ui->tableWidget->setItem(row, 0, cell(text(server, "svrname")));
+        m_ui->tableWidget->setItem(row, 1, cell(text(server, "info")));
+        ++row;
+    }
+    filterRows();
+    updateButtons();
+}
+
+void RemoteConnectionDialog::filterRows() {
+    const QString wanted = m_ui->remoteSearchEdit->text().trimmed();
+    for (int row = 0; row < m_ui->tableWidget->rowCount(); ++row) {
+        const JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
+        const bool matches = text(server, "svrname").contains(wanted, Qt::CaseInsensitive) ||
+                             text(server, "info").contains(wanted, Qt::CaseInsensitive);
+        m_ui->tableWidget->setRowHidden(row, !matches);
+    }
+}
+
+int RemoteConnectionDialog::selectedRow() const {
+    const QList<QTableWidgetItem *> items = m_ui->tableWidget->selectedItems();
+    return items.isEmpty() || m_ui->tableWidget->isRowHidden(items.first()->row()) ? -1
+                                                                                   : items.first()->row();
+}
+
+void RemoteConnectionDialog::updateButtons() {
+    const bool selected = selectedRow() >= 0;
+    m_ui->editButton->setEnabled(selected);
+    m_ui->deleteButton->setEnabled(selected);
+}
+
+void RemoteConnectionDialog::openAddDialog() {
+    auto *dialog = new AddServerDialog(this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    connect(dialog, &AddServerDialog::addServer, this, &RemoteConnectionDialog::onAddServer);
+    dialog->open();
+}
+
+void RemoteConnectionDialog::openEditDialog() {
+    const int row = selectedRow();
+    if (row < 0)
+        return;
+    const JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
+    auto *dialog =
+        new EditServerDialog(text(server, "remember"), text(server, "svrname"), text(server, "info"),
+                             text(server, "acc"), text(server, "pass"), this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    connect(dialog, &EditServerDialog::editServer, this, &RemoteConnectionDialog::onEditServer);
+    dialog->open();
+}
+
+void RemoteConnectionDialog::onAddServer(const QString &remember, const QString &name, const QString &info,
+                                         const QString &email, const QString &password) {
+    qDebug("add server remember: %s, name: %s, info: %s, email: %s, password: %s", qUtf8Printable(remember),
+           qUtf8Printable(name), qUtf8Printable(info), qUtf8Printable(email),
+           MessageLog::secret(password).constData());
+    const QString id = QStringLiteral("SVR%1").arg(QDateTime::currentMSecsSinceEpoch());
+    m_servers->push_back(record(id, remember, name, info, email, password));
+    fillTable();
+    m_ui->tableWidget->selectRow(m_ui->tableWidget->rowCount() - 1);
+}
+
+void RemoteConnectionDialog::onEditServer(const QString &remember, const QString &name, const QString &info,
+                                          const QString &email, const QString &password) {
+    qDebug("edit server remember: %s, name: %s, info: %s, email: %s, password: %s", qUtf8Printable(remember),
+           qUtf8Printable(name), qUtf8Printable(info), qUtf8Printable(email),
+           MessageLog::secret(password).constData());
+    const int row = selectedRow();
+    if (row < 0)
+        return;
+    JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
+    server = record(text(server, "id"), remember, name, info, email, password);
+    fillTable();
+    m_ui->tableWidget->selectRow(row);
+}
+
+void RemoteConnectionDialog::deleteSelected() {
+    const int row = selectedRow();
+    if (row < 0)
+        return;
+    m_servers->erase(static_cast<std::size_t>(row));
+    m_ui->tableWidget->clearSelection();
+    fillTable();
+}
+
+void RemoteConnectionDialog::save() {
+    if (!CClientStore::instance().saveServerList(*m_servers)) {
+        m_warning.setText(tr("The list could not be saved; the saved one is as it was."));
+        return;
+    }
+    qDebug("save server list [%s] to database!", logText(*m_servers).constData());
+    emit updateSvr();
+    accept();
+}

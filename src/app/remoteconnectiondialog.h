@@ -1,0 +1,45 @@
+#pragma once
+
+#include "framelessdialog.h"
+#include "json.h"
+#include "warningline.h"
+
+#include <memory>
+
+namespace Ui {
+class RemoteConnectionDialog;
+}
+
+/// The saved list of remote servers. Edits are kept in the dialog until "Save" writes the whole list.
+class RemoteConnectionDialog : public FramelessDialog {
+    Q_OBJECT
+
+public:
+    explicit RemoteConnectionDialog(QWidget *parent = nullptr);
+    ~RemoteConnectionDialog() override;
+
+signals:
+    /// The list was saved.
+    void updateSvr();
+
+public slots:
+    void onAddServer(const QString &remember, const QString &name, const QString &info, const QString &email,
+                     const QString &password);
+    void onEditServer(const QString &remember, const QString &name, const QString &info, const QString &email,
+                      const QString &password);
+
+private:
+    void load();
+    void fillTable();
+    void filterRows();
+    void updateButtons();
+    void openAddDialog();
+    void openEditDialog();
+    void deleteSelected();
+    void save();
+    int selectedRow() const;
+
+    std::unique_ptr<Ui::RemoteConnectionDialog> m_ui;
+    WarningLine m_warning;
+    std::unique_ptr<JSON> m_servers;
+};

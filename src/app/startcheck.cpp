@@ -1,0 +1,70 @@
+#include "startcheck.h"
+
+#include "apilocalclient.h"
+#include "configstore.h"
+#include "localstore.h"
+#include "netjob.h"
+
+#include <QDebug>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+enum class LocalService { Silent, Fresh, HasAccounts };
+
+/// True for the one account that a service comes with.
+bool isFactoryAccount(const JSON &members) {
+    const auto list = members.is_object() ? members.find("data") : members.end();
+    if (list == members.end() || !list->is_array() || list->size() != 1 || !list->front().is_object())
+        return false;
+    const auto email = list->front().find("email");
+    return email != list->front().end() && email->is_string() && (*email == "" || *email == "admin");
+}
+
+LocalService askLocalService() {
+    const quint32 port = CConfigStore().serverPort();
+    qDebug("get local server port: %d", static_cast<int>(port));
+    std::uint32_t online = 0;
+    CApiLocalClient(port).isServerOnline(online);
+    if (!online) {
+        qDebug("HTTP API(isServerOnline) failed!");
+        return LocalService::Silent;
+    }
+    qDebug("Local server online!");
+    JSON members;
+    if (CApiLocalClient(port).memberList(0, 10, members) != ApiOk)
+        qDebug("HTTP API(memberList) failed!");
+    const auto list = members.is_object() ? members.find("data") : members.end();
+    const std::size_t size = list != members.end() && list->is_array() ? list->size() : 0;
+    qDebug("member list: %s, size: %d", dumpJson(members).c_str(), static_cast<int>(size));
+    return isFactoryAccount(members) ? LocalService::Fresh : LocalService::HasAccounts;
+}
+
+} // namespace
+
+StartCheck::StartCheck(QObject *parent) : QObject(parent), m_runner(new NetTask) {}
+
+void StartCheck::start() {
+    if (!CLocalStore::instance().isLocalServiceInstalled()) {
+        emit loginNeeded(
+            tr("Norvell Device Manager Service Control is not installed on this computer. Please "
+               "connect to a remote server."));
+        return;
+    }
+    const QString silent =
+        tr("Norvell Device Manager Service Control is not running on this computer. Please "
+           "check the status of local server or connect to a remote server.");
+    NetJob::post(
+        m_runner.get(), this, askLocalService,
+        [this, silent](LocalService service) {
+            if (service == LocalService::Fresh)
+                emit accountSetupNeeded();
+            else
+                emit loginNeeded(service == LocalService::Silent ? silent : QString());
+        },
+        [this, silent](JobEnd end) {
+            if (end != JobEnd::Delivered)
+                emit loginNeeded(silent);
+        });
+}
