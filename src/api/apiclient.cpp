@@ -9,7 +9,9 @@
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
+#include <cctype>
 #include <iostream>
+#include <limits>
 #include <stdexcept>
 
 namespace {
@@ -39,6 +41,15 @@ unsigned judgeUsualCode(int code) {
     default:
         return ApiServerError;
     }
+}
+
+/// Only a whole number is a code: a plain conversion would make success of false, 0.5 and 2^32.
+int codeOf(const JSON &body) {
+    const JSON &code = body.at("code");
+    if (!code.is_number_integer())
+        throw std::runtime_error("code is no integer");
+    constexpr std::int64_t limit = std::numeric_limits<int>::max();
+    return static_cast<int>(std::clamp(code.get<std::int64_t>(), -limit, limit));
 }
 
 JSON decipher(const JSON &data) {
@@ -122,7 +133,7 @@ unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, JSON *out
     if (answer.status != 200)
         return ApiHttpStatusError;
     const JSON body = parseJson(answer.body);
-    const unsigned result = (call.judgeCode ? call.judgeCode : judgeUsualCode)(body.at("code").get<int>());
+    const unsigned result = (call.judgeCode ? call.judgeCode : judgeUsualCode)(codeOf(body));
     if (result != ApiOk)
         return result;
     if (!answer.authorization.empty())

@@ -24,11 +24,10 @@ std::vector<NetTask *> &runners() {
 } // namespace
 
 void NetTask::LetGo::operator()(NetTask *runner) const {
-    if (!runner->isRunning()) {
-        delete runner;
-        return;
-    }
+    // Connected first: a runner that finishes in between would tell nobody and stay for ever.
     QObject::connect(runner, &QThread::finished, runner, &QObject::deleteLater);
+    if (!runner->isRunning())
+        delete runner;
 }
 
 NetTask::NetTask(QObject *parent) : QThread(parent) {

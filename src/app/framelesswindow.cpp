@@ -75,10 +75,10 @@ FramelessWindow::~FramelessWindow() {
 
 void FramelessWindow::buildLayout() {
     setMouseTracking(true);
-    auto *frame = new QFrame;
+    auto *frame = new QFrame(this);
     frame->setObjectName(QStringLiteral("windowFrame"));
     frame->setCursor(Qt::ArrowCursor);
-    auto *content = new QWidget;
+    auto *content = new QWidget(frame);
     content->setObjectName(QStringLiteral("windowContent"));
     auto *contentLayout = new QVBoxLayout(content);
     contentLayout->setContentsMargins(0, 0, 0, 0);

@@ -17,27 +17,32 @@ namespace {
 constexpr int railWidth = 56;
 constexpr QSize pictureSize{20, 20};
 constexpr QSize railButtonSize{44, 44};
-} // namespace
 
-MainWindow::MainWindow(QWidget *parent)
-    : QMainWindow(parent),
-      m_deviceWindow(new DeviceWindow),
-      m_pages(new QStackedWidget),
-      m_navigation(new QButtonGroup(this)) {
-    qDebug("MainWindow constructor");
-    setObjectName(QStringLiteral("MainWindow"));
-    // It lives inside the frame, so it is no window of its own.
-    setWindowFlags(Qt::Widget);
-    m_pages->setObjectName(QStringLiteral("pageStack"));
-    m_pages->addWidget(m_deviceWindow);
-    auto *central = new QWidget;
+/// Made before its children: a tree of widgets that moves to another parent is styled all over again.
+QWidget *makeCentral(QMainWindow *window) {
+    auto *central = new QWidget(window);
     central->setAttribute(Qt::WA_TranslucentBackground);
     auto *layout = new QHBoxLayout(central);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
+    window->setCentralWidget(central);
+    return central;
+}
+
+} // namespace
+
+MainWindow::MainWindow(QWidget *parent)
+    : QMainWindow(parent),
+      m_pages(new QStackedWidget(makeCentral(this))),
+      m_deviceWindow(new DeviceWindow(m_pages)),
+      m_navigation(new QButtonGroup(this)) {
+    qDebug("MainWindow constructor");
+    setObjectName(QStringLiteral("MainWindow"));
+    m_pages->setObjectName(QStringLiteral("pageStack"));
+    m_pages->addWidget(m_deviceWindow);
+    auto *layout = static_cast<QHBoxLayout *>(centralWidget()->layout());
     layout->addWidget(buildRail());
     layout->addWidget(m_pages, 1);
-    setCentralWidget(central);
 }
 
 MainWindow::~MainWindow() {
@@ -45,7 +50,7 @@ MainWindow::~MainWindow() {
 }
 
 QWidget *MainWindow::buildRail() {
-    auto *rail = new QFrame;
+    auto *rail = new QFrame(centralWidget());
     rail->setObjectName(QStringLiteral("navigationRail"));
     rail->setFixedWidth(railWidth);
     auto *layout = new QVBoxLayout(rail);

@@ -24,7 +24,7 @@ private:
     QWidget *buildRail();
     QToolButton *addRailButton(QWidget *rail, const char *name, const QString &icon, const QString &text);
 
-    DeviceWindow *m_deviceWindow;
     QStackedWidget *m_pages;
+    DeviceWindow *m_deviceWindow;
     QButtonGroup *m_navigation;
 };

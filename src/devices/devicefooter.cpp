@@ -53,11 +53,12 @@ void DeviceFooter::setSelection(int selected, int shown) {
     m_selection->setText(tr("%1 of %n devices selected", nullptr, shown).arg(locale.toString(selected)));
 }
 
-void DeviceFooter::setStatuses(const std::vector<DeviceStatusCode> &statuses) {
+void DeviceFooter::setStatuses(const DeviceInventory &inventory, const std::vector<int> &shown) {
     int authorized = 0;
     int unreachable = 0;
     int attention = 0;
-    for (const DeviceStatusCode status : statuses) {
+    for (const int device : shown) {
+        const DeviceStatusCode status = inventory.status(device);
         if (status == DeviceStatusCode::Authorized || status == DeviceStatusCode::Maintaining)
             ++authorized;
         else if (status == DeviceStatusCode::Unreachable)

@@ -16,7 +16,8 @@ public:
     explicit DeviceFooter(QWidget *parent = nullptr);
 
     void setSelection(int selected, int shown);
-    void setStatuses(const std::vector<DeviceStatusCode> &statuses);
+    /// Counts the states of those devices of the inventory that are shown.
+    void setStatuses(const DeviceInventory &inventory, const std::vector<int> &shown);
     /// The states were read just now.
     void markUpdated();
     /// Nothing is known; the age is not told.

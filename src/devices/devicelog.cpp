@@ -46,15 +46,15 @@ void tablesFilled(const DeviceSnapshotPtr &snapshot, const DeviceSnapshotPtr &pr
 
 void selectionChanged(std::vector<DeviceRecordPtr> devices) {
     pool().start([devices = std::move(devices)] {
-        std::string records = "[";
-        std::string ids = "[";
+        QByteArray records = "[";
+        QByteArray ids = "[";
         for (const DeviceRecordPtr &device : devices) {
             const char *separator = records.size() > 1 ? "," : "";
-            records += separator + device->json;
-            ids += separator + ('"' + device->id.toStdString() + '"');
+            records.append(separator).append(device->json.c_str());
+            ids.append(separator).append('"').append(device->id.toUtf8()).append('"');
         }
-        qDebug("selected devices dump string: %s]", records.c_str());
-        qDebug("selected devicesId dump string: %s]", ids.c_str());
+        qDebug("selected devices dump string: %s]", records.constData());
+        qDebug("selected devicesId dump string: %s]", ids.constData());
     });
 }
 

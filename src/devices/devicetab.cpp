@@ -29,7 +29,8 @@ QLabel *picture(const QString &resource) {
 
 DeviceTab::DeviceTab(DeviceClass deviceClass, const DeviceInventory *inventory, QWidget *parent)
     : QStackedWidget(parent),
-      m_table(new MainConsoleTable(deviceClass)),
+      m_table(new MainConsoleTable(deviceClass, this)),
+      m_siteHint(centredLabel(tr("Drag devices from the \"Device Overview\""), "quiet")),
       m_emptyPage(makeEmptyPage()),
       m_loadingPage(makeLoadingPage()),
       m_failedPage(makeFailedPage()) {
@@ -56,7 +57,6 @@ QWidget *DeviceTab::makeEmptyPage() {
     add->setObjectName(QStringLiteral("emptyAddDeviceButton"));
     add->setEnabled(false);
     connect(add, &QPushButton::clicked, this, &DeviceTab::addDeviceRequested);
-    m_siteHint = centredLabel(tr("Drag devices from the \"Device Overview\""), "quiet");
     m_siteHint->setObjectName(QStringLiteral("siteHintLabel"));
     auto *layout = new QVBoxLayout(page);
     layout->setSpacing(12);

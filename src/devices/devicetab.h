@@ -36,8 +36,8 @@ private:
     QWidget *makeFailedPage();
 
     MainConsoleTable *m_table;
+    QLabel *m_siteHint;
     QWidget *m_emptyPage;
     QWidget *m_loadingPage;
     QWidget *m_failedPage;
-    QLabel *m_siteHint = nullptr;
 };

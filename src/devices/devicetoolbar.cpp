@@ -14,7 +14,8 @@
 namespace {
 
 constexpr QSize pictureSize{18, 18};
-constexpr int buttonWidth = 63;
+constexpr int narrowestButton = 54;
+constexpr int buttonPadding = 6;
 constexpr int buttonHeight = 58;
 constexpr int textHeight = 28;
 
@@ -23,8 +24,13 @@ class OperationButton : public QToolButton {
 public:
     using QToolButton::QToolButton;
 
-    QSize sizeHint() const override { return {buttonWidth, buttonHeight}; }
-    QSize minimumSizeHint() const override { return {48, buttonHeight}; }
+    QSize sizeHint() const override {
+        int width = narrowestButton;
+        for (const QString &word : text().split(QLatin1Char(' ')))
+            width = std::max(width, fontMetrics().horizontalAdvance(word) + 2 * buttonPadding);
+        return {width, buttonHeight};
+    }
+    QSize minimumSizeHint() const override { return sizeHint(); }
 
 protected:
     void paintEvent(QPaintEvent *) override {

@@ -1,6 +1,7 @@
 #include "devicewindow.h"
 
 #include "clientstore.h"
+#include "countedtabwidget.h"
 #include "devicefooter.h"
 #include "devicelog.h"
 #include "devicemonitor.h"
@@ -18,11 +19,8 @@
 #include <QDebug>
 #include <QHBoxLayout>
 #include <QLabel>
-#include <QLocale>
 #include <QPushButton>
 #include <QSplitter>
-#include <QTabBar>
-#include <QTabWidget>
 #include <QTimer>
 #include <QToolButton>
 #include <QVBoxLayout>
@@ -48,11 +46,13 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_monitor(std::make_unique<DeviceMonitor>(m_inventory)),
       m_netTask(new (std::nothrow) NetTask),
       m_refreshTask(new (std::nothrow) NetTask),
-      m_siteTree(new SiteTree),
-      m_toolBar(new DeviceToolBar),
-      m_remoteCombo(new QComboBox),
-      m_tabs(new QTabWidget),
-      m_footer(new DeviceFooter),
+      m_splitter(new QSplitter(this)),
+      m_console(new QWidget(m_splitter)),
+      m_siteTree(new SiteTree(m_splitter)),
+      m_toolBar(new DeviceToolBar(m_console)),
+      m_remoteCombo(new QComboBox(m_console)),
+      m_tabs(new CountedTabWidget(m_console)),
+      m_footer(new DeviceFooter(m_console)),
       m_selectionLogDelay(new QTimer(this)) {
     qDebug("DeviceWindow constructor");
     setObjectName(QStringLiteral("DeviceWindow"));
@@ -73,21 +73,14 @@ DeviceWindow::~DeviceWindow() {
 
 void DeviceWindow::buildTabs() {
     m_tabs->setObjectName(QStringLiteral("deviceTabs"));
-    m_tabs->setDocumentMode(true);
-    m_tabs->tabBar()->setExpanding(false);
     const std::pair<QString, const char *> tabs[] = {
         {tr("Camera"), "cameraTable"}, {tr("NVR"), "nvrTable"}, {tr("Others"), "othersTable"}};
     for (int i = 0; i < deviceClassCount; ++i) {
-        auto *tab = new DeviceTab(static_cast<DeviceClass>(i), &m_inventory);
+        auto *tab = new DeviceTab(static_cast<DeviceClass>(i), &m_inventory, m_tabs);
         tab->table()->setObjectName(QLatin1String(tabs[i].second));
         tab->table()->setAccessibleName(tabs[i].first);
         m_tabs->addTab(tab, tabs[i].first);
         m_deviceTabs.push_back(tab);
-        // The count stands beside the tab's name, so that the name stays what it is.
-        auto *count = new QLabel;
-        count->setProperty("role", QStringLiteral("quiet"));
-        m_tabs->tabBar()->setTabButton(i, QTabBar::RightSide, count);
-        m_tabCounts.push_back(count);
     }
     m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
     m_remoteCombo->setAccessibleName(tr("Remote connection"));
@@ -101,7 +94,7 @@ void DeviceWindow::buildTabs() {
 }
 
 QWidget *DeviceWindow::buildNoticeBar() {
-    m_noticeBar = new QFrame;
+    m_noticeBar = new QFrame(m_console);
     m_noticeBar->setObjectName(QStringLiteral("noticeBar"));
     auto *icon = new QLabel;
     icon->setPixmap(Icons::pixmap(QStringLiteral(":images/icon_general_tip_solid_blue.svg"), {16, 16}, 2.0));
@@ -119,8 +112,7 @@ QWidget *DeviceWindow::buildNoticeBar() {
 }
 
 void DeviceWindow::buildLayout() {
-    auto *console = new QWidget;
-    auto *consoleLayout = new QVBoxLayout(console);
+    auto *consoleLayout = new QVBoxLayout(m_console);
     consoleLayout->setContentsMargins(14, 10, 14, 0);
     consoleLayout->setSpacing(8);
     consoleLayout->addWidget(m_toolBar);
@@ -128,17 +120,16 @@ void DeviceWindow::buildLayout() {
     consoleLayout->addWidget(m_tabs, 1);
     consoleLayout->addWidget(m_footer);
 
-    auto *splitter = new QSplitter;
-    splitter->setChildrenCollapsible(false);
-    splitter->setHandleWidth(1);
-    splitter->addWidget(m_siteTree);
-    splitter->addWidget(console);
-    splitter->setStretchFactor(1, 1);
-    splitter->setSizes({siteTreeWidth, 1000});
+    m_splitter->setChildrenCollapsible(false);
+    m_splitter->setHandleWidth(1);
+    m_splitter->addWidget(m_siteTree);
+    m_splitter->addWidget(m_console);
+    m_splitter->setStretchFactor(1, 1);
+    m_splitter->setSizes({siteTreeWidth, 1000});
     m_siteTree->setMinimumWidth(180);
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(splitter);
+    layout->addWidget(m_splitter);
 }
 
 void DeviceWindow::connectParts() {
@@ -146,7 +137,10 @@ void DeviceWindow::connectParts() {
     connect(m_monitor.get(), &DeviceMonitor::serverAnswered, this, &DeviceWindow::onServerAnswered);
     connect(m_monitor.get(), &DeviceMonitor::serverLost, this, &DeviceWindow::onServerLost);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
-    connect(m_tabs, &QTabWidget::currentChanged, this, &DeviceWindow::onSelectionChanged);
+    connect(m_tabs, &CountedTabWidget::currentChanged, this, [this] {
+        showStatusCounts();
+        onSelectionChanged();
+    });
     for (const DeviceTab *tab : m_deviceTabs)
         connect(tab->table(), &MainConsoleTable::selectedDevicesChanged, this,
                 &DeviceWindow::onSelectionChanged);
@@ -165,6 +159,7 @@ void DeviceWindow::startWork() {
     loadRemoteServers();
     m_online = false;
     m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(true);
+    m_siteTree->setFocus();
     reload();
     m_monitor->start();
 }
@@ -254,7 +249,7 @@ void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
         return;
     for (const DeviceTab *tab : m_deviceTabs)
         tab->table()->refreshStatus();
-    m_footer->setStatuses(m_inventory.statuses());
+    showStatusCounts();
 }
 
 void DeviceWindow::onServerAnswered() {
@@ -343,12 +338,13 @@ void DeviceWindow::onSelectionChanged() {
 }
 
 void DeviceWindow::showCounts() {
-    const QLocale locale;
-    for (std::size_t i = 0; i < m_deviceTabs.size(); ++i) {
-        m_tabCounts[i]->setText(locale.toString(m_deviceTabs[i]->table()->rowCount()));
-        m_tabCounts[i]->adjustSize();
-    }
-    m_footer->setStatuses(m_inventory.statuses());
+    for (int i = 0; i < m_tabs->count(); ++i)
+        m_tabs->setCount(i, m_deviceTabs[static_cast<std::size_t>(i)]->table()->rowCount());
+    showStatusCounts();
+}
+
+void DeviceWindow::showStatusCounts() {
+    m_footer->setStatuses(m_inventory, currentTab()->table()->shownDevices());
 }
 
 void DeviceWindow::showContent() {

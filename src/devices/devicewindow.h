@@ -9,6 +9,7 @@
 
 #include <memory>
 
+class CountedTabWidget;
 class DeviceFooter;
 class DeviceMonitor;
 class DeviceTab;
@@ -16,8 +17,7 @@ class DeviceToolBar;
 class MainConsoleTable;
 class QComboBox;
 class QFrame;
-class QLabel;
-class QTabWidget;
+class QSplitter;
 class QTimer;
 class ReconnectingDialog;
 class RefreshDeviceDialog;
@@ -72,6 +72,7 @@ private:
     void loadRemoteServers();
     void showContent();
     void showCounts();
+    void showStatusCounts();
     DeviceTab *currentTab() const;
 
     DeviceInventory m_inventory;
@@ -79,13 +80,14 @@ private:
     NetTask::Owner m_netTask;
     NetTask::Owner m_refreshTask;
 
+    QSplitter *m_splitter;
+    QWidget *m_console; ///< right of the tree
     SiteTree *m_siteTree;
     DeviceToolBar *m_toolBar;
     QFrame *m_noticeBar = nullptr;
     QComboBox *m_remoteCombo;
-    QTabWidget *m_tabs;
+    CountedTabWidget *m_tabs;
     std::vector<DeviceTab *> m_deviceTabs;
-    std::vector<QLabel *> m_tabCounts;
     DeviceFooter *m_footer;
     QTimer *m_selectionLogDelay;
 

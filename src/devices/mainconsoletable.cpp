@@ -206,11 +206,18 @@ void MainConsoleTable::fitColumns() {
     const QFontMetrics metrics = fontMetrics();
     const QFontMetrics headerMetrics(horizontalHeader()->font());
     for (int column = 0; column < deviceColumnCount; ++column) {
-        int width = headerMetrics.horizontalAdvance(horizontalHeaderItem(column)->text()) + sortArrowSpace;
+        QString longest;
         for (int row = 0; row < std::min(rowCount(), widthSample); ++row) {
-            const QString text = cellData(row, column, Qt::DisplayRole).toString().left(longestSampledText);
-            width = std::max(width, metrics.horizontalAdvance(text) + (column == 0 ? statusIconSpace : 0));
+            const QString text = cellData(row, column, Qt::DisplayRole).toString();
+            if (text.size() > longest.size())
+                longest = text;
         }
+        // Measuring a text costs more than all the rest here, so only the one with most letters is.
+        const int text =
+            metrics.horizontalAdvance(longest.left(longestSampledText)) + (column == 0 ? statusIconSpace : 0);
+        const int title =
+            headerMetrics.horizontalAdvance(horizontalHeaderItem(column)->text()) + sortArrowSpace;
+        const int width = std::max(text, title);
         setColumnWidth(column, std::min(width + cellMargins, widestColumn));
     }
 }
@@ -247,8 +254,11 @@ void MainConsoleTable::timerEvent(QTimerEvent *event) {
         CustomTable::timerEvent(event);
         return;
     }
+    const int lastVisible = rowAt(viewport()->height() - 1);
+    const bool seen = lastVisible < 0 || m_filledRows <= lastVisible;
     fillItems(fillBudgetMs);
-    viewport()->update();
+    if (seen)
+        viewport()->update();
 }
 
 QVariant MainConsoleTable::cellData(int row, int column, int role) const {

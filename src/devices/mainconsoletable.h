@@ -31,6 +31,8 @@ public:
     /// order.
     void refreshStatus();
 
+    /// The devices of all rows, as places in the inventory, in the order of the rows.
+    const std::vector<int> &shownDevices() const { return m_order; }
     /// The devices of the selected rows, as places in the inventory, in the order of the rows.
     std::vector<int> selectedDevices() const;
 

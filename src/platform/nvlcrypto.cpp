@@ -172,6 +172,9 @@ std::optional<Bytes> fromBase64(std::string_view text) {
         return std::nullopt;
     const std::size_t padding = text.ends_with("==") ? 2 : text.ends_with('=') ? 1 : 0;
     bytes.resize(static_cast<std::size_t>(length) - padding);
+    // The decoder passes over blanks around the text and reads stray padding as zeros.
+    if (toBase64(bytes) != text)
+        return std::nullopt;
     return bytes;
 }
 

@@ -7,9 +7,13 @@
 #include <QPainter>
 #include <QStyledItemDelegate>
 
+#include <limits>
+#include <vector>
+
 namespace {
 
 constexpr int cellPadding = 8;
+constexpr qsizetype longestShownText = 300;
 
 /// Paints a cell by hand: the style sheet's own way costs several times as much for each one.
 class CellDelegate : public QStyledItemDelegate {
@@ -31,10 +35,34 @@ public:
         painter->setFont(option.font);
         painter->setPen(text == QLatin1String("--") ? Theme::textQuiet : Theme::textStrong);
         painter->drawText(rest, Qt::AlignVCenter | Qt::TextSingleLine,
-                          option.fontMetrics.elidedText(text, Qt::ElideRight, rest.width()));
+                          fitted(text, option.font, rest.width()));
     }
 
 private:
+    /// The text, cut where it does not fit. Laying a text out to find that it fits costs as much as drawing
+    /// it, so a sum of the letters' widths says so for most.
+    QString fitted(const QString &text, const QFont &font, int width) const {
+        if (m_widths.empty() || m_widthsFont != font)
+            measureLetters(font);
+        qreal sum = 0;
+        const qsizetype shown = std::min(text.size(), longestShownText);
+        for (qsizetype i = 0; i < shown && sum <= width; ++i) {
+            const char16_t letter = text[i].unicode();
+            sum += letter < m_widths.size() ? m_widths[letter] : width + 1;
+        }
+        if (shown == text.size() && sum <= width)
+            return text;
+        return QFontMetrics(font).elidedText(text.left(longestShownText).simplified(), Qt::ElideRight, width);
+    }
+
+    void measureLetters(const QFont &font) const {
+        const QFontMetricsF metrics(font);
+        m_widthsFont = font;
+        m_widths.assign(127, std::numeric_limits<qreal>::max());
+        for (char16_t letter = 32; letter < m_widths.size(); ++letter)
+            m_widths[letter] = metrics.horizontalAdvance(QChar(letter));
+    }
+
     void paintBackground(QPainter *painter, const QStyleOptionViewItem &option,
                          const QModelIndex &index) const {
         if (option.state & QStyle::State_Selected)
@@ -52,6 +80,8 @@ private:
     }
 
     CustomTable *m_table;
+    mutable std::vector<qreal> m_widths; ///< of the plain letters, by their codes
+    mutable QFont m_widthsFont;
 };
 
 } // namespace

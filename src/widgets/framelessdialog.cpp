@@ -35,7 +35,8 @@ FramelessDialog::FramelessDialog(QWidget *parent)
     m_close->setIcon(Icons::icon(QStringLiteral(":/images/icon_general_close_line.svg"), {16, 16}));
     m_close->setIconSize({16, 16});
     m_close->setFixedSize(28, 28);
-    m_close->setFocusPolicy(Qt::TabFocus);
+    // Escape closes as well, so the keyboard's way leads past the cross.
+    m_close->setFocusPolicy(Qt::NoFocus);
     connect(m_close, &QToolButton::clicked, this, &QDialog::reject);
 
     auto *titleLayout = new QHBoxLayout(dragger);

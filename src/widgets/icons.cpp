@@ -4,13 +4,14 @@
 
 #include <QBuffer>
 #include <QFile>
+#include <QIconEngine>
 #include <QImageReader>
+#include <QPainter>
+#include <QPixmapCache>
 
 namespace Icons {
 
 namespace {
-
-constexpr qreal ratios[] = {1.0, 1.5, 2.0, 3.0};
 
 QByteArray coloured(QByteArray svg, const QColor &colour) {
     if (!colour.isValid())
@@ -22,40 +23,87 @@ QByteArray coloured(QByteArray svg, const QColor &colour) {
     return svg;
 }
 
-void addPixmaps(QIcon &icon, const QString &resource, QSize size, const QColor &colour, QIcon::Mode mode,
-                QIcon::State state) {
-    for (const qreal ratio : ratios)
-        icon.addPixmap(pixmap(resource, size, ratio, colour), mode, state);
-}
-
-} // namespace
-
-QPixmap pixmap(const QString &resource, QSize size, qreal ratio, const QColor &colour) {
+/// The picture at a size in pixels, drawn once for each size and colour.
+QPixmap rendered(const QString &resource, QSize pixels, const QColor &colour) {
+    const QString key = QStringLiteral("%1/%2x%3/%4")
+                            .arg(resource)
+                            .arg(pixels.width())
+                            .arg(pixels.height())
+                            .arg(colour.isValid() ? colour.name(QColor::HexArgb) : QString());
+    QPixmap picture;
+    if (QPixmapCache::find(key, &picture))
+        return picture;
     QFile file(resource);
     if (!file.open(QIODevice::ReadOnly))
         return {};
     QByteArray svg = coloured(file.readAll(), colour);
     QBuffer buffer(&svg);
     QImageReader reader(&buffer, "svg");
-    reader.setScaledSize((QSizeF(size) * ratio).toSize());
-    QPixmap picture = QPixmap::fromImage(reader.read());
+    reader.setScaledSize(pixels);
+    picture = QPixmap::fromImage(reader.read());
+    QPixmapCache::insert(key, picture);
+    return picture;
+}
+
+/// Draws a picture when it is wanted, in the size and colour that are wanted then: most states of most icons
+/// never are.
+class PictureEngine : public QIconEngine {
+public:
+    PictureEngine(const QString &resource, QSize size, bool recoloured)
+        : m_resource(resource), m_size(size), m_recoloured(recoloured) {}
+
+    void paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state) override {
+        const qreal ratio = painter->device()->devicePixelRatioF();
+        const QSize fitted = m_size.scaled(rect.size().boundedTo(m_size), Qt::KeepAspectRatio);
+        QRect place({}, fitted);
+        place.moveCenter(rect.center());
+        painter->drawPixmap(place, scaledPixmap((QSizeF(fitted) * ratio).toSize(), mode, state, ratio));
+    }
+
+    QPixmap pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state) override {
+        return scaledPixmap(size, mode, state, 1.0);
+    }
+
+    QPixmap scaledPixmap(const QSize &pixels, QIcon::Mode mode, QIcon::State state, qreal) override {
+        return rendered(m_resource, pixels, m_recoloured ? colourOf(mode, state) : QColor());
+    }
+
+    QSize actualSize(const QSize &size, QIcon::Mode, QIcon::State) override {
+        return m_size.scaled(size.boundedTo(m_size), Qt::KeepAspectRatio);
+    }
+
+    QList<QSize> availableSizes(QIcon::Mode, QIcon::State) override { return {m_size}; }
+    bool isNull() override { return !QFile::exists(m_resource); }
+    QIconEngine *clone() const override { return new PictureEngine(*this); }
+
+private:
+    static QColor colourOf(QIcon::Mode mode, QIcon::State state) {
+        if (mode == QIcon::Disabled)
+            return Theme::textOff;
+        if (state == QIcon::On)
+            return Theme::accent;
+        return mode == QIcon::Active ? Theme::text : Theme::textDim;
+    }
+
+    QString m_resource;
+    QSize m_size;
+    bool m_recoloured;
+};
+
+} // namespace
+
+QPixmap pixmap(const QString &resource, QSize size, qreal ratio, const QColor &colour) {
+    QPixmap picture = rendered(resource, (QSizeF(size) * ratio).toSize(), colour);
     picture.setDevicePixelRatio(ratio);
     return picture;
 }
 
 QIcon icon(const QString &resource, QSize size) {
-    QIcon icon;
-    addPixmaps(icon, resource, size, Theme::textDim, QIcon::Normal, QIcon::Off);
-    addPixmaps(icon, resource, size, Theme::text, QIcon::Active, QIcon::Off);
-    addPixmaps(icon, resource, size, Theme::accent, QIcon::Normal, QIcon::On);
-    addPixmaps(icon, resource, size, Theme::textOff, QIcon::Disabled, QIcon::Off);
-    return icon;
+    return QIcon(new PictureEngine(resource, size, true));
 }
 
 QIcon plainIcon(const QString &resource, QSize size) {
-    QIcon icon;
-    addPixmaps(icon, resource, size, {}, QIcon::Normal, QIcon::Off);
-    return icon;
+    return QIcon(new PictureEngine(resource, size, false));
 }
 
 } // namespace Icons

@@ -16,7 +16,7 @@ QPixmap pixmap(const QString &resource, QSize size, qreal ratio, const QColor &c
 /// checked.
 QIcon icon(const QString &resource, QSize size);
 
-/// As it was drawn, at 1x to 3x.
+/// An icon as it was drawn, sharp at every ratio.
 QIcon plainIcon(const QString &resource, QSize size);
 
 } // namespace Icons

@@ -1,0 +1,246 @@
+// A device table against a plain table widget filled item by item, and against a view on a bare array model.
+//   bench_tables [DEVICES…]
+
+#include "deviceinventory.h"
+#include "mainconsoletable.h"
+#include "theme.h"
+
+#include <QAbstractTableModel>
+#include <QApplication>
+#include <QElapsedTimer>
+#include <QHeaderView>
+#include <QTableView>
+#include <QTableWidget>
+
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+#include <cstdio>
+#include <functional>
+
+namespace {
+
+constexpr int rounds = 5;
+
+double milliseconds(const std::function<void()> &work) {
+    QElapsedTimer timer;
+    timer.start();
+    work();
+    return static_cast<double>(timer.nsecsElapsed()) / 1e6;
+}
+
+/// The median, so that one interruption does not count.
+double median(const std::function<double()> &measure) {
+    std::vector<double> times;
+    for (int i = 0; i < rounds; ++i)
+        times.push_back(measure());
+    std::sort(times.begin(), times.end());
+    return times[rounds / 2];
+}
+
+std::vector<DeviceRecordPtr> makeRecords(int count) {
+    std::vector<DeviceRecordPtr> records;
+    for (int i = 0; i < count; ++i) {
+        // A multiplicative shuffle: neighbours in the list are no neighbours by address.
+        const unsigned n = static_cast<unsigned>(i) * 2654435761u;
+        char id[24];
+        char mac[24];
+        char ip[24];
+        std::snprintf(id, sizeof id, "DV%012d", i);
+        std::snprintf(mac, sizeof mac, "00:1A:07:%02X:%02X:%02X", (n >> 16) & 255, (n >> 8) & 255, n & 255);
+        std::snprintf(ip, sizeof ip, "10.%u.%u.%u", (n >> 24) & 255, (n >> 16) & 255, (n >> 8) & 255);
+        records.push_back(DeviceRecords::parse({{"id", id},
+                                                {"d_mac", mac},
+                                                {"d_ip", ip},
+                                                {"d_model", "NC-4210"},
+                                                {"d_hostname", "gate-" + std::to_string(i)},
+                                                {"d_svrtype", "Camera"},
+                                                {"d_fw", "2.4.1"},
+                                                {"d_http", 80},
+                                                {"d_https", 443},
+                                                {"https_enable", true},
+                                                {"ieee8021x_enable", false},
+                                                {"d_sdstatus", "ready"},
+                                                {"d_sdusage", i % 100},
+                                                {"d_dtime", "2026/11/21 10:00:00"},
+                                                {"d_powerfreq", 50},
+                                                {"d_audio", "mute"},
+                                                {"siteid", {"DO000000000000"}}}));
+    }
+    return records;
+}
+
+/// The reference (b): an array of texts, and nothing between it and the view.
+class ArrayModel : public QAbstractTableModel {
+public:
+    void fill(const std::vector<DeviceRecordPtr> &records) {
+        beginResetModel();
+        m_rows = records;
+        m_codes.assign(records.size(), 0);
+        endResetModel();
+    }
+    void sortByIp() {
+        emit layoutAboutToBeChanged();
+        std::sort(m_rows.begin(), m_rows.end(), [](const DeviceRecordPtr &a, const DeviceRecordPtr &b) {
+            return a->sortKey(DeviceColumn::Ip) < b->sortKey(DeviceColumn::Ip);
+        });
+        emit layoutChanged();
+    }
+    void poll(int step, int code) {
+        for (std::size_t i = 0; i < m_codes.size(); i += static_cast<std::size_t>(step))
+            m_codes[i] = code;
+        emit dataChanged(index(0, 0), index(rowCount({}) - 1, 0));
+    }
+    int rowCount(const QModelIndex &) const override { return static_cast<int>(m_rows.size()); }
+    int columnCount(const QModelIndex &) const override { return deviceColumnCount; }
+    QVariant data(const QModelIndex &index, int role) const override {
+        const auto row = static_cast<std::size_t>(index.row());
+        if (role != Qt::DisplayRole)
+            return {};
+        if (index.column() == 0)
+            return m_codes[row];
+        return m_rows[row]->texts[static_cast<std::size_t>(index.column())];
+    }
+
+private:
+    std::vector<DeviceRecordPtr> m_rows;
+    std::vector<int> m_codes;
+};
+
+void prepare(QTableView &view) {
+    view.resize(1280, 720);
+    view.verticalHeader()->hide();
+    view.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    view.show();
+    QApplication::processEvents();
+}
+
+/// Times filling a table. Painting is left out for all alike: what is seen of a table does not grow with it.
+double fillTime(QTableView &view, const std::function<void()> &fill) {
+    view.setUpdatesEnabled(false);
+    const double time = milliseconds(fill);
+    view.setUpdatesEnabled(true);
+    QApplication::processEvents();
+    return time;
+}
+
+double fillPlainWidget(const std::vector<DeviceRecordPtr> &records) {
+    QTableWidget table;
+    table.setColumnCount(deviceColumnCount);
+    prepare(table);
+    return fillTime(table, [&] {
+        table.setRowCount(static_cast<int>(records.size()));
+        for (int row = 0; row < table.rowCount(); ++row) {
+            for (int column = 0; column < deviceColumnCount; ++column)
+                table.setItem(
+                    row, column,
+                    new QTableWidgetItem(
+                        records[static_cast<std::size_t>(row)]->texts[static_cast<std::size_t>(column)]));
+        }
+    });
+}
+
+/// Lets the event loop run until every item is there, and notes the longest turn of it.
+void finishFill(MainConsoleTable &table, double &longestTurn) {
+    while (table.rowCount() > 0 && !table.item(table.rowCount() - 1, 0))
+        longestTurn = std::max(longestTurn, milliseconds([] { QApplication::processEvents(); }));
+}
+
+struct Times {
+    double fill = 0;
+    double longestTurn = 0;
+    double sort = 0;
+    double poll = 0;
+};
+
+Times measureDeviceTable(const std::vector<DeviceRecordPtr> &records) {
+    DeviceInventory inventory;
+    MainConsoleTable table(DeviceClass::Camera);
+    prepare(table);
+    table.setInventory(&inventory);
+    Times times;
+    const auto snapshot = std::make_shared<const DeviceSnapshot>(records);
+    times.fill = fillTime(table, [&] {
+        times.longestTurn = milliseconds([&] {
+            inventory.replace(snapshot, {});
+            table.refill();
+        });
+        finishFill(table, times.longestTurn);
+    });
+    times.sort = milliseconds([&] {
+        emit table.horizontalHeader()->sectionClicked(static_cast<int>(DeviceColumn::Ip));
+        table.viewport()->repaint();
+    });
+    DeviceStatusUpdate update{snapshot, {}, false};
+    for (int i = 0; i < snapshot->size(); i += 10)
+        update.changes.emplace_back(i, DeviceStatusCode::Unreachable);
+    times.poll = milliseconds([&] {
+        inventory.apply(update);
+        table.refreshStatus();
+        table.viewport()->repaint();
+    });
+    return times;
+}
+
+Times measureArrayModel(const std::vector<DeviceRecordPtr> &records) {
+    ArrayModel model;
+    QTableView view;
+    view.setModel(&model);
+    prepare(view);
+    Times times;
+    times.fill = fillTime(view, [&] { model.fill(records); });
+    times.sort = milliseconds([&] {
+        model.sortByIp();
+        view.viewport()->repaint();
+    });
+    times.poll = milliseconds([&] {
+        model.poll(10, 3);
+        view.viewport()->repaint();
+    });
+    return times;
+}
+
+void row(const char *what, int devices, double ours, const char *reference, double theirs,
+         const char *limit) {
+    std::printf("%-22s %7d  %9.2f ms   %-24s %9.2f ms   ratio %6.2f   %s\n", what, devices, ours, reference,
+                theirs, ours / theirs, limit);
+}
+
+void measure(int devices) {
+    const std::vector<DeviceRecordPtr> records = makeRecords(devices);
+    const double plainFill = median([&] { return fillPlainWidget(records); });
+    std::vector<Times> ours;
+    std::vector<Times> bare;
+    for (int i = 0; i < rounds; ++i) {
+        ours.push_back(measureDeviceTable(records));
+        bare.push_back(measureArrayModel(records));
+    }
+    const auto middle = [](const std::vector<Times> &all, double Times::*member) {
+        std::vector<double> values;
+        for (const Times &times : all)
+            values.push_back(times.*member);
+        std::sort(values.begin(), values.end());
+        return values[values.size() / 2];
+    };
+    row("fill", devices, middle(ours, &Times::fill), "(a) setItem", plainFill, "at most 0.7");
+    row("IP sort", devices, middle(ours, &Times::sort), "(b) array model", middle(bare, &Times::sort),
+        "at most 4");
+    row("poll, a tenth changes", devices, middle(ours, &Times::poll), "(b) array model",
+        middle(bare, &Times::poll), "at most 3, and 16 ms");
+    std::printf("%-22s %7d  %9.2f ms   of the event loop while filling\n", "longest turn", devices,
+                middle(ours, &Times::longestTurn));
+}
+
+} // namespace
+
+int main(int argc, char *argv[]) {
+    QApplication application(argc, argv);
+    QApplication::setStyle(QStringLiteral("Fusion"));
+    Theme::installFonts();
+    application.setStyleSheet(Theme::styleSheet());
+    QStringList sizes = QCoreApplication::arguments().mid(1);
+    if (sizes.isEmpty())
+        sizes = {QStringLiteral("1000"), QStringLiteral("10000"), QStringLiteral("50000")};
+    for (const QString &size : sizes)
+        measure(size.toInt());
+}

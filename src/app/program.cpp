@@ -1,0 +1,88 @@
+#include "program.h"
+
+#include "apppaths.h"
+#include "framelesswindow.h"
+#include "mainwindow.h"
+#include "messagelog.h"
+#include "nettask.h"
+#include "processsetup.h"
+#include "requestdeadline.h"
+#include "singleinstance.h"
+#include "theme.h"
+
+#include <QApplication>
+#include <QDebug>
+#include <QSplashScreen>
+
+#include <cstdlib>
+#include <memory>
+
+namespace {
+
+constexpr int runnersEndMs = 10000;
+
+void setIdentity() {
+    QCoreApplication::setOrganizationName(QStringLiteral("Norvell Inc."));
+    QCoreApplication::setApplicationName(QStringLiteral("Norvell Device Manager"));
+    QCoreApplication::setApplicationVersion(QStringLiteral("v1.2.0.1"));
+}
+
+QIcon applicationIcon() {
+    QIcon icon;
+    for (const int size : {16, 32, 48, 64, 128, 256})
+        icon.addFile(QStringLiteral(":/images/app_icon_%1.png").arg(size));
+    return icon;
+}
+
+int runWindows(QApplication &application, const std::function<void(QWidget &)> &shown) {
+    const QPixmap picture(QStringLiteral(":/images/img_splash.png"));
+    QSplashScreen splash(picture);
+    splash.show();
+    splash.showMessage(QCoreApplication::applicationName(), Qt::AlignLeft | Qt::AlignBottom, Qt::white);
+
+    FramelessWindow frame;
+    // The frame takes it over; until then it is nobody's.
+    auto *content = new MainWindow;
+    content->setWindowTitle(QCoreApplication::translate("main", "Norvell Device Manager"));
+    frame.setContent(content);
+    frame.show();
+    if (shown)
+        shown(frame);
+    splash.finish(&frame);
+    return application.exec();
+}
+
+} // namespace
+
+namespace Program {
+
+int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown) {
+    SingleInstance instance(AppPaths::instanceKey());
+    if (!instance.acquire()) {
+        qDebug("An instance of this application is running!");
+        return 0;
+    }
+    // The log's place depends on the identity, and the toolkit logs from the application's construction on.
+    setIdentity();
+    MessageLog::install();
+    ProcessSetup::ignoreBrokenPipes();
+
+    int status = 0;
+    {
+        QApplication application(argc, argv);
+        QApplication::setStyle(QStringLiteral("Fusion"));
+        QApplication::setPalette(Theme::palette());
+        QGuiApplication::setApplicationDisplayName(QCoreApplication::applicationName());
+        QApplication::setWindowIcon(applicationIcon());
+        Theme::installFonts();
+        application.setStyleSheet(Theme::styleSheet());
+        status = runWindows(application, shown);
+        RequestDeadline::cutAll();
+        // A name look-up cannot be interrupted; nothing is being written while one hangs.
+        if (!NetTask::waitForAll(runnersEndMs))
+            std::_Exit(status);
+    }
+    return status;
+}
+
+} // namespace Program
