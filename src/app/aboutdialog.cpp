@@ -10,7 +10,7 @@ AboutDialog::AboutDialog(QWidget *parent)
     setWindowTitle(tr("About"));
     m_ui->logoLabel->setPixmap(Icons::pixmap(QStringLiteral(":/images/logo_mark.svg"), {48, 48}, 2.0));
     m_ui->nameLabel->setText(QCoreApplication::applicationName());
-    m_ui->versionLabel->setText(tr("Version %1").arg(QCoreApplication::applicationVersion()));
+    m_ui->versionLabel->setText(QCoreApplication::applicationVersion());
     connect(m_ui->okButton, &QPushButton::clicked, this, &QDialog::accept);
 }
 

@@ -99,7 +99,6 @@ void LoginDialog::showChosenFields() {
         m_ui->remoteComboBox->setFocus();
     else
         (email->text().isEmpty() ? email : password)->setFocus();
-    adjustSize();
 }
 
 void LoginDialog::chooseServer(const QString &serverId) {

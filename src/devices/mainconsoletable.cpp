@@ -98,7 +98,8 @@ void MainConsoleTable::refill() {
         setRowCount(rows);
     }
     m_filledRows = std::min(m_filledRows, rows);
-    fillItems(fillBudgetMs);
+    // A table that nobody sees has time.
+    fillItems(isVisible() ? fillBudgetMs : 0);
     fitColumns();
     restorePlace(place);
     viewport()->update();
@@ -152,37 +153,50 @@ bool MainConsoleTable::isSameOrder(const Place &place) const {
     return true;
 }
 
+/// Where a device of an earlier reading is in the present one, or Place::none.
+int MainConsoleTable::placeNow(const Place &place, int device) const {
+    if (device < 0 || place.snapshot == m_shown)
+        return device;
+    return m_shown->indexOf(place.snapshot->at(device)->id);
+}
+
+/// The remembered selection in the present order, and how many devices are in it.
+std::pair<QItemSelection, int> MainConsoleTable::selectionNow(const Place &place) const {
+    std::vector<bool> selected(static_cast<std::size_t>(m_shown->size()));
+    for (std::size_t device = 0; device < place.selected.size(); ++device) {
+        const int now = place.selected[device] ? placeNow(place, static_cast<int>(device)) : Place::none;
+        if (now >= 0)
+            selected[static_cast<std::size_t>(now)] = true;
+    }
+    QItemSelection selection;
+    int count = 0;
+    int first = -1;
+    const int rows = rowCount();
+    for (int row = 0; row <= rows; ++row) {
+        const bool in =
+            row < rows && selected[static_cast<std::size_t>(m_order[static_cast<std::size_t>(row)])];
+        count += in;
+        if (in && first < 0)
+            first = row;
+        if (!in && first >= 0) {
+            selection.append(QItemSelectionRange(model()->index(first, 0),
+                                                 model()->index(row - 1, deviceColumnCount - 1)));
+            first = -1;
+        }
+    }
+    return {selection, count};
+}
+
 void MainConsoleTable::restorePlace(const Place &place) {
     if (!place.snapshot || isSameOrder(place))
         return;
-    const bool sameReading = place.snapshot == m_shown;
-    QItemSelection selection;
-    int selectedBefore = 0;
-    int selectedNow = 0;
-    int rangeStart = -1;
-    int currentRow = Place::none;
-    int topRow = Place::none;
-    const int rows = rowCount();
-    for (int row = 0; row <= rows; ++row) {
-        bool selected = false;
-        if (row < rows) {
-            const int device = m_order[static_cast<std::size_t>(row)];
-            const int before = sameReading ? device : place.snapshot->indexOf(m_shown->at(device)->id);
-            selected =
-                before >= 0 && !place.selected.empty() && place.selected[static_cast<std::size_t>(before)];
-            currentRow = before >= 0 && before == place.current ? row : currentRow;
-            topRow = before >= 0 && before == place.top ? row : topRow;
-        }
-        selectedNow += selected;
-        if (selected && rangeStart < 0)
-            rangeStart = row;
-        if (!selected && rangeStart >= 0) {
-            selection.append(QItemSelectionRange(model()->index(rangeStart, 0),
-                                                 model()->index(row - 1, deviceColumnCount - 1)));
-            rangeStart = -1;
-        }
-    }
-    selectedBefore = static_cast<int>(std::count(place.selected.begin(), place.selected.end(), true));
+    const auto rowOf = [this](int device) {
+        const auto found = device < 0 ? m_order.end() : std::find(m_order.begin(), m_order.end(), device);
+        return found == m_order.end() ? Place::none : static_cast<int>(found - m_order.begin());
+    };
+    const int currentRow = rowOf(placeNow(place, place.current));
+    const int topRow = rowOf(placeNow(place, place.top));
+    const auto [selection, count] = selectionNow(place);
     {
         // Selecting from scratch is linear; comparing two selections of many ranges is not.
         const QSignalBlocker blocker(selectionModel());
@@ -194,7 +208,7 @@ void MainConsoleTable::restorePlace(const Place &place) {
     }
     if (topRow >= 0)
         verticalScrollBar()->setValue(topRow * Theme::rowHeight - place.topOffset);
-    if (selectedNow != selectedBefore)
+    if (count != std::count(place.selected.begin(), place.selected.end(), true))
         emit selectedDevicesChanged();
 }
 

@@ -4,7 +4,7 @@
 #include "deviceorder.h"
 
 #include <QBasicTimer>
-#include <QStringList>
+#include <QItemSelection>
 
 /// A device table of the console: the devices of one class, in fifteen columns.
 ///
@@ -51,6 +51,8 @@ private:
     Place rememberPlace() const;
     void restorePlace(const Place &place);
     bool isSameOrder(const Place &place) const;
+    int placeNow(const Place &place, int device) const;
+    std::pair<QItemSelection, int> selectionNow(const Place &place) const;
 
     void arrange();
     void sortBy(int column);

@@ -118,9 +118,29 @@ bool CustomTable::viewportEvent(QEvent *event) {
 void CustomTable::setHoveredRow(int row) {
     if (row == m_hoveredRow)
         return;
-    for (const int changed : {m_hoveredRow, row}) {
-        if (changed >= 0)
-            viewport()->update(0, rowViewportPosition(changed), viewport()->width(), Theme::rowHeight);
-    }
+    updateRow(m_hoveredRow);
+    updateRow(row);
     m_hoveredRow = row;
+}
+
+void CustomTable::updateRow(int row) {
+    if (row >= 0)
+        viewport()->update(0, rowViewportPosition(row), viewport()->width(), Theme::rowHeight);
+}
+
+// The current row is marked as a whole, while the view itself updates its one cell.
+void CustomTable::currentChanged(const QModelIndex &current, const QModelIndex &previous) {
+    QTableWidget::currentChanged(current, previous);
+    updateRow(previous.row());
+    updateRow(current.row());
+}
+
+void CustomTable::focusInEvent(QFocusEvent *event) {
+    QTableWidget::focusInEvent(event);
+    updateRow(currentRow());
+}
+
+void CustomTable::focusOutEvent(QFocusEvent *event) {
+    QTableWidget::focusOutEvent(event);
+    updateRow(currentRow());
 }

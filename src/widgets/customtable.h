@@ -14,9 +14,13 @@ public:
 
 protected:
     bool viewportEvent(QEvent *event) override;
+    void currentChanged(const QModelIndex &current, const QModelIndex &previous) override;
+    void focusInEvent(QFocusEvent *event) override;
+    void focusOutEvent(QFocusEvent *event) override;
 
 private:
     void setHoveredRow(int row);
+    void updateRow(int row);
 
     int m_hoveredRow = -1;
 };

@@ -88,9 +88,19 @@ void FramelessDialog::keyPressEvent(QKeyEvent *event) {
     QDialog::keyPressEvent(event);
 }
 
-void FramelessDialog::changeEvent(QEvent *event) {
-    QDialog::changeEvent(event);
-    // A label that wraps makes the content higher; the frame follows it, but never jumps smaller.
-    if (event->type() == QEvent::LayoutRequest)
-        adjustSize();
+bool FramelessDialog::event(QEvent *event) {
+    const bool handled = QDialog::event(event);
+    // A part that appears or a text that wraps changes what the content needs.
+    if (event->type() == QEvent::LayoutRequest && isVisible())
+        fitContent();
+    return handled;
+}
+
+/// Resizes about the middle of the upper edge: the window system may otherwise choose another place.
+void FramelessDialog::fitContent() {
+    const QRect before = geometry();
+    const QSize wanted = sizeHint().expandedTo(minimumSizeHint());
+    if (wanted == before.size())
+        return;
+    setGeometry(QRect(QPoint(before.center().x() - wanted.width() / 2, before.top()), wanted));
 }

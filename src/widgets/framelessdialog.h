@@ -28,9 +28,11 @@ public:
 protected:
     void showEvent(QShowEvent *event) override;
     void keyPressEvent(QKeyEvent *event) override;
-    void changeEvent(QEvent *event) override;
+    bool event(QEvent *event) override;
 
 private:
+    void fitContent();
+
     QLabel *m_title;
     QToolButton *m_close;
     QWidget *m_content;
