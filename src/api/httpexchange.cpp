@@ -7,8 +7,41 @@
 namespace {
 
 constexpr std::size_t bodyLimit = 64u << 20;
+/// Of the head, give or take the one TLS record (16 KiB) in which it is passed.
+constexpr std::size_t headLimit = 16u << 10;
 constexpr const char *clientCertificate = "./client.cer";
 constexpr const char *clientKey = "./client.key";
+
+/// Keeps the head of an answer within bounds: the transport reads a status line of any length and then
+/// matches it with a recursive expression, whose stack a long line would overflow.
+class HeadLimit {
+public:
+    /// The context may call back as long as it lives.
+    void watch(SSL_CTX *context) {
+        SSL_CTX_set_msg_callback(context, &HeadLimit::onMessage);
+        SSL_CTX_set_msg_callback_arg(context, this);
+    }
+    /// The head is complete; the body has a limit of its own.
+    void lift() { m_lifted = true; }
+
+private:
+    static void onMessage(int isSent, int, int type, const void *bytes, std::size_t, SSL *session,
+                          void *limit) {
+        if (isSent || type != SSL3_RT_HEADER || !SSL_is_init_finished(session))
+            return;
+        const auto *recordHead = static_cast<const unsigned char *>(bytes);
+        static_cast<HeadLimit *>(limit)->addRecord(recordHead[3] * 256u + recordHead[4], session);
+    }
+
+    void addRecord(std::size_t length, SSL *session) {
+        m_received += length;
+        if (!m_lifted && m_received > headLimit)
+            SSL_set_shutdown(session, SSL_get_shutdown(session) | SSL_RECEIVED_SHUTDOWN);
+    }
+
+    std::size_t m_received = 0;
+    bool m_lifted = false;
+};
 
 /// With the client certificate when both of its files load, else without one: the service decides.
 std::unique_ptr<httplib::SSLClient> makeClient(const HttpRequest &request) {
@@ -42,18 +75,24 @@ HttpAnswer exchangeHttp(const HttpRequest &request) {
         return answer;
     }
     RequestDeadline deadline(request.totalTimeout);
+    HeadLimit head;
     const std::unique_ptr<httplib::SSLClient> client = makeClient(request);
     if (!client->is_valid()) {
         answer.error = "SSL context";
         return answer;
     }
     configure(*client, request, deadline);
+    head.watch(client->ssl_context());
 
     httplib::Request message;
     message.method = request.verb;
     message.path = request.path;
     message.headers = {{"Content-Type", request.contentType}, {"Authorization", request.authorization}};
     message.body = request.body;
+    message.response_handler = [&head](const httplib::Response &) {
+        head.lift();
+        return true;
+    };
     message.content_receiver = [&answer](const char *data, std::size_t length, std::uint64_t, std::uint64_t) {
         if (answer.body.size() + length > bodyLimit)
             return false;

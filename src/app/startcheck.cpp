@@ -1,6 +1,7 @@
 #include "startcheck.h"
 
 #include "apilocalclient.h"
+#include "clientstore.h"
 #include "configstore.h"
 #include "localstore.h"
 #include "netjob.h"
@@ -23,6 +24,8 @@ bool isFactoryAccount(const JSON &members) {
 }
 
 LocalService askLocalService() {
+    // The dialogs read this store; making its files takes longer than a window may stand still.
+    CClientStore::instance();
     const quint32 port = CConfigStore().serverPort();
     qDebug("get local server port: %d", static_cast<int>(port));
     std::uint32_t online = 0;

@@ -196,6 +196,8 @@ void DeviceWindow::loadRemoteServers() {
 }
 
 void DeviceWindow::reload() {
+    if (!CLocalStore::instance().loginInfo().isComplete())
+        return;
     if (m_reloading) {
         m_reloadWanted = true;
         return;

@@ -226,9 +226,10 @@ void MainConsoleTable::fitColumns() {
             if (text.size() > longest.size())
                 longest = text;
         }
-        // Measuring a text costs more than all the rest here, so only the one with most letters is.
-        const int text =
-            metrics.horizontalAdvance(longest.left(longestSampledText)) + (column == 0 ? statusIconSpace : 0);
+        // Measuring a text costs more than all the rest here, so only the one with most letters is; another
+        // one of that length may have wider letters.
+        const int measured = metrics.horizontalAdvance(longest.left(longestSampledText)) * 108 / 100;
+        const int text = measured + (column == 0 ? statusIconSpace : 0);
         const int title =
             headerMetrics.horizontalAdvance(horizontalHeaderItem(column)->text()) + sortArrowSpace;
         const int width = std::max(text, title);
