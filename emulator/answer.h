@@ -1,0 +1,47 @@
+#pragma once
+
+#include <stdexcept>
+#include <string>
+
+namespace emulator {
+
+/// The codes of an answer, apart from 0.
+enum class Code {
+    Malformed = 3,
+    UnknownId = 4,
+    NotAllowed = 5,
+    NotAccepted = 105,
+    WrongOldPassword = 106,
+    EmailTaken = 107,
+    NoMoreSessions = 108,
+};
+
+/// Thrown wherever a request is found wanting; becomes the answer's code.
+class Refusal : public std::runtime_error {
+public:
+    Refusal(Code code, const std::string &why) : std::runtime_error(why), m_code(code) {}
+
+    Code code() const { return m_code; }
+
+private:
+    Code m_code;
+};
+
+/// What an endpoint answers, before it is put on the wire.
+struct Answer {
+    int code = 0;
+    std::string msg = "ok";
+    std::string data;      ///< JSON text; empty for none
+    bool ciphered = false; ///< data travels as one ciphered text
+    std::string token;     ///< a session token for the "Authorization" header; empty for none
+
+    static Answer plain(std::string data);
+    static Answer secret(std::string data);
+    static Answer refused(int code, std::string why);
+};
+
+/// The body of an answer: the envelope with its data, ciphered where it must be. Throws std::runtime_error
+/// when the cipher fails.
+std::string envelope(const Answer &answer);
+
+} // namespace emulator

@@ -1,0 +1,266 @@
+#include "control.h"
+
+#include "answer.h"
+#include "device_commit.h"
+#include "faults.h"
+#include "fleet.h"
+#include "random.h"
+#include "service.h"
+#include "stop_signal.h"
+
+#include <poll.h>
+#include <signal.h>
+#include <unistd.h>
+
+#include <array>
+#include <charconv>
+#include <iostream>
+#include <optional>
+#include <stdexcept>
+
+namespace emulator {
+
+namespace {
+
+/// Splits at blanks; double quotes hold a word together.
+std::vector<std::string> wordsOf(const std::string &line) {
+    std::vector<std::string> words;
+    bool quoted = false;
+    bool inWord = false;
+    for (const char c : line) {
+        const bool blank = (c == ' ' || c == '\t' || c == '\r') && !quoted;
+        if (!blank && !inWord) {
+            words.emplace_back();
+        }
+        inWord = !blank;
+        if (c == '"') {
+            quoted = !quoted;
+        } else if (!blank) {
+            words.back() += c;
+        }
+    }
+    return words;
+}
+
+std::optional<std::size_t> numberOf(const std::string &text) {
+    std::size_t number = 0;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+    const bool whole = error == std::errc() && end == text.data() + text.size() && !text.empty();
+    return whole ? std::optional(number) : std::nullopt;
+}
+
+void hold(Model &model, Device &device, bool reachable) {
+    device.reachable = reachable;
+    device.held = !reachable;
+    model.devices.saveState(device);
+}
+
+std::string counted(std::size_t devices) {
+    return "ok " + std::to_string(devices) + (devices == 1 ? " device" : " devices");
+}
+
+/// Begins at a device that is not always the first, yet the same each time.
+std::size_t dropSome(Model &model, std::size_t count) {
+    const std::size_t size = model.devices.size();
+    Transaction transaction(model.store.database());
+    std::size_t dropped = 0;
+    const std::size_t start = size == 0 ? 0 : mixed(model.seed()) % size;
+    for (std::size_t i = 0; i < size && dropped < count; ++i) {
+        Device &device = model.devices.at((start + i) % size);
+        if (device.reachable) {
+            hold(model, device, false);
+            ++dropped;
+        }
+    }
+    transaction.commit();
+    return dropped;
+}
+
+std::size_t restoreAll(Model &model) {
+    Transaction transaction(model.store.database());
+    std::size_t restored = 0;
+    for (std::size_t i = 0; i < model.devices.size(); ++i) {
+        Device &device = model.devices.at(i);
+        if (!device.reachable) {
+            hold(model, device, true);
+            ++restored;
+        }
+    }
+    transaction.commit();
+    return restored;
+}
+
+} // namespace
+
+Control::Control(Service &service, Faults &faults, const StopSignal &stop)
+    : m_service(service), m_faults(faults), m_stop(stop), m_reader([this] { readInput(); }) {}
+
+Control::~Control() {
+    m_reader.join();
+}
+
+void Control::readInput() {
+    std::string pending;
+    std::array<char, 4096> chunk{};
+    while (!m_stop.raised()) {
+        // Waking up now and then keeps the reader from outliving the rest of the program.
+        pollfd input{STDIN_FILENO, POLLIN, 0};
+        if (::poll(&input, 1, 200) <= 0) {
+            continue;
+        }
+        const ssize_t count = ::read(STDIN_FILENO, chunk.data(), chunk.size());
+        if (count <= 0) {
+            return;
+        }
+        pending.append(chunk.data(), static_cast<std::size_t>(count));
+        for (auto end = pending.find('\n'); end != std::string::npos; end = pending.find('\n')) {
+            const std::string line = pending.substr(0, end);
+            pending.erase(0, end + 1);
+            std::cerr << answer(line) + "\n";
+        }
+    }
+}
+
+std::string Control::answer(const std::string &line) {
+    try {
+        return run(wordsOf(line));
+    } catch (const std::exception &error) {
+        return std::string("error ") + error.what();
+    }
+}
+
+std::string Control::run(const Words &words) {
+    const std::string command = words.empty() ? std::string() : words[0];
+    if (command == "stop" && words.size() == 1) {
+        ::kill(::getpid(), SIGTERM);
+        return "ok";
+    }
+    if (command == "counts" && words.size() == 1) {
+        return counts();
+    }
+    if (command == "expire-sessions" && words.size() == 1) {
+        m_service.withModel([](Model &model) { model.sessions.closeAll(); });
+        return "ok";
+    }
+    if (command == "faults" && words.size() == 2 && words[1] == "clear") {
+        m_faults.clear();
+        return "ok";
+    }
+    if (command == "life" && words.size() == 2 && (words[1] == "on" || words[1] == "off")) {
+        m_service.letLive(words[1] == "on");
+        return "ok";
+    }
+    return runOnDevices(words);
+}
+
+std::string Control::runOnDevices(const Words &words) {
+    const std::string command = words.empty() ? std::string() : words[0];
+    if (command == "fault" && words.size() == 2) {
+        return fault(words[1]);
+    }
+    if (command == "drop" && words.size() == 2) {
+        return drop(words[1]);
+    }
+    if (command == "restore" && words.size() == 2) {
+        return restore(words[1]);
+    }
+    if (command == "remove" && words.size() == 2) {
+        return remove(words[1]);
+    }
+    if (command == "add" && words.size() == 2) {
+        return add(words[1]);
+    }
+    if (command == "tick" && words.size() == 2) {
+        return tick(words[1]);
+    }
+    if (command == "status" && words.size() == 5) {
+        return status(words);
+    }
+    throw std::runtime_error("no such command");
+}
+
+std::string Control::fault(const std::string &text) {
+    m_faults.add(text);
+    return "ok";
+}
+
+std::string Control::drop(const std::string &what) {
+    const auto number = numberOf(what);
+    return counted(m_service.withModel([&](Model &model) {
+        if (number) {
+            return dropSome(model, *number);
+        }
+        hold(model, model.devices.get(what), false);
+        return std::size_t{1};
+    }));
+}
+
+std::string Control::restore(const std::string &what) {
+    return counted(m_service.withModel([&](Model &model) {
+        if (what == "all") {
+            return restoreAll(model);
+        }
+        hold(model, model.devices.get(what), true);
+        return std::size_t{1};
+    }));
+}
+
+std::string Control::remove(const std::string &id) {
+    m_service.withModel([&](Model &model) { removeDevices(model, {id}); });
+    return counted(1);
+}
+
+std::string Control::add(const std::string &count) {
+    const auto number = numberOf(count);
+    if (!number || *number > 100000) {
+        throw std::runtime_error("add takes a number of devices");
+    }
+    m_service.withModel([&](Model &model) { addDevices(model, *number); });
+    return counted(*number);
+}
+
+std::string Control::tick(const std::string &count) {
+    const auto number = numberOf(count);
+    if (!number || *number > 100000) {
+        throw std::runtime_error("tick takes a number of ticks");
+    }
+    for (std::size_t i = 0; i < *number; ++i) {
+        m_service.liveTick();
+    }
+    return "ok";
+}
+
+std::string Control::status(const Words &words) {
+    const std::string &id = words[1], &auth = words[2], &connect = words[3], &action = words[4];
+    Authorization authorization{};
+    if (auth != "-" && !authorizationOf(auth, authorization)) {
+        throw std::runtime_error("no such authorization");
+    }
+    if (connect != "-" && connect != "Connected" && connect != "Unreachable") {
+        throw std::runtime_error("a device is Connected or Unreachable");
+    }
+    m_service.withModel([&](Model &model) {
+        Device &device = model.devices.get(id);
+        device.authorization = auth == "-" ? device.authorization : authorization;
+        device.action = action == "-" ? device.action : action;
+        const bool reachable = connect == "-" ? device.reachable : connect == "Connected";
+        device.held = connect == "-" ? device.held : !reachable;
+        device.reachable = reachable;
+        model.devices.saveState(device);
+    });
+    return counted(1);
+}
+
+std::string Control::counts() {
+    return m_service.withModel([](Model &model) {
+        const DeviceTable::Counts counts = model.devices.counts();
+        return "ok devices=" + std::to_string(model.devices.size()) +
+               " unreachable=" + std::to_string(counts.unreachable) +
+               " authorized=" + std::to_string(counts.authorized) + " busy=" + std::to_string(counts.busy) +
+               " sites=" + std::to_string(model.sites.all().size()) +
+               " accounts=" + std::to_string(model.accounts.all().size()) +
+               " sessions=" + std::to_string(model.sessions.count());
+    });
+}
+
+} // namespace emulator

@@ -1,0 +1,69 @@
+#include "delivery.h"
+
+#include "stop_signal.h"
+
+#include <httplib.h>
+
+#include <openssl/ssl.h>
+#include <poll.h>
+#include <sys/socket.h>
+
+#include <memory>
+#include <thread>
+#include <utility>
+
+namespace emulator {
+
+namespace {
+
+using std::chrono::milliseconds;
+
+constexpr auto contentType = "application/json";
+
+int socketOf(const httplib::Request &request) {
+    return request.ssl ? SSL_get_fd(request.ssl) : -1;
+}
+
+/// The library owns the descriptor and closes it later, so the connection is cut without closing it.
+void cutConnection(int descriptor) {
+    sockaddr nobody{};
+    nobody.sa_family = AF_UNSPEC;
+    ::connect(descriptor, &nobody, sizeof nobody);
+}
+
+bool callerHasLeft(int descriptor) {
+    pollfd watched{descriptor, POLLRDHUP, 0};
+    return ::poll(&watched, 1, 0) > 0 && (watched.revents & (POLLRDHUP | POLLHUP | POLLERR)) != 0;
+}
+
+} // namespace
+
+void holdUnanswered(const httplib::Request &request, const StopSignal &stop) {
+    const int descriptor = socketOf(request);
+    while (!callerHasLeft(descriptor) && !stop.waitFor(milliseconds(100))) {
+    }
+    cutConnection(descriptor);
+}
+
+void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body) {
+    const int descriptor = socketOf(request);
+    const auto kept = std::make_shared<std::string>(std::move(body));
+    response.set_content_provider(kept->size(), contentType,
+                                  [kept, descriptor](std::size_t, std::size_t, httplib::DataSink &sink) {
+                                      sink.write(kept->data(), kept->size() / 2);
+                                      // What has arrived should be seen before the reset overtakes it.
+                                      std::this_thread::sleep_for(milliseconds(50));
+                                      cutConnection(descriptor);
+                                      return false;
+                                  });
+}
+
+void deliverDripping(httplib::Response &response, std::string body, const StopSignal &stop) {
+    const auto kept = std::make_shared<std::string>(std::move(body));
+    response.set_content_provider(
+        kept->size(), contentType, [kept, &stop](std::size_t offset, std::size_t, httplib::DataSink &sink) {
+            return sink.write(kept->data() + offset, 1) && !stop.waitFor(milliseconds(1000));
+        });
+}
+
+} // namespace emulator

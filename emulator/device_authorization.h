@@ -1,0 +1,44 @@
+#pragma once
+
+#include "records.h"
+
+#include <cstdint>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+namespace emulator {
+
+class DeviceTable;
+class Store;
+
+/// Lets the service into devices: the outcome of credentials shows a moment after they were given.
+class DeviceAuthorization {
+public:
+    DeviceAuthorization(DeviceTable &devices, Store &store);
+
+    void request(const std::vector<std::string> &ids, const std::string &account, const std::string &password,
+                 std::int64_t nowMs);
+
+    /// Applies the outcomes that are due.
+    void settle(std::int64_t nowMs);
+
+private:
+    enum class Offer { Right, WrongPassword, OtherAccount };
+    struct Pending {
+        std::int64_t dueAt = 0;
+        std::vector<std::string> ids;
+        Offer offer = Offer::Right;
+    };
+
+    void apply(Device &device, Offer offer, std::int64_t nowMs);
+    void refusePassword(Device &device, std::int64_t nowMs);
+    void admit(Device &device);
+
+    DeviceTable &m_devices;
+    Store &m_store;
+    std::vector<Pending> m_pending;
+    std::unordered_map<std::string, std::int64_t> m_blockedUntil;
+};
+
+} // namespace emulator

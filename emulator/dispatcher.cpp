@@ -1,0 +1,99 @@
+#include "dispatcher.h"
+
+#include "clock.h"
+#include "service.h"
+
+namespace emulator {
+
+namespace {
+
+// The service's clients send JSON under this name, and it takes it under no other.
+constexpr std::string_view jsonContentType = "application/x-www-form-urlencoded";
+
+bool isJsonContentType(const std::string &type) {
+    return type.starts_with(jsonContentType) &&
+           (type.size() == jsonContentType.size() || type[jsonContentType.size()] == ';');
+}
+
+Json bodyOf(const Incoming &incoming) {
+    if (incoming.verb != "POST") {
+        return Json::object();
+    }
+    if (!isJsonContentType(incoming.contentType)) {
+        throw Refusal(Code::Malformed, "the content type is not " + std::string(jsonContentType));
+    }
+    Json body = parseJson(incoming.body);
+    if (!body.is_object()) {
+        throw Refusal(Code::Malformed, "the body is no object");
+    }
+    return body;
+}
+
+} // namespace
+
+Dispatcher::Dispatcher(Service &service) : m_service(service) {
+    for (const auto &family : {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(),
+                               taskEndpoints(), alarmEndpoints()}) {
+        for (const Endpoint &endpoint : family) {
+            m_endpoints.emplace(endpoint.path, endpoint);
+        }
+    }
+}
+
+const Endpoint *Dispatcher::find(const std::string &path) const {
+    const auto found = m_endpoints.find(path);
+    return found == m_endpoints.end() ? nullptr : &found->second;
+}
+
+Answer Dispatcher::answer(const Endpoint &endpoint, const Incoming &incoming, bool alwaysRenew) {
+    try {
+        return granted(endpoint, incoming, alwaysRenew);
+    } catch (const Refusal &refusal) {
+        return Answer::refused(static_cast<int>(refusal.code()), refusal.what());
+    }
+}
+
+Answer Dispatcher::granted(const Endpoint &endpoint, const Incoming &incoming, bool alwaysRenew) {
+    const Call call = callOf(endpoint, incoming);
+    Answer answer = endpoint.handle(m_service, call);
+    if (endpoint.gate != Gate::Anybody) {
+        renewToken(answer, call.session, alwaysRenew);
+    }
+    return answer;
+}
+
+Call Dispatcher::callOf(const Endpoint &endpoint, const Incoming &incoming) {
+    Call call;
+    call.body = bodyOf(incoming);
+    if (endpoint.gate != Gate::Anybody) {
+        call.session = sessionOf(incoming, call.body, endpoint.gate);
+    } else if (!m_service.genericTokens().accepts(incoming.authorization, nowMs())) {
+        throw Refusal(Code::NotAccepted, "the token is not accepted");
+    }
+    return call;
+}
+
+SessionToken Dispatcher::sessionOf(const Incoming &incoming, const Json &body, Gate gate) {
+    const std::string id = textMember(body, "id");
+    return m_service.withModel([&](Model &model) {
+        const auto session = model.sessions.find(incoming.authorization, nowMs());
+        const auto account = session ? model.accounts.find(session->account) : std::nullopt;
+        if (!account || !sameEmail(account->email, id)) {
+            throw Refusal(Code::NotAccepted, "no such session");
+        }
+        if (gate == Gate::Writer && account->permission == "viewer") {
+            throw Refusal(Code::NotAllowed, "a viewer changes nothing");
+        }
+        return *session;
+    });
+}
+
+void Dispatcher::renewToken(Answer &answer, const SessionToken &session, bool always) {
+    m_service.withModel([&](Model &model) {
+        if (always || model.sessions.isDueForRenewal(session, nowMs())) {
+            answer.token = model.sessions.renew(session.session, nowMs()).value_or(std::string());
+        }
+    });
+}
+
+} // namespace emulator

@@ -1,0 +1,40 @@
+#pragma once
+
+#include "endpoint.h"
+
+#include <string>
+#include <unordered_map>
+
+namespace emulator {
+
+/// A request as it came over the wire.
+struct Incoming {
+    std::string verb;
+    std::string path;
+    std::string authorization;
+    std::string contentType;
+    std::string body;
+};
+
+/// Finds the endpoint of a request, judges the request and lets the endpoint answer it.
+class Dispatcher {
+public:
+    explicit Dispatcher(Service &service);
+
+    /// Null for a path that the service does not have.
+    const Endpoint *find(const std::string &path) const;
+
+    /// Never throws for what a caller did; an exception is a defect.
+    Answer answer(const Endpoint &endpoint, const Incoming &incoming, bool alwaysRenew);
+
+private:
+    Answer granted(const Endpoint &endpoint, const Incoming &incoming, bool alwaysRenew);
+    Call callOf(const Endpoint &endpoint, const Incoming &incoming);
+    SessionToken sessionOf(const Incoming &incoming, const Json &body, Gate gate);
+    void renewToken(Answer &answer, const SessionToken &session, bool always);
+
+    Service &m_service;
+    std::unordered_map<std::string, Endpoint> m_endpoints;
+};
+
+} // namespace emulator

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "answer.h"
+#include "json_access.h"
+#include "records.h"
+
+#include <string>
+#include <vector>
+
+namespace emulator {
+
+class Service;
+
+/// Who may call an endpoint.
+enum class Gate {
+    Anybody, ///< with a generic token
+    Reader,  ///< any session
+    Writer,  ///< a session whose account may change things
+};
+
+/// A request that has passed its gate.
+struct Call {
+    Json body;
+    SessionToken session; ///< empty at the gate for anybody
+};
+
+/// One path of the service. The handler throws Refusal for a request that it does not grant.
+struct Endpoint {
+    const char *verb;
+    const char *path;
+    Gate gate;
+    Answer (*handle)(Service &, const Call &);
+};
+
+using Endpoints = std::vector<Endpoint>;
+
+/// The families; each has a file of its own.
+Endpoints sessionEndpoints();
+Endpoints siteEndpoints();
+Endpoints deviceEndpoints();
+Endpoints accountEndpoints();
+Endpoints taskEndpoints();
+Endpoints alarmEndpoints();
+
+} // namespace emulator

@@ -1,0 +1,154 @@
+#include "clock.h"
+#include "credentials.h"
+#include "device_commit.h"
+#include "device_maker.h"
+#include "endpoint.h"
+#include "service.h"
+
+#include <charconv>
+
+namespace emulator {
+
+namespace {
+
+/// The ids of a "devices" argument, whose elements are ids or objects with an id.
+std::vector<std::string> deviceIds(const Json &body) {
+    std::vector<std::string> ids;
+    for (const Json &element : arrayMember(body, "devices")) {
+        if (element.is_string()) {
+            ids.push_back(element.get<std::string>());
+        } else if (element.is_object()) {
+            ids.push_back(textMember(element, "id"));
+        } else {
+            throw Refusal(Code::Malformed, "an element of \"devices\" names no device");
+        }
+    }
+    return ids;
+}
+
+void checkKnown(const Model &model, const std::vector<std::string> &ids) {
+    for (const std::string &id : ids) {
+        model.devices.get(id);
+    }
+}
+
+int policyMask(const Json &body) {
+    const std::string text = textMember(body, "type");
+    int mask = 0;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), mask);
+    if (error != std::errc() || end != text.data() + text.size() || mask < 0) {
+        throw Refusal(Code::Malformed, "\"type\" is no mask");
+    }
+    return mask;
+}
+
+Answer listDevices(Service &service, const Call &call) {
+    const Page page = pageOf(call.body);
+    return Answer::secret(service.withModel([&](Model &model) {
+        model.authorization.settle(nowMs());
+        return model.devices.pageText(page);
+    }));
+}
+
+Answer listStatuses(Service &service, const Call &call) {
+    const Page page = pageOf(call.body);
+    return Answer::secret(service.withModel([&](Model &model) {
+        model.authorization.settle(nowMs());
+        return model.devices.statusText(page);
+    }));
+}
+
+Answer commitDeviceList(Service &service, const Call &call) {
+    const std::string stage = textMember(call.body, "state");
+    const Json &devices = arrayMember(call.body, "devices");
+    service.withModel([&](Model &model) {
+        const auto records = model.batches.take("devices " + call.session.session, stage, devices, nowMs());
+        if (records) {
+            commitDevices(model, *records);
+        }
+    });
+    return {};
+}
+
+void checkTimeout(const Json &body) {
+    if (integerMember(body, "timeout") <= 0) {
+        throw Refusal(Code::Malformed, "\"timeout\" must be positive");
+    }
+}
+
+Answer scan(Service &service, const Call &call) {
+    checkTimeout(call.body);
+    service.withModel([](Model &model) { model.scans.start(nowMs()); });
+    return {};
+}
+
+Answer scanAddress(Service &service, const Call &call) {
+    checkTimeout(call.body);
+    const std::string address = filledTextMember(call.body, "ip");
+    service.withModel([&](Model &model) { model.scans.startAddress(address, nowMs()); });
+    return {};
+}
+
+Answer scanRange(Service &service, const Call &call) {
+    checkTimeout(call.body);
+    const std::string first = filledTextMember(call.body, "ip_start");
+    const std::string last = filledTextMember(call.body, "ip_end");
+    service.withModel([&](Model &model) { model.scans.startRange(first, last, nowMs()); });
+    return {};
+}
+
+Answer scanResults(Service &service, const Call &) {
+    return Answer::secret(service.withModel([](Model &model) { return model.scans.foundText(nowMs()); }));
+}
+
+Answer setPolicy(Service &service, const Call &call) {
+    const auto ids = deviceIds(call.body);
+    const Json policy = {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}};
+    textMember(call.body, "tid");
+    service.withModel([&](Model &model) {
+        checkKnown(model, ids);
+        Transaction transaction(model.store.database());
+        for (const std::string &id : ids) {
+            Device &device = model.devices.get(id);
+            Device changed = device;
+            Json record = Json::parse(device.body);
+            record["d_policy"] = policy;
+            setRecord(changed, std::move(record));
+            model.devices.update(device, std::move(changed));
+        }
+        transaction.commit();
+    });
+    return {};
+}
+
+Answer authorize(Service &service, const Call &call) {
+    const auto ids = deviceIds(call.body);
+    const std::string account = filledTextMember(call.body, "acc");
+    const auto password = plainPassword(textMember(call.body, "pass"));
+    if (!password) {
+        throw Refusal(Code::Malformed, "\"pass\" does not decipher");
+    }
+    service.withModel([&](Model &model) {
+        checkKnown(model, ids);
+        model.authorization.request(ids, account, *password, nowMs());
+    });
+    return {};
+}
+
+} // namespace
+
+Endpoints deviceEndpoints() {
+    return {
+        {"POST", "/v1/dev/list", Gate::Reader, &listDevices},
+        {"POST", "/v1/dstatus/list", Gate::Reader, &listStatuses},
+        {"POST", "/v1/dev/commit", Gate::Writer, &commitDeviceList},
+        {"POST", "/v1/dev/scan", Gate::Writer, &scan},
+        {"POST", "/v1/dev/scanip", Gate::Writer, &scanAddress},
+        {"POST", "/v1/dev/scanips", Gate::Writer, &scanRange},
+        {"POST", "/v1/dev/scanout", Gate::Reader, &scanResults},
+        {"POST", "/v1/dev/setpolicy", Gate::Writer, &setPolicy},
+        {"POST", "/v1/dev/auth", Gate::Writer, &authorize},
+    };
+}
+
+} // namespace emulator

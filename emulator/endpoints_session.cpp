@@ -1,0 +1,54 @@
+#include "clock.h"
+#include "credentials.h"
+#include "endpoint.h"
+#include "service.h"
+
+namespace emulator {
+
+namespace {
+
+Answer isAlive(Service &, const Call &) {
+    return {};
+}
+
+Answer login(Service &service, const Call &call) {
+    const std::string email = textMember(call.body, "email");
+    const auto password = plainPassword(textMember(call.body, "pass"));
+    const auto account = service.withModel([&](Model &model) { return model.accounts.find(email); });
+    // The hash is slow on purpose, so it is computed outside of the lock.
+    if (!password || !account || !passwordMatches(*password, account->password)) {
+        throw Refusal(Code::NotAccepted, "wrong e-mail or password");
+    }
+    Answer answer;
+    answer.token =
+        service.withModel([&](Model &model) { return model.sessions.open(account->email, nowMs()); });
+    return answer;
+}
+
+Answer logout(Service &service, const Call &call) {
+    service.withModel([&](Model &model) { model.sessions.close(call.session.session); });
+    return {};
+}
+
+Answer getSettings(Service &service, const Call &) {
+    return Answer::secret(service.withModel([](Model &model) { return model.settings.text(); }));
+}
+
+Answer setSettings(Service &service, const Call &call) {
+    service.withModel([&](Model &model) { model.settings.change(call.body); });
+    return {};
+}
+
+} // namespace
+
+Endpoints sessionEndpoints() {
+    return {
+        {"GET", "/isalive", Gate::Anybody, &isAlive},
+        {"POST", "/v1/login", Gate::Anybody, &login},
+        {"POST", "/v1/logout", Gate::Reader, &logout},
+        {"POST", "/v1/config/get", Gate::Reader, &getSettings},
+        {"POST", "/v1/config/set", Gate::Writer, &setSettings},
+    };
+}
+
+} // namespace emulator

@@ -1,0 +1,65 @@
+#include "clock.h"
+#include "endpoint.h"
+#include "service.h"
+
+namespace emulator {
+
+namespace {
+
+std::string parentOf(const Json &body) {
+    std::string parent = optionalText(body, "parentid");
+    return parent.empty() ? std::string(rootSiteId) : parent;
+}
+
+Answer newSite(Service &service, const Call &call) {
+    const std::string name = filledTextMember(call.body, "sitename");
+    const std::string parent = parentOf(call.body);
+    const std::string id =
+        service.withModel([&](Model &model) { return model.sites.add(name, parent, nowMs()); });
+    return Answer::secret(jsonText({{"siteid", id}}));
+}
+
+Answer updateSite(Service &service, const Call &call) {
+    const std::string id = filledTextMember(call.body, "siteid");
+    const std::string name = filledTextMember(call.body, "sitename");
+    const std::string parent = filledTextMember(call.body, "parentid");
+    service.withModel([&](Model &model) { model.sites.update(id, name, parent); });
+    return {};
+}
+
+Answer dropSite(Service &service, const Call &call) {
+    const std::string id = filledTextMember(call.body, "siteid");
+    service.withModel([&](Model &model) { removeSite(model, id); });
+    return {};
+}
+
+Answer listSites(Service &service, const Call &call) {
+    const Page page = pageOf(call.body);
+    return Answer::secret(service.withModel([&](Model &model) { return model.sites.pageText(page); }));
+}
+
+Answer commitSiteList(Service &service, const Call &call) {
+    const std::string stage = textMember(call.body, "state");
+    const Json &sites = arrayMember(call.body, "sites");
+    service.withModel([&](Model &model) {
+        const auto records = model.batches.take("sites " + call.session.session, stage, sites, nowMs());
+        if (records) {
+            commitSites(model, *records);
+        }
+    });
+    return {};
+}
+
+} // namespace
+
+Endpoints siteEndpoints() {
+    return {
+        {"POST", "/v1/site/new", Gate::Writer, &newSite},
+        {"POST", "/v1/site/update", Gate::Writer, &updateSite},
+        {"POST", "/v1/site/rms", Gate::Writer, &dropSite},
+        {"POST", "/v1/site/list", Gate::Reader, &listSites},
+        {"POST", "/v1/site/commit", Gate::Writer, &commitSiteList},
+    };
+}
+
+} // namespace emulator

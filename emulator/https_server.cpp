@@ -1,0 +1,192 @@
+#include "https_server.h"
+
+#include "delivery.h"
+#include "dispatcher.h"
+#include "faults.h"
+#include "service.h"
+#include "spoil.h"
+#include "stop_signal.h"
+
+#include <httplib.h>
+
+#include <iostream>
+#include <stdexcept>
+#include <thread>
+#include <utility>
+
+namespace emulator {
+
+namespace {
+
+constexpr std::size_t mostBodyBytes = 16U << 20;
+// Requests that are held without an answer keep their thread.
+constexpr std::size_t threads = 64;
+constexpr auto jsonType = "application/json";
+constexpr auto plainType = "text/plain";
+
+void fail(httplib::Response &response, int status, const std::string &why) {
+    response.status = status;
+    response.set_content(why + "\n", plainType);
+}
+
+void configure(httplib::SSLServer &server) {
+    SSL_CTX_set_min_proto_version(server.ssl_context(), TLS1_2_VERSION);
+    // Callers come back with a fresh connection each time; tickets that nobody reads would only disturb
+    // the close of a connection.
+    SSL_CTX_set_num_tickets(server.ssl_context(), 0);
+    server.new_task_queue = [] { return new httplib::ThreadPool(threads); };
+    server.set_tcp_nodelay(true);
+    server.set_keep_alive_timeout(2);
+    server.set_read_timeout(30);
+    server.set_write_timeout(30);
+}
+
+void logDefect(const httplib::Request &request, const std::exception_ptr &defect) {
+    try {
+        std::rethrow_exception(defect);
+    } catch (const std::exception &error) {
+        std::cerr << "nvldm-emulator: " + request.path + " failed: " + error.what() + "\n";
+    } catch (...) {
+        std::cerr << "nvldm-emulator: " + request.path + " failed\n";
+    }
+}
+
+} // namespace
+
+HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &stop, int latencyMs)
+    : m_service(service),
+      m_faults(faults),
+      m_stop(stop),
+      m_latencyMs(latencyMs),
+      m_identity(makeServerIdentity()),
+      m_dispatcher(std::make_unique<Dispatcher>(service)),
+      m_server(std::make_unique<httplib::SSLServer>(m_identity.certificate.get(), m_identity.key.get())) {
+    if (!m_server->is_valid()) {
+        throw std::runtime_error("the HTTPS server cannot be set up");
+    }
+    configure(*m_server);
+    route();
+}
+
+HttpsServer::~HttpsServer() = default;
+
+int HttpsServer::bind(const std::string &host, int port) {
+    const int bound = port == 0                            ? m_server->bind_to_any_port(host)
+                      : m_server->bind_to_port(host, port) ? port
+                                                           : -1;
+    if (bound <= 0) {
+        throw std::runtime_error("cannot listen on " + host + ":" + std::to_string(port));
+    }
+    return bound;
+}
+
+void HttpsServer::serve() {
+    m_server->listen_after_bind();
+}
+
+void HttpsServer::waitUntilServing() const {
+    while (!m_server->is_running()) {
+        std::this_thread::sleep_for(std::chrono::milliseconds(1));
+    }
+}
+
+void HttpsServer::stop() {
+    m_server->stop();
+}
+
+void HttpsServer::route() {
+    const auto withoutBody = [this](const httplib::Request &request, httplib::Response &response) {
+        handle(request, response, [](const auto &) { return true; });
+    };
+    // Only a handler that reads the body itself gets a long one: the library holds bodies of this content
+    // type to eight kilobytes otherwise.
+    const auto withBody = [this](const httplib::Request &request, httplib::Response &response,
+                                 const httplib::ContentReader &reader) {
+        handle(request, response, [&](const auto &take) { return reader(take); });
+    };
+    m_server->Get(".*", withoutBody);
+    m_server->Options(".*", withoutBody);
+    m_server->Post(".*", withBody);
+    m_server->Put(".*", withBody);
+    m_server->Patch(".*", withBody);
+    m_server->Delete(".*", withBody);
+    m_server->set_exception_handler(
+        [](const httplib::Request &request, httplib::Response &response, const std::exception_ptr &defect) {
+            logDefect(request, defect);
+            fail(response, 500, "internal error");
+        });
+}
+
+void HttpsServer::handle(const httplib::Request &request, httplib::Response &response,
+                         const BodyReader &readBody) {
+    Incoming incoming{request.method,
+                      request.path,
+                      request.get_header_value("Authorization"),
+                      request.get_header_value("Content-Type"),
+                      {}};
+    bool tooLong = false;
+    // A body that is too long is still read to its end, or its sender would see a broken connection.
+    const bool whole = readBody([&](const char *bytes, std::size_t count) {
+        tooLong = tooLong || incoming.body.size() + count > mostBodyBytes;
+        if (!tooLong) {
+            incoming.body.append(bytes, count);
+        }
+        return true;
+    });
+    if (tooLong) {
+        fail(response, 413, "the body is too long");
+    } else if (!whole) {
+        fail(response, 400, "the body is incomplete");
+    } else {
+        judge(request, response, incoming);
+    }
+}
+
+void HttpsServer::judge(const httplib::Request &request, httplib::Response &response,
+                        const Incoming &incoming) {
+    const FaultPlan plan = m_faults.planFor(incoming.path);
+    const int delay = m_latencyMs + plan.lateMs;
+    if (delay > 0 && m_stop.waitFor(std::chrono::milliseconds(delay))) {
+        return fail(response, 503, "the service stops");
+    }
+    if (plan.expire) {
+        m_service.withModel([](Model &model) { model.sessions.closeAll(); });
+    }
+    if (plan.main && plan.main->kind == FaultKind::NoAnswer) {
+        return holdUnanswered(request, m_stop);
+    }
+    if (plan.main && plan.main->kind == FaultKind::Status) {
+        response.status = plan.main->number;
+        return response.set_content(envelope({}), jsonType);
+    }
+    const Endpoint *endpoint = m_dispatcher->find(incoming.path);
+    if (!endpoint) {
+        return fail(response, 404, "no such path");
+    }
+    if (endpoint->verb != incoming.verb) {
+        response.set_header("Allow", endpoint->verb);
+        return fail(response, 405, "no such verb here");
+    }
+    answer(request, response, incoming, plan);
+}
+
+void HttpsServer::answer(const httplib::Request &request, httplib::Response &response,
+                         const Incoming &incoming, const FaultPlan &plan) {
+    if (plan.main && plan.main->kind == FaultKind::AnswerCode) {
+        return response.set_content(envelope(Answer::refused(plan.main->number, "fault")), jsonType);
+    }
+    Answer answer = m_dispatcher->answer(*m_dispatcher->find(incoming.path), incoming, plan.renew);
+    if (!answer.token.empty()) {
+        response.set_header("Authorization", answer.token);
+    }
+    std::string body = plan.main ? spoiledBody(std::move(answer), *plan.main) : envelope(answer);
+    if (plan.main && plan.main->kind == FaultKind::Reset) {
+        deliverHalf(request, response, std::move(body));
+    } else if (plan.main && plan.main->kind == FaultKind::Drip) {
+        deliverDripping(response, std::move(body), m_stop);
+    } else {
+        response.set_content(std::move(body), jsonType);
+    }
+}
+
+} // namespace emulator

@@ -1,0 +1,118 @@
+#include "life.h"
+
+#include "model.h"
+#include "random.h"
+
+#include <array>
+#include <utility>
+
+namespace emulator {
+
+namespace {
+
+constexpr auto tickKey = "tick";
+// Outages of sixty ticks on the average, three devices of a hundred at a time.
+constexpr double dropsPerDevice = 0.03 / 60;
+constexpr double actionsPerDevice = 0.005 / 12;
+constexpr int mostTries = 8;
+
+std::uint64_t keptTick(Store &store) {
+    const std::string text = store.value(tickKey);
+    return text.empty() ? 0 : std::stoull(text);
+}
+
+} // namespace
+
+Life::Life(Model &model) : m_model(model), m_seed(model.seed()), m_tick(keptTick(model.store)) {
+    resume();
+}
+
+void Life::tick() {
+    ++m_tick;
+    m_draws = 0;
+    Transaction transaction(m_model.store.database());
+    takeTurns();
+    dropSome();
+    keepSomeBusy();
+    m_model.store.setValue(tickKey, std::to_string(m_tick));
+    transaction.commit();
+}
+
+/// Devices that are away at the start have nobody yet who brings them back.
+void Life::resume() {
+    for (std::size_t i = 0; i < m_model.devices.size(); ++i) {
+        const Device &device = m_model.devices.at(i);
+        if (!device.reachable && !device.held) {
+            after(1 + draw(100), {device.id, {}});
+        }
+    }
+}
+
+void Life::takeTurns() {
+    for (auto due = m_turns.begin(); due != m_turns.end() && due->first <= m_tick; due = m_turns.erase(due)) {
+        for (const Turn &turn : due->second) {
+            Device *device = m_model.devices.find(turn.device);
+            if (!device) {
+                continue;
+            }
+            if (!turn.action.empty()) {
+                // A command may have given the device something else to do meanwhile.
+                device->action = device->action == turn.action ? standby : device->action;
+            } else if (!device->held && !device->reachable) {
+                device->reachable = true;
+                m_model.devices.saveState(*device);
+            }
+        }
+    }
+}
+
+void Life::dropSome() {
+    for (std::uint64_t n = shareOf(dropsPerDevice); n > 0; --n) {
+        if (Device *device = pickIdle()) {
+            device->reachable = false;
+            m_model.devices.saveState(*device);
+            after(20 + draw(81), {device->id, {}});
+        }
+    }
+}
+
+void Life::keepSomeBusy() {
+    static constexpr std::array actions = {"deviceRestart", "deviceRestart", "configuration_file",
+                                           "quick_setup"};
+    for (std::uint64_t n = shareOf(actionsPerDevice); n > 0; --n) {
+        Device *device = pickIdle();
+        if (device && device->authorization == Authorization::Authorized) {
+            device->action = actions[draw(actions.size())];
+            after(5 + draw(15), {device->id, device->action});
+        }
+    }
+}
+
+Device *Life::pickIdle() {
+    for (int tries = 0; tries < mostTries && m_model.devices.size() != 0; ++tries) {
+        Device &device = m_model.devices.at(draw(m_model.devices.size()));
+        if (device.reachable && !device.held && device.action == standby) {
+            return &device;
+        }
+    }
+    return nullptr;
+}
+
+/// The whole part of a share always, the rest of it by chance, so that a small fleet lives as well.
+std::uint64_t Life::shareOf(double perDevice) {
+    const double share = perDevice * static_cast<double>(m_model.devices.size());
+    const auto whole = static_cast<std::uint64_t>(share);
+    constexpr std::uint64_t fine = 1U << 20;
+    return whole + (static_cast<double>(draw(fine)) / fine < share - static_cast<double>(whole) ? 1 : 0);
+}
+
+void Life::after(std::uint64_t ticks, Turn turn) {
+    m_turns[m_tick + ticks].push_back(std::move(turn));
+}
+
+/// A generator that starts anew with each tick survives a restart without being stored.
+std::uint64_t Life::draw(std::uint64_t limit) {
+    return mixed(mixed(m_seed ^ 0x11fe) ^ mixed(m_tick) ^ ++m_draws) % limit;
+}
+
+} // namespace emulator

@@ -1,0 +1,129 @@
+#include "control.h"
+#include "credentials.h"
+#include "faults.h"
+#include "https_server.h"
+#include "nvlcrypto.h"
+#include "options.h"
+#include "service.h"
+#include "service_files.h"
+#include "stop_signal.h"
+
+#include <signal.h>
+#include <sys/stat.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <future>
+#include <iostream>
+#include <string>
+#include <vector>
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr int usageStatus = 2;
+
+/// Blocked in every thread, so that the main thread alone takes them.
+sigset_t blockStopSignals() {
+    sigset_t stops;
+    sigemptyset(&stops);
+    sigaddset(&stops, SIGTERM);
+    sigaddset(&stops, SIGINT);
+    pthread_sigmask(SIG_BLOCK, &stops, nullptr);
+    return stops;
+}
+
+void useKeyOf(const std::filesystem::path &folder) {
+    const std::string path = folder.string();
+    nvlcryptoSetKeyFolder(path.data(), path.size());
+    if (!emulator::ciphersWork()) {
+        throw std::runtime_error("the key file in " + path + " cannot be used");
+    }
+}
+
+void live(emulator::Service &service, const emulator::StopSignal &stop, int lifeMs) {
+    // Without a life there is still work that falls due.
+    const auto period = lifeMs > 0 ? std::chrono::milliseconds(lifeMs) : 1000ms;
+    service.letLive(lifeMs > 0);
+    while (!stop.waitFor(period)) {
+        try {
+            service.lookAfter();
+        } catch (const std::exception &error) {
+            std::cerr << std::string("nvldm-emulator: a tick failed: ") + error.what() + "\n";
+        }
+    }
+}
+
+/// A caller that stalls in the middle of its request must not hold the program; what is in the store is whole
+/// at any time.
+void leaveWithin(const std::future<void> &ended, const emulator::ServiceFiles &files) {
+    files.writeStopped();
+    if (ended.wait_for(3s) != std::future_status::ready) {
+        std::_Exit(0);
+    }
+}
+
+int serve(const emulator::Options &options) {
+    const sigset_t stops = blockStopSignals();
+    const emulator::ServiceFiles files(options.root);
+    if (options.fresh) {
+        files.discardStore();
+    }
+    useKeyOf(options.root);
+    emulator::Faults faults(options.seed);
+    for (const std::string &fault : options.faults) {
+        faults.add(fault);
+    }
+    emulator::Service service(options, files.storePath());
+    emulator::StopSignal stop;
+    emulator::HttpsServer server(service, faults, stop, options.latencyMs);
+    const int port = server.bind(options.host, options.port);
+    files.writePort(port);
+    files.writeRunning();
+    const auto serving = std::async(std::launch::async, [&] { server.serve(); });
+    const auto living = std::async(std::launch::async, [&] { live(service, stop, options.lifeMs); });
+    const emulator::Control control(service, faults, stop);
+    server.waitUntilServing();
+    std::cout << "nvldm-emulator: listening on https://" << options.host << ':' << port << std::endl;
+    int signal = 0;
+    sigwait(&stops, &signal);
+    stop.raise();
+    server.stop();
+    leaveWithin(serving, files);
+    return 0;
+}
+
+int run(const emulator::Options &options) {
+    if (options.help) {
+        std::cout << emulator::helpText();
+        return 0;
+    }
+    if (options.version) {
+        std::cout << "nvldm-emulator " NVLDM_VERSION "\n";
+        return 0;
+    }
+    for (const std::string &fault : options.faults) {
+        emulator::readFault(fault);
+    }
+    return serve(options);
+}
+
+} // namespace
+
+int main(int argc, char *argv[]) {
+    signal(SIGPIPE, SIG_IGN);
+    umask(077);
+    try {
+        return run(emulator::readOptions({argv + 1, argv + argc}));
+    } catch (const emulator::UsageError &error) {
+        std::cerr << "nvldm-emulator: " << error.what() << " (see --help)\n";
+        return usageStatus;
+    } catch (const emulator::FaultError &error) {
+        std::cerr << "nvldm-emulator: --fault: " << error.what() << " (see --help)\n";
+        return usageStatus;
+    } catch (const std::exception &error) {
+        std::cerr << "nvldm-emulator: " << error.what() << '\n';
+        return 1;
+    }
+}

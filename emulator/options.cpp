@@ -1,0 +1,166 @@
+#include "options.h"
+
+#include <charconv>
+#include <functional>
+#include <map>
+#include <optional>
+
+namespace emulator {
+
+namespace {
+
+constexpr auto help =
+    R"(Usage: nvldm-emulator --root DIR [option]...
+
+Plays the device manager service and its fleet over HTTPS.
+
+Place and store
+  --root DIR            folder of the service's files and of the emulator's store (made when missing)
+  --host ADDRESS        address to listen on (127.0.0.1)
+  --port N              port to listen on; 0 takes a free one (0)
+  --fresh               throw an existing store away; without it the store's fleet is kept
+Fleet
+  --devices N           devices of a new fleet (500)
+  --sites N             sites of a new fleet (12)
+  --seed N              the same seed makes the same fleet and the same life (1)
+  --odd-records         add records with missing, wrong and hostile members
+  --life MS             length of a tick of the fleet's life; 0 holds it still (1000)
+Accounts
+  --account EMAIL:PASSWORD[:PERMISSION]
+                        have this account (admin, operator or viewer; admin when left out); repeatable.
+                        Without one a new store holds the factory account "admin", password "admin"
+  --session-limit N     sessions at a time; a login beyond answers 108; 0 is no limit (0)
+Behaviour
+  --latency MS          added to each answer
+  --batch-timeout MS    life of a commit that was started and not ended (60000)
+  --token-grace MS      how long a token stays good after its renewal (60000)
+  --fault FAULT         answer badly; repeatable
+  --help, --version
+
+FAULT is KIND[=VALUE][@PATH][,after=N][,times=N][,rate=P]. It hits requests whose path begins with PATH (all
+when left out), not the first N of them (after), N times at most (times), each with the probability P (rate).
+  no-answer             take the request and never answer
+  late=MS               answer MS later
+  reset                 send half of the body, then reset the connection
+  status=N              answer with this HTTP status and do nothing
+  not-json              do the work, answer something that is no JSON
+  wrong-types[=WHERE]   members have other JSON types; WHERE: members (default), data, code
+  no-data               leave "data" out
+  bad-cipher            ciphered "data" does not decipher
+  code=N                answer this code and do nothing
+  renew                 renew the session token on every answer
+  expire                forget every session before the request is judged
+  drip                  send the body one byte a second
+
+Commands on standard input, one a line, each answered by one line "ok ..." or "error ..." on standard error:
+  fault FAULT           faults clear          expire-sessions       counts           stop
+  drop ID|N             restore ID|all        remove ID             add N            life on|off
+  status ID AUTH CONNECT ACTION    texts with blanks in double quotes, "-" keeps what is there
+  tick N                live N ticks at once
+
+Devices that nobody manages yet answer to scans at 10.99.0.10 to 10.99.0.49. A device lets the account "root" in
+with any password of 8 characters or more and denies other accounts; a shorter password is wrong, and three
+wrong ones block the account for a minute.
+)";
+
+template <typename Number>
+Number numberOf(const std::string &name, const std::string &text, Number least, Number most) {
+    Number value{};
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+    if (error != std::errc() || end != text.data() + text.size() || value < least || value > most) {
+        throw UsageError(name + " takes a number from " + std::to_string(least) + " to " +
+                         std::to_string(most));
+    }
+    return value;
+}
+
+template <typename Number>
+std::function<void(const std::string &)> numberInto(const std::string &name, Number &target, Number most) {
+    return [name, &target, most](const std::string &text) {
+        target = numberOf<Number>(name, text, Number{0}, most);
+    };
+}
+
+StartAccount accountOf(const std::string &text) {
+    const auto afterEmail = text.find(':');
+    if (afterEmail == 0 || afterEmail == std::string::npos) {
+        throw UsageError("--account takes EMAIL:PASSWORD[:PERMISSION]");
+    }
+    StartAccount account{text.substr(0, afterEmail), text.substr(afterEmail + 1), "admin"};
+    // The permission is a closed set, so a password may hold colons.
+    for (const std::string permission : {"admin", "operator", "viewer"}) {
+        const std::string suffix = ":" + permission;
+        if (account.password.ends_with(suffix)) {
+            account.password.erase(account.password.size() - suffix.size());
+            account.permission = permission;
+            break;
+        }
+    }
+    if (account.password.empty()) {
+        throw UsageError("--account takes EMAIL:PASSWORD[:PERMISSION]");
+    }
+    return account;
+}
+
+using Setters = std::map<std::string, std::function<void(const std::string &)>>;
+
+Setters valueSetters(Options &options) {
+    constexpr int longestMs = 3600000;
+    constexpr std::int64_t longestHold = 3600000;
+    return {
+        {"--host", [&](const std::string &text) { options.host = text; }},
+        {"--port", numberInto("--port", options.port, 65535)},
+        {"--devices", numberInto<std::size_t>("--devices", options.devices, 200000)},
+        {"--sites", numberInto<std::size_t>("--sites", options.sites, 5000)},
+        {"--seed", numberInto<std::uint64_t>("--seed", options.seed, UINT64_MAX)},
+        {"--root", [&](const std::string &text) { options.root = text; }},
+        {"--latency", numberInto("--latency", options.latencyMs, longestMs)},
+        {"--life", numberInto("--life", options.lifeMs, longestMs)},
+        {"--session-limit", numberInto<std::size_t>("--session-limit", options.sessionLimit, 1000000)},
+        {"--batch-timeout", numberInto("--batch-timeout", options.batchTimeoutMs, longestHold)},
+        {"--token-grace", numberInto("--token-grace", options.tokenGraceMs, longestHold)},
+        {"--fault", [&](const std::string &text) { options.faults.push_back(text); }},
+        {"--account", [&](const std::string &text) { options.accounts.push_back(accountOf(text)); }},
+    };
+}
+
+std::map<std::string, bool *> switches(Options &options) {
+    return {{"--fresh", &options.fresh},
+            {"--odd-records", &options.oddRecords},
+            {"--help", &options.help},
+            {"--version", &options.version}};
+}
+
+} // namespace
+
+Options readOptions(const std::vector<std::string> &arguments) {
+    Options options;
+    const Setters values = valueSetters(options);
+    const auto flags = switches(options);
+    for (std::size_t i = 0; i < arguments.size(); ++i) {
+        const std::string &argument = arguments[i];
+        const auto equals = argument.starts_with("--") ? argument.find('=') : std::string::npos;
+        const std::string name = argument.substr(0, equals);
+        if (const auto flag = flags.find(argument); flag != flags.end()) {
+            *flag->second = true;
+        } else if (const auto value = values.find(name); value == values.end()) {
+            throw UsageError("unknown option " + argument);
+        } else if (equals != std::string::npos) {
+            value->second(argument.substr(equals + 1));
+        } else if (i + 1 == arguments.size()) {
+            throw UsageError(name + " needs a value");
+        } else {
+            value->second(arguments[++i]);
+        }
+    }
+    if (options.root.empty() && !options.help && !options.version) {
+        throw UsageError("a folder is needed: --root DIR");
+    }
+    return options;
+}
+
+std::string helpText() {
+    return help;
+}
+
+} // namespace emulator

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+namespace emulator {
+
+/// An account that the command line asks for.
+struct StartAccount {
+    std::string email;
+    std::string password;
+    std::string permission;
+};
+
+/// What the command line says.
+struct Options {
+    std::string host = "127.0.0.1";
+    int port = 0;
+    std::size_t devices = 500;
+    std::size_t sites = 12;
+    std::uint64_t seed = 1;
+    std::filesystem::path root;
+    int latencyMs = 0;
+    int lifeMs = 1000;
+    std::size_t sessionLimit = 0;
+    std::int64_t batchTimeoutMs = 60000;
+    std::int64_t tokenGraceMs = 60000;
+    std::vector<std::string> faults;
+    std::vector<StartAccount> accounts;
+    bool fresh = false;
+    bool oddRecords = false;
+    bool help = false;
+    bool version = false;
+};
+
+class UsageError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+/// Throws UsageError for anything that is not understood.
+Options readOptions(const std::vector<std::string> &arguments);
+
+std::string helpText();
+
+} // namespace emulator

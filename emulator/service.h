@@ -1,0 +1,49 @@
+#pragma once
+
+#include "generic_token.h"
+#include "life.h"
+#include "model.h"
+
+#include <filesystem>
+#include <mutex>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace emulator {
+
+struct Options;
+
+/// The service behind the endpoints: its knowledge under one lock, and what lives beside it.
+class Service {
+public:
+    /// Opens the store in the folder, makes the fleet where there is none and says so on standard error.
+    Service(const Options &options, const std::filesystem::path &storePath);
+
+    /// Runs work on the model, alone. Nothing slow belongs in there: every request waits for it.
+    template <typename Work>
+    auto withModel(Work work) {
+        const std::lock_guard lock(m_mutex);
+        return work(m_model);
+    }
+
+    const GenericTokenJudge &genericTokens() const { return m_genericTokens; }
+
+    /// Does what has fallen due and, unless life is off, lives one tick.
+    void lookAfter();
+    /// Lives one tick, life off or not.
+    void liveTick();
+    void letLive(bool lives);
+
+private:
+    void prepareFleet(const Options &options);
+    void prepareAccounts(const Options &options);
+
+    GenericTokenJudge m_genericTokens;
+    std::mutex m_mutex;
+    Model m_model;
+    std::unique_ptr<Life> m_life;
+    bool m_lives = true;
+};
+
+} // namespace emulator

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <filesystem>
+
+namespace emulator {
+
+/// The files in which others look for the service, all readable by their owner only.
+class ServiceFiles {
+public:
+    /// Makes the folder and claims it for this process. Throws std::runtime_error when that fails or another
+    /// emulator has it.
+    explicit ServiceFiles(std::filesystem::path folder);
+    ~ServiceFiles();
+    ServiceFiles(const ServiceFiles &) = delete;
+    ServiceFiles &operator=(const ServiceFiles &) = delete;
+
+    std::filesystem::path storePath() const { return m_folder / "nvldm-emulator.sdb"; }
+    void discardStore() const;
+
+    void writePort(int port) const;
+    void writeRunning() const;
+    void writeStopped() const;
+
+private:
+    void writeState(const char *state) const;
+
+    std::filesystem::path m_folder;
+    int m_lock = -1;
+};
+
+} // namespace emulator
