@@ -7,7 +7,7 @@
 namespace {
 
 constexpr std::size_t bodyLimit = 64u << 20;
-/// Of the head, give or take the one TLS record (16 KiB) in which it is passed.
+/// Of the head; the TLS record (16 KiB) that goes beyond it is still read.
 constexpr std::size_t headLimit = 16u << 10;
 constexpr const char *clientCertificate = "./client.cer";
 constexpr const char *clientKey = "./client.key";
@@ -34,9 +34,10 @@ private:
     }
 
     void addRecord(std::size_t length, SSL *session) {
-        m_received += length;
+        // What came before counts: a record may hold the end of the head and the beginning of the body.
         if (!m_lifted && m_received > headLimit)
             SSL_set_shutdown(session, SSL_get_shutdown(session) | SSL_RECEIVED_SHUTDOWN);
+        m_received += length;
     }
 
     std::size_t m_received = 0;
