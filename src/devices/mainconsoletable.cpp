@@ -206,8 +206,11 @@ void MainConsoleTable::restorePlace(const Place &place) {
                                               QItemSelectionModel::NoUpdate);
         selectionModel()->select(selection, QItemSelectionModel::Select);
     }
-    if (topRow >= 0)
+    if (topRow >= 0) {
+        // Rows that came with this reading widen the scroll range only with the next layout.
+        executeDelayedItemsLayout();
         verticalScrollBar()->setValue(topRow * Theme::rowHeight - place.topOffset);
+    }
     if (count != std::count(place.selected.begin(), place.selected.end(), true))
         emit selectedDevicesChanged();
 }

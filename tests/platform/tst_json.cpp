@@ -1,0 +1,67 @@
+#include "json.h"
+
+#include <QTest>
+
+#include <nlohmann/json.hpp>
+
+class TestJson : public QObject {
+    Q_OBJECT
+
+private slots:
+    void nesting_data();
+    void nesting();
+    void refusesWhatIsNoJson_data();
+    void refusesWhatIsNoJson();
+    void dumpReplacesWhatIsNoUtf8();
+};
+
+void TestJson::nesting_data() {
+    QTest::addColumn<std::string>("text");
+    QTest::addColumn<bool>("taken");
+    const auto nested = [](std::size_t levels, const std::string &open, const std::string &close) {
+        std::string text;
+        for (std::size_t i = 0; i < levels; ++i)
+            text += open;
+        text += "1";
+        for (std::size_t i = 0; i < levels; ++i)
+            text += close;
+        return text;
+    };
+    QTest::newRow("64 arrays") << nested(64, "[", "]") << true;
+    QTest::newRow("65 arrays") << nested(65, "[", "]") << false;
+    QTest::newRow("64 objects") << nested(64, R"({"a":)", "}") << true;
+    QTest::newRow("65 objects") << nested(65, R"({"a":)", "}") << false;
+    QTest::newRow("a million arrays, never closed") << std::string(1000000, '[') << false;
+    QTest::newRow("many values side by side") << "[" + nested(1000, "[],", "") + "]" << true;
+}
+
+void TestJson::nesting() {
+    QFETCH(std::string, text);
+    QFETCH(bool, taken);
+    if (taken)
+        QCOMPARE(dumpJson(parseJson(text)), text);
+    else
+        QVERIFY_THROWS_EXCEPTION(std::exception, parseJson(text));
+}
+
+void TestJson::refusesWhatIsNoJson_data() {
+    QTest::addColumn<std::string>("text");
+    QTest::newRow("nothing") << std::string();
+    QTest::newRow("page") << std::string("<html></html>");
+    QTest::newRow("cut off") << std::string(R"({"a":)");
+    QTest::newRow("two values") << std::string("{}{}");
+    QTest::newRow("no UTF-8") << std::string("\"\xff\xfe\"");
+}
+
+void TestJson::refusesWhatIsNoJson() {
+    QFETCH(std::string, text);
+    QVERIFY_THROWS_EXCEPTION(JSON::parse_error, parseJson(text));
+}
+
+void TestJson::dumpReplacesWhatIsNoUtf8() {
+    const JSON value = {{"name", "a\xff z\xc3\xa4"}};
+    QCOMPARE(dumpJson(value), std::string("{\"name\":\"a\xef\xbf\xbd z\xc3\xa4\"}"));
+}
+
+QTEST_APPLESS_MAIN(TestJson)
+#include "tst_json.moc"
