@@ -39,10 +39,13 @@ unsigned CApiLocalClient::newMember(const char *szEmail, const char *szPassword,
     if (!szEmail || !szPassword)
         return ApiInvalidArgument;
     const std::optional<std::string> cipher = Ciphers::sealSecret(szPassword);
+    // An account without a password is not what anybody asked for.
+    if (!cipher)
+        return ApiException;
     return post(
         {.method = "newMember", .path = "/v1/accm/new", .genericToken = true, .judgeCode = judgeAccountCode},
         {{"email", szEmail},
-         {"pass", cipher.value_or("")},
+         {"pass", *cipher},
          {"name", textOrEmpty(szName)},
          {"permi", textOrEmpty(szPermission)},
          {"desp", textOrEmpty(szDescription)}});

@@ -90,7 +90,6 @@ void RemoteConnectionDialog::fillTable() {
         ++row;
     }
     filterRows();
-    updateButtons();
 }
 
 void RemoteConnectionDialog::filterRows() {
@@ -101,6 +100,7 @@ void RemoteConnectionDialog::filterRows() {
                              text(server, "info").contains(wanted, Qt::CaseInsensitive);
         m_ui->tableWidget->setRowHidden(row, !matches);
     }
+    updateButtons();
 }
 
 int RemoteConnectionDialog::selectedRow() const {

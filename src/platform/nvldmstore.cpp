@@ -42,7 +42,7 @@ StoreFile &storeFile(const std::string &path) {
     return *entry;
 }
 
-/// A connection that writes is kept; it is opened anew when the file was replaced or removed under it.
+/// A connection that writes is kept; it is opened anew when the file was removed under it.
 SQLite::Database &writer(StoreFile &file, const std::string &path) {
     const QString name = QString::fromStdString(path);
     if (file.writer && !QFileInfo::exists(name))
