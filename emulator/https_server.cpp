@@ -70,10 +70,13 @@ HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &sto
 
 HttpsServer::~HttpsServer() = default;
 
-int HttpsServer::bind(const std::string &host, int port) {
-    const int bound = port == 0                            ? m_server->bind_to_any_port(host)
-                      : m_server->bind_to_port(host, port) ? port
-                                                           : -1;
+int HttpsServer::bind(const std::string &host, int port, int lastPort) {
+    const bool any = port == 0;
+    // A running client looks for the service where it was.
+    if (const int wanted = any ? lastPort : port; wanted != 0 && m_server->bind_to_port(host, wanted)) {
+        return wanted;
+    }
+    const int bound = any ? m_server->bind_to_any_port(host) : -1;
     if (bound <= 0) {
         throw std::runtime_error("cannot listen on " + host + ":" + std::to_string(port));
     }

@@ -27,8 +27,9 @@ public:
     HttpsServer(Service &service, Faults &faults, const StopSignal &stop, int latencyMs);
     ~HttpsServer();
 
-    /// Gives the port; throws std::runtime_error when the address cannot be had.
-    int bind(const std::string &host, int port);
+    /// Listens on the port; for 0 on the last one if it is still free, or on any. Gives the port; throws
+    /// std::runtime_error when the address cannot be had.
+    int bind(const std::string &host, int port, int lastPort);
     /// Serves until stop.
     void serve();
     /// To be called before stop, which the library does not notice while it is still starting.

@@ -78,7 +78,7 @@ int serve(const emulator::Options &options) {
     emulator::Service service(options, files.storePath());
     emulator::StopSignal stop;
     emulator::HttpsServer server(service, faults, stop, options.latencyMs);
-    const int port = server.bind(options.host, options.port);
+    const int port = server.bind(options.host, options.port, files.lastPort());
     files.writePort(port);
     files.writeRunning();
     const auto serving = std::async(std::launch::async, [&] { server.serve(); });

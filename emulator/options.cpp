@@ -17,7 +17,7 @@ Plays the device manager service and its fleet over HTTPS.
 Place and store
   --root DIR            folder of the service's files and of the emulator's store (made when missing)
   --host ADDRESS        address to listen on (127.0.0.1)
-  --port N              port to listen on; 0 takes a free one (0)
+  --port N              port to listen on; 0: that of the last run, or a free one (0)
   --fresh               throw an existing store away; without it the store's fleet is kept
 Fleet
   --devices N           devices of a new fleet (500)

@@ -60,6 +60,22 @@ void ServiceFiles::discardStore() const {
     }
 }
 
+int ServiceFiles::lastPort() const {
+    const auto path = m_folder / "nvldmsvc.sdb";
+    if (!std::filesystem::exists(path)) {
+        return 0;
+    }
+    const Database database(path);
+    // A run that was killed at its start has left a file without the table.
+    Statement table(database, "SELECT 1 FROM sqlite_master WHERE name = 'svcMainT'");
+    if (!table.step()) {
+        return 0;
+    }
+    Statement query(database, "SELECT json_extract(value, '$.port') FROM svcMainT "
+                              "WHERE key = 'kSvcAndTrayServerPort' AND json_valid(value)");
+    return query.step() ? static_cast<int>(query.integer(0)) : 0;
+}
+
 void ServiceFiles::writePort(int port) const {
     Database database(m_folder / "nvldmsvc.sdb");
     // Readers open this file read-only, which a write-ahead log does not allow.

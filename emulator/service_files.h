@@ -17,6 +17,8 @@ public:
     std::filesystem::path storePath() const { return m_folder / "nvldm-emulator.sdb"; }
     void discardStore() const;
 
+    /// The port of the last run, or 0 where there was none.
+    int lastPort() const;
     void writePort(int port) const;
     void writeRunning() const;
     void writeStopped() const;
