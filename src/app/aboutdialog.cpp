@@ -4,9 +4,8 @@
 #include "ui_aboutdialog.h"
 
 AboutDialog::AboutDialog(QWidget *parent)
-    : FramelessDialog(parent), m_ui(std::make_unique<Ui::AboutDialog>()) {
+    : FramelessDialog(parent), m_ui(formIn<Ui::AboutDialog>(content())) {
     setObjectName(QStringLiteral("AboutDialog"));
-    m_ui->setupUi(content());
     setWindowTitle(tr("About"));
     m_ui->logoLabel->setPixmap(Icons::pixmap(QStringLiteral(":/images/logo_mark.svg"), {48, 48}, 2.0));
     m_ui->nameLabel->setText(QCoreApplication::applicationName());

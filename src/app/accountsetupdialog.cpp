@@ -12,12 +12,6 @@
 
 namespace {
 
-std::unique_ptr<Ui::AccountSetupDialog> madeUi(QWidget *content) {
-    auto ui = std::make_unique<Ui::AccountSetupDialog>();
-    ui->setupUi(content);
-    return ui;
-}
-
 unsigned newAccount(const QString &email, const QString &password, bool remember) {
     const quint32 port = CConfigStore().serverPort();
     qDebug("create account: email: %s, pass: %s", qUtf8Printable(email),
@@ -39,7 +33,7 @@ unsigned newAccount(const QString &email, const QString &password, bool remember
 
 AccountSetupDialog::AccountSetupDialog(QWidget *parent)
     : FramelessDialog(parent),
-      m_ui(madeUi(content())),
+      m_ui(formIn<Ui::AccountSetupDialog>(content())),
       m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
       m_runner(new NetTask) {
     setObjectName(QStringLiteral("AccountSetupDialog"));

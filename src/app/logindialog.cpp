@@ -31,25 +31,9 @@ struct LoginDialog::Outcome {
     QByteArray token; ///< in cipher form
 };
 
-namespace {
-
-std::unique_ptr<Ui::LoginDialog> madeUi(QWidget *content) {
-    auto ui = std::make_unique<Ui::LoginDialog>();
-    ui->setupUi(content);
-    return ui;
-}
-
-QString text(const JSON &object, const char *name) {
-    const auto member = object.find(name);
-    return member != object.end() && member->is_string() ? QString::fromStdString(member->get<std::string>())
-                                                         : QString();
-}
-
-} // namespace
-
 LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
     : FramelessDialog(parent),
-      m_ui(madeUi(content())),
+      m_ui(formIn<Ui::LoginDialog>(content())),
       m_tip(m_ui->msgWarningIcon, m_ui->tipLabel),
       m_runner(new NetTask),
       m_servers(std::make_unique<JSON>(JSON::array())) {
@@ -104,7 +88,7 @@ void LoginDialog::showChosenFields() {
 void LoginDialog::chooseServer(const QString &serverId) {
     m_ui->remoteRadio->setChecked(true);
     for (std::size_t i = 0; i < m_servers->size(); ++i) {
-        if (text((*m_servers)[i], "id") == serverId)
+        if (stringMember((*m_servers)[i], "id") == serverId)
             m_ui->remoteComboBox->setCurrentIndex(static_cast<int>(i));
     }
     showChosenFields();
@@ -217,7 +201,7 @@ void LoginDialog::onUpdateSvr() {
     const QSignalBlocker blocker(m_ui->remoteComboBox);
     m_ui->remoteComboBox->clear();
     for (const JSON &server : *m_servers)
-        m_ui->remoteComboBox->addItem(text(server, "info"));
+        m_ui->remoteComboBox->addItem(stringMember(server, "info"));
     m_ui->remoteComboBox->setCurrentIndex(-1);
     m_ui->remoteComboBox->setEditText(typed);
 }
@@ -227,9 +211,9 @@ void LoginDialog::on_remoteComboBox_currentIndexChanged(int index) {
     if (index < 0 || static_cast<std::size_t>(index) >= m_servers->size())
         return;
     const JSON &server = (*m_servers)[static_cast<std::size_t>(index)];
-    m_ui->remoteEmailEdit->setText(text(server, "acc"));
-    m_ui->remotePassEdit->setText(text(server, "remember") == QLatin1String("YES") ? text(server, "pass")
-                                                                                   : QString());
+    m_ui->remoteEmailEdit->setText(stringMember(server, "acc"));
+    m_ui->remotePassEdit->setText(
+        stringMember(server, "remember") == QLatin1String("YES") ? stringMember(server, "pass") : QString());
 }
 
 void LoginDialog::manageServers() {

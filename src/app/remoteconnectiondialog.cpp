@@ -14,16 +14,6 @@
 
 namespace {
 
-std::unique_ptr<Ui::RemoteConnectionDialog> madeUi(QWidget *content) {
-    auto ui = std::make_unique<Ui::RemoteConnectionDialog>();
-    ui->setupUi(content);
-    return ui;
-}
-
-QString text(const JSON &server, const char *name) {
-    return QString::fromStdString(server.value(name, std::string()));
-}
-
 /// The list as a log line carries it.
 QByteArray logText(JSON servers) {
     for (JSON &server : servers)
@@ -48,7 +38,7 @@ QTableWidgetItem *cell(const QString &value) {
 
 RemoteConnectionDialog::RemoteConnectionDialog(QWidget *parent)
     : FramelessDialog(parent),
-      m_ui(madeUi(content())),
+      m_ui(formIn<Ui::RemoteConnectionDialog>(content())),
       m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
       m_servers(std::make_unique<JSON>(JSON::array())) {
     setObjectName(QStringLiteral("RemoteConnectionDialog"));
@@ -83,10 +73,10 @@ void RemoteConnectionDialog::fillTable() {
     m_ui->tableWidget->setRowCount(static_cast<int>(m_servers->size()));
     int row = 0;
     for (const JSON &server : *m_servers) {
-        qDebug("server name: %s, information: %s", qUtf8Printable(text(server, "svrname")),
-               qUtf8Printable(text(server, "info")));
-        m_ui->tableWidget->setItem(row, 0, cell(text(server, "svrname")));
-        m_ui->tableWidget->setItem(row, 1, cell(text(server, "info")));
+        qDebug("server name: %s, information: %s", qUtf8Printable(stringMember(server, "svrname")),
+               qUtf8Printable(stringMember(server, "info")));
+        m_ui->tableWidget->setItem(row, 0, cell(stringMember(server, "svrname")));
+        m_ui->tableWidget->setItem(row, 1, cell(stringMember(server, "info")));
         ++row;
     }
     filterRows();
@@ -96,8 +86,8 @@ void RemoteConnectionDialog::filterRows() {
     const QString wanted = m_ui->remoteSearchEdit->text().trimmed();
     for (int row = 0; row < m_ui->tableWidget->rowCount(); ++row) {
         const JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
-        const bool matches = text(server, "svrname").contains(wanted, Qt::CaseInsensitive) ||
-                             text(server, "info").contains(wanted, Qt::CaseInsensitive);
+        const bool matches = stringMember(server, "svrname").contains(wanted, Qt::CaseInsensitive) ||
+                             stringMember(server, "info").contains(wanted, Qt::CaseInsensitive);
         m_ui->tableWidget->setRowHidden(row, !matches);
     }
     updateButtons();
@@ -127,9 +117,9 @@ void RemoteConnectionDialog::openEditDialog() {
     if (row < 0)
         return;
     const JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
-    auto *dialog =
-        new EditServerDialog(text(server, "remember"), text(server, "svrname"), text(server, "info"),
-                             text(server, "acc"), text(server, "pass"), this);
+    auto *dialog = new EditServerDialog(stringMember(server, "remember"), stringMember(server, "svrname"),
+                                        stringMember(server, "info"), stringMember(server, "acc"),
+                                        stringMember(server, "pass"), this);
     dialog->setAttribute(Qt::WA_DeleteOnClose);
     connect(dialog, &EditServerDialog::editServer, this, &RemoteConnectionDialog::onEditServer);
     dialog->open();
@@ -155,7 +145,7 @@ void RemoteConnectionDialog::onEditServer(const QString &remember, const QString
     if (row < 0)
         return;
     JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
-    server = record(text(server, "id"), remember, name, info, email, password);
+    server = record(stringMember(server, "id"), remember, name, info, email, password);
     fillTable();
     m_ui->tableWidget->selectRow(row);
 }

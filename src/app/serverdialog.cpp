@@ -3,19 +3,9 @@
 #include "serveraddress.h"
 #include "ui_serverdialog.h"
 
-namespace {
-
-std::unique_ptr<Ui::ServerDialog> madeUi(QWidget *content) {
-    auto ui = std::make_unique<Ui::ServerDialog>();
-    ui->setupUi(content);
-    return ui;
-}
-
-} // namespace
-
 ServerDialog::ServerDialog(const QString &title, const QString &applyText, QWidget *parent)
     : FramelessDialog(parent),
-      m_ui(madeUi(content())),
+      m_ui(formIn<Ui::ServerDialog>(content())),
       m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel) {
     setWindowTitle(title);
     m_ui->applyButton->setText(applyText);

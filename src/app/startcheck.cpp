@@ -19,8 +19,10 @@ bool isFactoryAccount(const JSON &members) {
     const auto list = members.is_object() ? members.find("data") : members.end();
     if (list == members.end() || !list->is_array() || list->size() != 1 || !list->front().is_object())
         return false;
-    const auto email = list->front().find("email");
-    return email != list->front().end() && email->is_string() && (*email == "" || *email == "admin");
+    if (!list->front().contains("email") || !list->front()["email"].is_string())
+        return false;
+    const std::string_view email = textMember(list->front(), "email");
+    return email.empty() || email == "admin";
 }
 
 LocalService askLocalService() {

@@ -18,12 +18,6 @@ const JSON *member(const JSON &record, const char *name) {
     return found != record.end() && !found->is_null() ? &*found : nullptr;
 }
 
-QString rawText(const JSON &record, const char *name) {
-    const JSON *value = member(record, name);
-    return value && value->is_string() ? QString::fromStdString(value->get_ref<const std::string &>())
-                                       : QString();
-}
-
 std::optional<qint64> wholeNumber(const JSON &record, const char *name) {
     const JSON *value = member(record, name);
     if (!value)
@@ -168,25 +162,25 @@ QStringList siteIdsOf(const JSON &record) {
 
 void readColumns(const JSON &value, DeviceRecord &record) {
     Columns columns(record);
-    columns.setText(DeviceColumn::Model, rawText(value, "d_model"));
-    columns.setText(DeviceColumn::HostName, rawText(value, "d_hostname"));
-    const QString ip = rawText(value, "d_ip");
+    columns.setText(DeviceColumn::Model, stringMember(value, "d_model"));
+    columns.setText(DeviceColumn::HostName, stringMember(value, "d_hostname"));
+    const QString ip = stringMember(value, "d_ip");
     const quint64 ipKey = ipSortKey(ip);
     columns.set(DeviceColumn::Ip, ipKey == DeviceRecord::unknownKey ? unknownText : ip, ipKey);
-    const QString mac = rawText(value, "d_mac");
+    const QString mac = stringMember(value, "d_mac");
     columns.set(DeviceColumn::Mac, orUnknown(mac), macKey(mac));
-    const QString firmware = orUnknown(rawText(value, "d_fw"));
+    const QString firmware = orUnknown(stringMember(value, "d_fw"));
     columns.set(DeviceColumn::Firmware, firmware, versionKey(firmware));
     columns.setNumber(DeviceColumn::HttpPort, wholeNumber(value, "d_http"));
     columns.setNumber(DeviceColumn::HttpsPort, wholeNumber(value, "d_https"));
     columns.setFlag(DeviceColumn::Https, flag(value, "https_enable"));
     columns.setFlag(DeviceColumn::Ieee8021x, flag(value, "ieee8021x_enable"));
-    columns.setText(DeviceColumn::SdCardStatus, cardStatusText(rawText(value, "d_sdstatus")));
+    columns.setText(DeviceColumn::SdCardStatus, cardStatusText(stringMember(value, "d_sdstatus")));
     columns.setNumber(DeviceColumn::SdCardUsage, wholeNumber(value, "d_sdusage"));
-    const QString time = orUnknown(rawText(value, "d_dtime"));
+    const QString time = orUnknown(stringMember(value, "d_dtime"));
     columns.set(DeviceColumn::DateTime, time, digitsKey(time));
     columns.setNumber(DeviceColumn::PowerFrequency, wholeNumber(value, "d_powerfreq"));
-    columns.setText(DeviceColumn::Audio, audioText(rawText(value, "d_audio")));
+    columns.setText(DeviceColumn::Audio, audioText(stringMember(value, "d_audio")));
 }
 
 } // namespace
@@ -213,11 +207,9 @@ quint64 ipSortKey(QStringView text) {
 }
 
 QString identityOf(const JSON &value) {
-    if (!value.is_object())
-        return {};
-    if (const QString id = rawText(value, "id"); !id.isEmpty())
+    if (const QString id = stringMember(value, "id"); !id.isEmpty())
         return id;
-    return rawText(value, "d_mac").toUpper().remove(u':').remove(u'-').remove(u'.');
+    return stringMember(value, "d_mac").toUpper().remove(u':').remove(u'-').remove(u'.');
 }
 
 DeviceRecordPtr parse(const JSON &value) {
@@ -225,7 +217,7 @@ DeviceRecordPtr parse(const JSON &value) {
     record->id = identityOf(value);
     if (record->id.isEmpty())
         return nullptr;
-    record->deviceClass = classOf(rawText(value, "d_svrtype"));
+    record->deviceClass = classOf(stringMember(value, "d_svrtype"));
     record->siteIds = siteIdsOf(value);
     readColumns(value, *record);
     record->json = dumpJson(value);

@@ -25,6 +25,19 @@ QLabel *picture(const QString &resource) {
     return label;
 }
 
+/// A page with its parts one below the other, in the middle.
+QWidget *makePage(const char *name, std::initializer_list<QWidget *> parts) {
+    auto *page = new QWidget;
+    page->setObjectName(QLatin1String(name));
+    auto *layout = new QVBoxLayout(page);
+    layout->setSpacing(12);
+    layout->addStretch();
+    for (QWidget *part : parts)
+        layout->addWidget(part, 0, Qt::AlignHCenter);
+    layout->addStretch();
+    return page;
+}
+
 } // namespace
 
 DeviceTab::DeviceTab(DeviceClass deviceClass, const DeviceInventory *inventory, QWidget *parent)
@@ -51,44 +64,21 @@ void DeviceTab::showContent(Content content, bool isSite) {
 }
 
 QWidget *DeviceTab::makeEmptyPage() {
-    auto *page = new QWidget;
-    page->setObjectName(QStringLiteral("emptyPage"));
     auto *add = new QPushButton(tr("Add Device"));
     add->setObjectName(QStringLiteral("emptyAddDeviceButton"));
     add->setEnabled(false);
     connect(add, &QPushButton::clicked, this, &DeviceTab::addDeviceRequested);
     m_siteHint->setObjectName(QStringLiteral("siteHintLabel"));
-    auto *layout = new QVBoxLayout(page);
-    layout->setSpacing(12);
-    layout->addStretch();
-    layout->addWidget(picture(QStringLiteral(":/images/empty_devices.svg")));
-    layout->addWidget(centredLabel(tr("No Device"), "heading"));
-    layout->addWidget(m_siteHint);
-    layout->addWidget(add, 0, Qt::AlignHCenter);
-    layout->addStretch();
-    return page;
+    return makePage("emptyPage", {picture(QStringLiteral(":/images/empty_devices.svg")),
+                                  centredLabel(tr("No Device"), "heading"), m_siteHint, add});
 }
 
 QWidget *DeviceTab::makeLoadingPage() {
-    auto *page = new QWidget;
-    page->setObjectName(QStringLiteral("loadingPage"));
-    auto *layout = new QVBoxLayout(page);
-    layout->setSpacing(12);
-    layout->addStretch();
-    layout->addWidget(new WaitingSpinner, 0, Qt::AlignHCenter);
-    layout->addWidget(centredLabel(tr("Loading devices..."), "quiet"));
-    layout->addStretch();
-    return page;
+    return makePage("loadingPage", {new WaitingSpinner, centredLabel(tr("Loading devices..."), "quiet")});
 }
 
 QWidget *DeviceTab::makeFailedPage() {
-    auto *page = new QWidget;
-    page->setObjectName(QStringLiteral("failedPage"));
-    auto *layout = new QVBoxLayout(page);
-    layout->setSpacing(12);
-    layout->addStretch();
-    layout->addWidget(centredLabel(tr("The device list could not be read"), "heading"));
-    layout->addWidget(centredLabel(tr("It is read again as soon as the server answers."), "quiet"));
-    layout->addStretch();
-    return page;
+    return makePage("failedPage",
+                    {centredLabel(tr("The device list could not be read"), "heading"),
+                     centredLabel(tr("It is read again as soon as the server answers."), "quiet")});
 }

@@ -89,13 +89,6 @@ DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &
     return isSame(*snapshot, *previous) ? previous : snapshot;
 }
 
-std::string_view textOf(const JSON &record, const char *name) {
-    const auto found = record.find(name);
-    return found != record.end() && found->is_string()
-               ? std::string_view(found->get_ref<const std::string &>())
-               : std::string_view();
-}
-
 struct StatusReading {
     std::vector<DeviceStatusCode> codes;
     bool devicesDiffer = false;
@@ -108,7 +101,7 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
     std::vector<bool> seen(size, false);
     const unsigned result = readPages(session, &CApiClient::listDeviceStatus, [&](JSON &page) {
         for (const JSON &record : page) {
-            const int index = record.is_object() ? snapshot.indexOf(std::string(textOf(record, "id"))) : -1;
+            const int index = snapshot.indexOf(std::string(textMember(record, "id")));
             if (index < 0) {
                 reading.devicesDiffer = true;
                 continue;
@@ -116,8 +109,8 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
             const auto place = static_cast<std::size_t>(index);
             seen[place] = true;
             reading.codes[place] =
-                DeviceStatus::codeOf(textOf(record, "connect_status"), textOf(record, "auth_status"),
-                                     textOf(record, "action_status"));
+                DeviceStatus::codeOf(textMember(record, "connect_status"), textMember(record, "auth_status"),
+                                     textMember(record, "action_status"));
         }
     });
     if (result != ApiOk) {

@@ -3,9 +3,8 @@
 #include "ui_reconnectingdialog.h"
 
 ReconnectingDialog::ReconnectingDialog(QWidget *parent)
-    : FramelessDialog(parent), m_ui(std::make_unique<Ui::ReconnectingDialog>()) {
+    : FramelessDialog(parent), m_ui(formIn<Ui::ReconnectingDialog>(content())) {
     setObjectName(QStringLiteral("ReconnectingDialog"));
-    m_ui->setupUi(content());
     setWindowTitle(tr("Reconnecting"));
     connect(m_ui->disconnectButton, &QPushButton::clicked, this, &ReconnectingDialog::disconnectBtnClicked);
 }

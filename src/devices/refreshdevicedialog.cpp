@@ -3,9 +3,8 @@
 #include "ui_refreshdevicedialog.h"
 
 RefreshDeviceDialog::RefreshDeviceDialog(QWidget *parent)
-    : FramelessDialog(parent), m_ui(std::make_unique<Ui::RefreshDeviceDialog>()) {
+    : FramelessDialog(parent), m_ui(formIn<Ui::RefreshDeviceDialog>(content())) {
     setObjectName(QStringLiteral("RefreshDeviceDialog"));
-    m_ui->setupUi(content());
     setWindowTitle(tr("Refresh"));
     connect(m_ui->cancelButton, &QPushButton::clicked, this, &QDialog::reject);
 }

@@ -9,23 +9,15 @@ namespace Sites {
 
 namespace {
 
-QString text(const JSON &record, const char *name) {
-    const auto found = record.find(name);
-    return found != record.end() && found->is_string() ? QString::fromStdString(found->get<std::string>())
-                                                       : QString();
-}
-
 List readRecords(const JSON &records) {
     List sites;
     QSet<QString> seen;
     for (const JSON &record : records) {
-        if (!record.is_object())
-            continue;
-        const QString id = text(record, "siteid");
+        const QString id = stringMember(record, "siteid");
         if (id.isEmpty() || id == rootId || id == overviewId || seen.contains(id))
             continue;
         seen.insert(id);
-        sites.push_back({id, text(record, "parentid"), text(record, "sitename")});
+        sites.push_back({id, stringMember(record, "parentid"), stringMember(record, "sitename")});
     }
     return sites;
 }

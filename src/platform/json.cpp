@@ -20,3 +20,16 @@ JSON parseJson(std::string_view text) {
 std::string dumpJson(const JSON &value) {
     return value.dump(-1, ' ', false, JSON::error_handler_t::replace);
 }
+
+std::string_view textMember(const JSON &object, const char *name) {
+    if (!object.is_object())
+        return {};
+    const auto found = object.find(name);
+    return found != object.end() && found->is_string() ? found->get_ref<const std::string &>()
+                                                       : std::string_view();
+}
+
+QString stringMember(const JSON &object, const char *name) {
+    const std::string_view text = textMember(object, name);
+    return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+}

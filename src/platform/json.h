@@ -2,6 +2,8 @@
 
 #include <nlohmann/json_fwd.hpp>
 
+#include <QString>
+
 #include <string>
 #include <string_view>
 
@@ -14,3 +16,9 @@ JSON parseJson(std::string_view text);
 
 /// Serialises; bytes that are not UTF-8 are replaced instead of throwing.
 std::string dumpJson(const JSON &value);
+
+/// The text of a member; empty where the value is no object, or the member is missing or of another type. The
+/// view lives as long as the value.
+std::string_view textMember(const JSON &object, const char *name);
+/// The same as a QString.
+QString stringMember(const JSON &object, const char *name);

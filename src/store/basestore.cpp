@@ -20,11 +20,7 @@ QString CBaseStore::query(const QString &key) const {
     if (nvldmstore::queryData(m_file.constData(), m_table.constData(), condition.constData(), rows) != 0)
         return {};
     const JSON list = JSON::parse(rows, nullptr, false);
-    if (!list.is_array() || list.empty() || !list[0].is_object())
-        return {};
-    const auto value = list[0].find("value");
-    return value != list[0].end() && value->is_string() ? QString::fromStdString(value->get<std::string>())
-                                                        : QString();
+    return list.is_array() && !list.empty() ? stringMember(list[0], "value") : QString();
 }
 
 bool CBaseStore::replace(const QString &key, const QString &value) {

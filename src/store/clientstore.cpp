@@ -20,18 +20,13 @@ constexpr const char *serverColumns =
 constexpr const char *serverTable = "svrsMainT";
 constexpr const char *scratchTable = "tempSvrsMainT";
 
-std::string text(const JSON &object, const char *name) {
-    const auto member = object.is_object() ? object.find(name) : object.end();
-    return member != object.end() && member->is_string() ? member->get<std::string>() : std::string();
-}
-
 /// The row as it is stored: a password leaves memory as cipher text only, and only if it is wanted again.
 JSON storedRow(const JSON &server) {
     JSON row;
     for (const char *name : {"id", "svrname", "info", "acc", "remember"})
-        row[name] = text(server, name);
-    const bool remember = text(server, "remember") == "YES";
-    row["pass"] = remember ? Ciphers::sealSecret(text(server, "pass")).value_or("") : "";
+        row[name] = textMember(server, name);
+    const bool remember = textMember(server, "remember") == "YES";
+    row["pass"] = remember ? Ciphers::sealSecret(textMember(server, "pass")).value_or("") : "";
     return row;
 }
 
@@ -82,8 +77,8 @@ bool CClientStore::setRemoteComputerAccount(const AccountInfo &info) {
 
 AccountInfo CClientStore::account(const QString &key) const {
     const JSON object = JSON::parse(m_store.query(key).toStdString(), nullptr, false);
-    return {QString::fromStdString(text(object, "server")), QString::fromStdString(text(object, "email")),
-            QString::fromStdString(Ciphers::openSecret(text(object, "pass")).value_or(""))};
+    return {stringMember(object, "server"), stringMember(object, "email"),
+            QString::fromStdString(Ciphers::openSecret(textMember(object, "pass")).value_or(""))};
 }
 
 bool CClientStore::setAccount(const QString &key, const AccountInfo &account) {
@@ -104,7 +99,7 @@ unsigned CClientStore::loadServerList(JSON &servers) const {
         return serverListUnreadable;
     }
     for (JSON &server : servers)
-        server["pass"] = Ciphers::openSecret(text(server, "pass")).value_or("");
+        server["pass"] = Ciphers::openSecret(textMember(server, "pass")).value_or("");
     return 0;
 }
 

@@ -24,9 +24,8 @@ Wording wordingOf(ConfirmDialog::Kind kind) {
 } // namespace
 
 ConfirmDialog::ConfirmDialog(Kind kind, QWidget *parent)
-    : FramelessDialog(parent), m_ui(std::make_unique<Ui::ConfirmDialog>()) {
+    : FramelessDialog(parent), m_ui(formIn<Ui::ConfirmDialog>(content())) {
     setObjectName(QStringLiteral("ConfirmDialog"));
-    m_ui->setupUi(content());
     const Wording wording = wordingOf(kind);
     setWindowTitle(wording.title);
     m_ui->messageLabel->setText(wording.text);

@@ -2,6 +2,8 @@
 
 #include <QDialog>
 
+#include <memory>
+
 class QLabel;
 class QToolButton;
 class QVBoxLayout;
@@ -38,3 +40,11 @@ private:
     QWidget *m_content;
     bool m_closable = true;
 };
+
+/// The parts of a form, set up in a widget: for members that need them before the constructor's body.
+template <typename Form>
+std::unique_ptr<Form> formIn(QWidget *content) {
+    auto form = std::make_unique<Form>();
+    form->setupUi(content);
+    return form;
+}
