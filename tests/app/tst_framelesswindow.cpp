@@ -1,0 +1,274 @@
+#include "aboutdialog.h"
+#include "accountsetupdialog.h"
+#include "clientstore.h"
+#include "devicewindow.h"
+#include "emulatorprocess.h"
+#include "form.h"
+#include "framelesswindow.h"
+#include "idlewatch.h"
+#include "isolatedroot.h"
+#include "localstore.h"
+#include "logindialog.h"
+#include "mainconsoletable.h"
+#include "mainwindow.h"
+#include "titlebar.h"
+#include "welcomepage.h"
+
+#include <QComboBox>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QRadioButton>
+#include <QSignalSpy>
+#include <QTimer>
+#include <QToolButton>
+
+#include <nlohmann/json.hpp>
+
+using namespace std::chrono_literals;
+
+namespace {
+
+const QString email = QStringLiteral("admin@norvell.example");
+const QString password = QStringLiteral("Passw0rd!");
+constexpr int patienceMs = 15000;
+
+} // namespace
+
+class TestFramelessWindow : public QObject {
+    Q_OBJECT
+
+private slots:
+    void init() {
+        QFile::remove(m_root.filePath("nvldm.state"));
+        CClientStore::instance().setThisComputer(true);
+        CClientStore::instance().setThisComputerAccount({});
+        CClientStore::instance().setRemoteComputerAccount({});
+    }
+
+    void cleanup() {
+        m_window.reset();
+        CLocalStore::instance().clearLoginInfo();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+        m_service.kill();
+    }
+
+    void withoutALocalService() {
+        openWindow();
+        QTRY_VERIFY(Form::visible<LoginDialog>());
+        const LoginDialog *dialog = Form::visible<LoginDialog>();
+        QCOMPARE(
+            Form::text(dialog, "tipLabel"),
+            QStringLiteral("Norvell Device Manager Service Control is not installed on this computer. Please "
+                           "connect to a remote server."));
+        QVERIFY(!titleBar()->accountManagementAction()->isEnabled());
+        QVERIFY(!Form::part(dialog, "localRadio")->isEnabled());
+        QVERIFY(Form::part<QRadioButton>(dialog, "remoteRadio")->isChecked());
+        QVERIFY(!titleBar()->accountButton()->isVisible());
+        QVERIFY(isCentred(dialog));
+    }
+
+    void localServiceDoesNotAnswer() {
+        QVERIFY(m_root.write("nvldm.state", "        STATE              : 1  STOPPED\n"));
+        openWindow();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QCOMPARE(
+            Form::text(Form::visible<LoginDialog>(), "tipLabel"),
+            QStringLiteral("Norvell Device Manager Service Control is not running on this computer. Please "
+                           "check the status of local server or connect to a remote server."));
+        QVERIFY(Form::part(Form::visible<LoginDialog>(), "localRadio")->isEnabled());
+    }
+
+    void freshServiceIsSetUpFirst() {
+        QVERIFY(m_service.start({"--fresh"}));
+        openWindow();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<AccountSetupDialog>(), patienceMs);
+        QVERIFY(!Form::visible<LoginDialog>());
+        const AccountSetupDialog *setup = Form::visible<AccountSetupDialog>();
+        Form::type(setup, "emailEdit", email);
+        Form::type(setup, "passEdit", password);
+        Form::type(setup, "confirmEdit", password);
+        Form::click(setup, "nextButton");
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QVERIFY(!Form::visible<AccountSetupDialog>());
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "tipLabel"), QString());
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "localEmailEdit"), email);
+        Form::type(Form::visible<LoginDialog>(), "localPassEdit", password);
+        QTest::keyClick(Form::visible<LoginDialog>(), Qt::Key_Return);
+        QTRY_COMPARE_WITH_TIMEOUT(shownRows(), 20, patienceMs);
+        QVERIFY(m_window->isLoggedIn());
+        QVERIFY(m_window->findChild<DeviceWindow *>()->isVisible());
+    }
+
+    void logOffEndsTheSession() {
+        logIn();
+        titleBar()->aboutAction()->trigger();
+        QTRY_VERIFY(Form::visible<AboutDialog>());
+        QSignalSpy loggedOff(m_window.get(), &FramelessWindow::didLogOff);
+        titleBar()->logOffAction()->trigger();
+        QCOMPARE(loggedOff.size(), 1);
+        QVERIFY(!m_window->isLoggedIn());
+        QVERIFY(showsWelcome());
+        QVERIFY(!titleBar()->accountButton()->isVisible());
+        QVERIFY(!m_window->idleWatch()->isRunning());
+        QVERIFY(!CLocalStore::instance().loginInfo().isComplete());
+        QCOMPARE(shownRows(), 0);
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QVERIFY2(!Form::visible<AboutDialog>(), "a dialog of the session stayed");
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "tipLabel"), QString());
+        QTRY_COMPARE_WITH_TIMEOUT(sessions(), 0, patienceMs);
+        // In again, until the user gives a lost server up.
+        Form::type(Form::visible<LoginDialog>(), "localPassEdit", password);
+        Form::click(Form::visible<LoginDialog>(), "loginButton");
+        QTRY_COMPARE_WITH_TIMEOUT(shownRows(), 20, patienceMs);
+        QCOMPARE(sessions(), 1);
+        emit m_window->findChild<DeviceWindow *>()->disconnectRequested();
+        QVERIFY(!m_window->isLoggedIn());
+        QCOMPARE(loggedOff.size(), 2);
+    }
+
+    void onlyClicksKeepTheSession() {
+        logIn();
+        m_window->idleWatch()->setPeriod(2s);
+        auto *device = m_window->findChild<QToolButton *>("deviceButton");
+        QElapsedTimer clock;
+        clock.start();
+        while (clock.elapsed() < 3000) {
+            QTest::mouseClick(device, Qt::LeftButton);
+            QTest::qWait(50);
+        }
+        QVERIFY(m_window->isLoggedIn());
+        clock.start();
+        while (m_window->isLoggedIn() && clock.elapsed() < patienceMs) {
+            QTest::keyClick(m_window.get(), Qt::Key_Shift);
+            QTest::mouseMove(m_window.get(), QPoint(300 + static_cast<int>(clock.elapsed() % 100), 300));
+            QTest::qWait(50);
+        }
+        QVERIFY(!m_window->isLoggedIn());
+        QTRY_VERIFY(Form::visible<LoginDialog>());
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "tipLabel"), QStringLiteral("Session Timeout"));
+        QTRY_COMPARE_WITH_TIMEOUT(sessions(), 0, patienceMs);
+    }
+
+    void sessionThatTheServiceEndedIsOver() {
+        logIn();
+        QCOMPARE(m_service.command("expire-sessions"), QStringLiteral("ok"));
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "tipLabel"), QStringLiteral("Session Timeout"));
+        QVERIFY(!m_window->isLoggedIn());
+        QVERIFY(showsWelcome());
+        QCOMPARE(shownRows(), 0);
+    }
+
+    void closedLoginDialogIsComeBackTo() {
+        startService();
+        openWindow();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QTest::keyClick(Form::visible<LoginDialog>(), Qt::Key_Escape);
+        QTRY_VERIFY(!m_window->findChild<LoginDialog *>());
+        QVERIFY(showsWelcome());
+        auto *again = m_window->findChild<QWidget *>("welcomeLoginButton");
+        QTest::mouseClick(again, Qt::LeftButton);
+        QTest::mouseClick(again, Qt::LeftButton);
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QTest::mouseClick(again, Qt::LeftButton);
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCOMPARE(m_window->findChildren<LoginDialog *>().size(), 1);
+    }
+
+    void anotherServerIsChosen() {
+        QVERIFY(CClientStore::instance().saveServerList(
+            {{{"id", "SVR1"}, {"info", "10.0.0.1:443"}, {"pass", "NorthPass1!"}, {"remember", "YES"}}}));
+        logIn();
+        auto *combo = m_window->findChild<QComboBox *>("remoteConnectionComboBox");
+        QCOMPARE(combo->currentIndex(), -1);
+        for (const char *answer : {"cancelButton", "acceptButton"}) {
+            combo->setFocus();
+            QTest::keyClick(combo, Qt::Key_Down);
+            QTRY_VERIFY(QApplication::activeModalWidget());
+            QVERIFY(m_window->isLoggedIn());
+            QCOMPARE(QApplication::activeModalWidget()->objectName(), QStringLiteral("ConfirmDialog"));
+            Form::click(QApplication::activeModalWidget(), answer);
+            QTRY_VERIFY(!QApplication::activeModalWidget());
+        }
+        QVERIFY(!m_window->isLoggedIn());
+        QTRY_VERIFY(Form::visible<LoginDialog>());
+        const LoginDialog *dialog = Form::visible<LoginDialog>();
+        QVERIFY(Form::part<QRadioButton>(dialog, "remoteRadio")->isChecked());
+        QCOMPARE(Form::part<QComboBox>(dialog, "remoteComboBox")->currentText(),
+                 QStringLiteral("10.0.0.1:443"));
+        QCOMPARE(Form::text(dialog, "remotePassEdit"), QStringLiteral("NorthPass1!"));
+        QTRY_COMPARE_WITH_TIMEOUT(sessions(), 0, patienceMs);
+    }
+
+    void closeButtonEndsTheProgramAndTheSession() {
+        logIn();
+        QCOMPARE(sessions(), 1);
+        QTimer::singleShot(0, this, [this] { QTest::mouseClick(titleBar()->closeButton(), Qt::LeftButton); });
+        QTimer guard;
+        connect(&guard, &QTimer::timeout, [] { QCoreApplication::exit(1); });
+        guard.start(patienceMs);
+        QCOMPARE(QCoreApplication::exec(), 0);
+        m_window.reset();
+        QCOMPARE(sessions(), 0);
+    }
+
+    void titleBarSwapsItsButtons() {
+        openWindow();
+        QTRY_VERIFY(Form::visible<LoginDialog>());
+        QTest::mouseClick(titleBar()->maximizeButton(), Qt::LeftButton);
+        QTRY_VERIFY(titleBar()->restoreButton()->isVisible() && m_window->isMaximized());
+        QVERIFY(!titleBar()->maximizeButton()->isVisible());
+        QTRY_VERIFY(isCentred(Form::visible<LoginDialog>()));
+        QTest::mouseDClick(titleBar(), Qt::LeftButton, {}, QPoint(titleBar()->width() / 2, 20));
+        QTRY_VERIFY(titleBar()->maximizeButton()->isVisible() && !m_window->isMaximized());
+    }
+
+private:
+    void openWindow() {
+        m_window = std::make_unique<FramelessWindow>();
+        m_window->setContent(new MainWindow);
+        m_window->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    }
+
+    void startService() { QVERIFY(m_service.start({"--fresh", "--account", email + u':' + password})); }
+
+    void logIn() {
+        startService();
+        openWindow();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        Form::type(Form::visible<LoginDialog>(), "localEmailEdit", email);
+        Form::type(Form::visible<LoginDialog>(), "localPassEdit", password);
+        Form::click(Form::visible<LoginDialog>(), "loginButton");
+        QTRY_VERIFY_WITH_TIMEOUT(m_window->isLoggedIn(), patienceMs);
+        QTRY_COMPARE_WITH_TIMEOUT(shownRows(), 20, patienceMs);
+        QVERIFY(!Form::visible<LoginDialog>());
+        QVERIFY(!showsWelcome());
+        QVERIFY(titleBar()->accountButton()->isVisible());
+        QVERIFY(m_window->idleWatch()->isRunning());
+    }
+
+    int sessions() { return m_service.command("counts").section("sessions=", 1).toInt(); }
+    int shownRows() const {
+        int rows = 0;
+        for (const MainConsoleTable *table : m_window->findChildren<MainConsoleTable *>())
+            rows += table->rowCount();
+        return rows;
+    }
+
+    bool isCentred(const QWidget *dialog) const {
+        return (dialog->geometry().center() - m_window->geometry().center()).manhattanLength() <= 2;
+    }
+    TitleBar *titleBar() const { return m_window->findChild<TitleBar *>(); }
+    bool showsWelcome() const { return m_window->findChild<WelcomePage *>()->isVisible(); }
+
+    IsolatedRoot m_root;
+    EmulatorProcess m_service{m_root.path()};
+    std::unique_ptr<FramelessWindow> m_window;
+};
+
+QTEST_MAIN(TestFramelessWindow)
+#include "tst_framelesswindow.moc"

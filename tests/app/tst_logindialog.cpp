@@ -1,0 +1,245 @@
+#include "clientstore.h"
+#include "emulatorprocess.h"
+#include "form.h"
+#include "isolatedroot.h"
+#include "localstore.h"
+#include "logcapture.h"
+#include "logindialog.h"
+#include "nettask.h"
+#include "remoteconnectiondialog.h"
+#include "scriptedpeer.h"
+
+#include <QComboBox>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QSignalSpy>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+const QString email = QStringLiteral("admin@norvell.example");
+const QString password = QStringLiteral("Passw0rd!");
+const QString wrongLogin = QStringLiteral("Incorrect email or password. Try again.");
+constexpr int patienceMs = 15000;
+
+JSON savedServer(const std::string &name, const char *remember) {
+    return {{"id", "SVR" + name},  {"svrname", name},         {"info", name + ".example:443"},
+            {"acc", "me@" + name}, {"pass", "Pass1!" + name}, {"remember", remember}};
+}
+
+const JSON savedServers = {savedServer("north", "YES"), savedServer("south", "NO")};
+
+} // namespace
+
+class TestLoginDialog : public QObject {
+    Q_OBJECT
+
+private slots:
+    void initTestCase() {
+        QVERIFY(m_service.start({"--devices", "0", "--account", email + u':' + password}));
+        CLocalStore::instance().setLocalServiceInstalled(true);
+    }
+
+    void init() {
+        QVERIFY(CClientStore::instance().saveServerList(JSON::array()));
+        CClientStore::instance().setThisComputer(true);
+        CClientStore::instance().setThisComputerAccount({});
+        CClientStore::instance().setRemoteComputerAccount({});
+        CLocalStore::instance().clearLoginInfo();
+        QCOMPARE(m_service.command("faults clear"), QStringLiteral("ok"));
+        QCOMPARE(m_service.command("expire-sessions"), QStringLiteral("ok"));
+        open();
+    }
+
+    void cleanup() {
+        m_success.reset();
+        m_dialog.reset();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+    }
+
+    void fieldsMustBeFilled_data() {
+        QTest::addColumn<QStringList>("fields"); // server, email, password; without a server: this computer
+        QTest::addColumn<QString>("expected");
+        const QString empty = QStringLiteral("The field can't be empty.");
+        const QString noServer = QStringLiteral("Enter the server as an address or a name");
+        QTest::newRow("no email") << QStringList{"", password} << empty;
+        QTest::newRow("blank email") << QStringList{"   ", password} << empty;
+        QTest::newRow("no password") << QStringList{email, ""} << empty;
+        QTest::newRow("no email, remote") << QStringList{"10.0.0.1", "", password} << empty;
+        QTest::newRow("no password, remote") << QStringList{"10.0.0.1", email, ""} << empty;
+        QTest::newRow("no server") << QStringList{"", email, password} << empty;
+        QTest::newRow("port too high") << QStringList{"10.0.0.1:65536", email, password} << noServer;
+    }
+    void fieldsMustBeFilled() {
+        QFETCH(QStringList, fields);
+        QFETCH(QString, expected);
+        if (fields.size() == 3)
+            fillRemote(fields[0], fields[1], fields[2]);
+        else
+            fillLocal(fields[0], fields[1]);
+        Form::click(m_dialog.get(), "loginButton");
+        QVERIFY2(tip().startsWith(expected), qPrintable(tip()));
+        QVERIFY(!isBusy());
+    }
+
+    void returnLogsInHere() {
+        QVERIFY(Form::part<QRadioButton>(m_dialog.get(), "localRadio")->isChecked());
+        QVERIFY(Form::part(m_dialog.get(), "localEmailEdit")->hasFocus());
+        QTest::keyClicks(QApplication::focusWidget(), email);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+        QVERIFY(Form::part(m_dialog.get(), "localPassEdit")->hasFocus());
+        QTest::keyClicks(QApplication::focusWidget(), password);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+        QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), 1, patienceMs);
+        const LoginInfo login = CLocalStore::instance().loginInfo();
+        QVERIFY(login.isComplete());
+        QCOMPARE(login.address, QStringLiteral("127.0.0.1"));
+        QCOMPARE(login.port, m_service.port());
+        QCOMPARE(login.account, email);
+        QCOMPARE(tip(), QString());
+        QVERIFY(CClientStore::instance().isThisComputer());
+        QCOMPARE(CClientStore::instance().thisComputerAccount().email, email);
+        QCOMPARE(sessions(), 1);
+    }
+
+    void logsInToAServerThatIsNamed() {
+        const QString server = "localhost:" + QString::number(m_service.port());
+        fillRemote(server);
+        Form::click(m_dialog.get(), "loginButton");
+        QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), 1, patienceMs);
+        QCOMPARE(CLocalStore::instance().loginInfo().address, QStringLiteral("127.0.0.1"));
+        QCOMPARE(CLocalStore::instance().loginInfo().port, m_service.port());
+        QVERIFY(!CClientStore::instance().isThisComputer());
+        QCOMPARE(CClientStore::instance().remoteComputerAccount().server, server);
+        QCOMPARE(CClientStore::instance().remoteComputerAccount().email, email);
+    }
+
+    void oneLoginAtATime() {
+        QCOMPARE(m_service.command("fault late=1000@/v1/login"), QStringLiteral("ok"));
+        fillLocal(email, password);
+        auto *button = Form::part<QPushButton>(m_dialog.get(), "loginButton");
+        QTest::mouseDClick(button, Qt::LeftButton);
+        QTest::mouseClick(button, Qt::LeftButton);
+        QTest::keyClick(Form::part(m_dialog.get(), "localPassEdit"), Qt::Key_Return);
+        m_dialog->on_loginButton_clicked();
+        QVERIFY(isBusy());
+        QCOMPARE(button->text(), QStringLiteral("Logging in..."));
+        QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), 1, patienceMs);
+        QTRY_VERIFY(!isBusy());
+        QCOMPARE(button->text(), QStringLiteral("Log in"));
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCOMPARE(m_success->size(), 1);
+        QCOMPARE(sessions(), 1);
+    }
+
+    void serverTells_data() {
+        QTest::addColumn<QByteArray>("answer");
+        QTest::addColumn<QString>("expected");
+        QTest::newRow("no more sessions") << QByteArray(R"({"code":108,"msg":""})") << "Server full.";
+        QTest::newRow("not accepted") << QByteArray(R"({"code":105,"msg":""})") << wrongLogin;
+        QTest::newRow("refused") << QByteArray(R"({"code":5,"msg":""})") << wrongLogin;
+        QTest::newRow("no JSON") << QByteArray("<html>") << wrongLogin;
+        QTest::newRow("no token") << QByteArray(R"({"code":0,"msg":"","data":{}})")
+                                  << "The server did not open a session. Try again.";
+    }
+    void serverTells() {
+        QFETCH(QByteArray, answer);
+        QFETCH(QString, expected);
+        ScriptedPeer peer;
+        peer.answer({ScriptedPeer::http(200, answer.toStdString())});
+        fillRemote("127.0.0.1:" + QString::number(peer.port()));
+        Form::click(m_dialog.get(), "loginButton");
+        QTRY_COMPARE_WITH_TIMEOUT(tip(), expected, patienceMs);
+        QCOMPARE(m_success->size(), 0);
+        QVERIFY(!CLocalStore::instance().loginInfo().isComplete());
+        QVERIFY(!isBusy() && m_dialog->isVisible());
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), email);
+        QCOMPARE(Form::text(m_dialog.get(), "remotePassEdit"), password);
+    }
+
+    void savedServerFillsTheFields() {
+        QVERIFY(CClientStore::instance().saveServerList(savedServers));
+        open();
+        Form::click(m_dialog.get(), "remoteRadio");
+        auto *combo = Form::part<QComboBox>(m_dialog.get(), "remoteComboBox");
+        QCOMPARE(combo->currentText(), QString());
+        QTest::keyClick(combo, Qt::Key_Down);
+        QCOMPARE(combo->currentText(), QStringLiteral("north.example:443"));
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("me@north"));
+        QCOMPARE(Form::text(m_dialog.get(), "remotePassEdit"), QStringLiteral("Pass1!north"));
+        QTest::keyClick(combo, Qt::Key_Down);
+        QCOMPARE(combo->currentText(), QStringLiteral("south.example:443"));
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("me@south"));
+        QCOMPARE(Form::text(m_dialog.get(), "remotePassEdit"), QString());
+        m_dialog->chooseServer("SVRnorth");
+        QCOMPARE(combo->currentText(), QStringLiteral("north.example:443"));
+    }
+
+    void savedListIsReadAgain() {
+        Form::click(m_dialog.get(), "remoteRadio");
+        auto *combo = Form::part<QComboBox>(m_dialog.get(), "remoteComboBox");
+        QTest::keyClicks(combo->lineEdit(), "half.typ");
+        Form::type(m_dialog.get(), "remoteEmailEdit", "me@norvell.example");
+        QVERIFY(CClientStore::instance().saveServerList(savedServers));
+        Form::click(m_dialog.get(), "manageServersButton");
+        QTRY_VERIFY(Form::visible<RemoteConnectionDialog>());
+        Form::click(Form::visible<RemoteConnectionDialog>(), "saveButton");
+        QTRY_VERIFY(!Form::visible<RemoteConnectionDialog>());
+        QCOMPARE(combo->count(), 2);
+        QCOMPARE(combo->currentText(), QStringLiteral("half.typ"));
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("me@norvell.example"));
+    }
+
+    void mayBeClosedWhileTheLoginRuns() {
+        QCOMPARE(m_service.command("fault late=1000@/v1/login"), QStringLiteral("ok"));
+        fillLocal(email, password);
+        const LogCapture log;
+        QTest::keyClick(m_dialog.get(), Qt::Key_Return);
+        QVERIFY(isBusy());
+        QTRY_COMPARE(log.count("login local server!"), 1);
+        m_success.reset();
+        m_dialog.reset();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QVERIFY(!CLocalStore::instance().loginInfo().isComplete());
+        QCOMPARE(log.count("login successfully!"), 0);
+        QCOMPARE(log.count("Encountered unexpected error"), 0);
+    }
+
+private:
+    void open() {
+        m_success.reset();
+        m_dialog = std::make_unique<LoginDialog>(QString());
+        m_success = std::make_unique<QSignalSpy>(m_dialog.get(), &LoginDialog::loginSuccess);
+        m_dialog->show();
+        QVERIFY(QTest::qWaitForWindowActive(m_dialog.get()));
+    }
+
+    void fillLocal(const QString &account, const QString &secret) {
+        Form::type(m_dialog.get(), "localEmailEdit", account);
+        Form::type(m_dialog.get(), "localPassEdit", secret);
+    }
+    void fillRemote(const QString &server, const QString &account = email, const QString &secret = password) {
+        Form::click(m_dialog.get(), "remoteRadio");
+        auto *edit = Form::part<QComboBox>(m_dialog.get(), "remoteComboBox")->lineEdit();
+        edit->selectAll();
+        QTest::keyClick(edit, Qt::Key_Delete);
+        QTest::keyClicks(edit, server);
+        Form::type(m_dialog.get(), "remoteEmailEdit", account);
+        Form::type(m_dialog.get(), "remotePassEdit", secret);
+    }
+    int sessions() { return m_service.command("counts").section("sessions=", 1).toInt(); }
+    QString tip() const { return Form::text(m_dialog.get(), "tipLabel"); }
+    bool isBusy() const { return !Form::part(m_dialog.get(), "loginButton")->isEnabled(); }
+
+    IsolatedRoot m_root;
+    EmulatorProcess m_service{m_root.path()};
+    std::unique_ptr<LoginDialog> m_dialog;
+    std::unique_ptr<QSignalSpy> m_success;
+};
+
+QTEST_MAIN(TestLoginDialog)
+#include "tst_logindialog.moc"

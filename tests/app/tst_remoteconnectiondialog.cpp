@@ -1,0 +1,169 @@
+#include "clientstore.h"
+#include "customtable.h"
+#include "form.h"
+#include "isolatedroot.h"
+#include "remoteconnectiondialog.h"
+#include "serverdialog.h"
+
+#include <QCheckBox>
+#include <QRegularExpression>
+#include <QSignalSpy>
+
+#include <nlohmann/json.hpp>
+
+class TestRemoteConnectionDialog : public QObject {
+    Q_OBJECT
+
+private slots:
+    void init() {
+        JSON servers = JSON::array();
+        for (const char *name : {"Zulu", "Alpha", "<b>Mike</b>"})
+            servers.push_back({{"id", std::string("SVR") + name},
+                               {"svrname", name},
+                               {"info", "10.0.0." + std::to_string(servers.size() + 1)},
+                               {"acc", "me@norvell.example"},
+                               {"pass", "MyPass12!"},
+                               {"remember", "YES"}});
+        QVERIFY(CClientStore::instance().saveServerList(servers));
+        m_dialog = std::make_unique<RemoteConnectionDialog>();
+        m_updated = std::make_unique<QSignalSpy>(m_dialog.get(), &RemoteConnectionDialog::updateSvr);
+        m_table = Form::part<CustomTable>(m_dialog.get(), "tableWidget");
+        m_dialog->show();
+        QVERIFY(QTest::qWaitForWindowActive(m_dialog.get()));
+    }
+
+    void cleanup() {
+        m_updated.reset();
+        m_dialog.reset();
+    }
+
+    void addedServerIsSaved() {
+        Form::click(m_dialog.get(), "addButton");
+        QTRY_VERIFY(Form::visible<AddServerDialog>());
+        const auto *add = Form::visible<AddServerDialog>();
+        Form::type(add, "nameEdit", " Tango ");
+        Form::type(add, "infoEdit", "tango.example:8443");
+        Form::type(add, "emailEdit", "tango@norvell.example");
+        Form::type(add, "passEdit", "TangoPass1!");
+        Form::click(add, "applyButton");
+        QTRY_VERIFY(!Form::visible<AddServerDialog>());
+        QCOMPARE(visibleNames().last(), QStringLiteral("Tango"));
+        QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Alpha|<b>Mike</b>"));
+        Form::click(m_dialog.get(), "saveButton");
+        QCOMPARE(m_updated->size(), 1);
+        QVERIFY(!m_dialog->isVisible());
+        QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Alpha|<b>Mike</b>|Tango"));
+        QCOMPARE(saved("info").section(u'|', 3), QStringLiteral("tango.example:8443"));
+        QCOMPARE(saved("remember"), QStringLiteral("YES|YES|YES|NO"));
+        // A password that nobody wants remembered is not kept.
+        QCOMPARE(saved("pass"), QStringLiteral("MyPass12!|MyPass12!|MyPass12!|"));
+        const QString id = saved("id").section(u'|', 3);
+        QVERIFY2(QRegularExpression("^SVR\\d{13}$").match(id).hasMatch(), qPrintable(id));
+    }
+
+    void serverMustBeNamed() {
+        Form::click(m_dialog.get(), "addButton");
+        QTRY_VERIFY(Form::visible<AddServerDialog>());
+        const auto *add = Form::visible<AddServerDialog>();
+        const QString empty = QStringLiteral("The field can't be empty.");
+        const QString wrong = QStringLiteral("Enter an address or a name");
+        for (const QStringList &row :
+             {QStringList{"", "10.0.0.1", empty}, QStringList{"  ", "10.0.0.1", empty},
+              QStringList{"Tango", "", empty}, QStringList{"Tango", "10.0.0.1:x", wrong}}) {
+            Form::type(add, "nameEdit", row[0]);
+            Form::type(add, "infoEdit", row[1]);
+            Form::click(add, "applyButton");
+            QVERIFY(Form::visible<AddServerDialog>());
+            QVERIFY(Form::text(add, "msgWarningLabel").startsWith(row[2]));
+        }
+        Form::click(add, "cancelButton");
+        QCOMPARE(m_table->rowCount(), 3);
+    }
+
+    void editedServerKeepsItsPlace() {
+        choose(1);
+        Form::click(m_dialog.get(), "editButton");
+        QTRY_VERIFY(Form::visible<EditServerDialog>());
+        const auto *edit = Form::visible<EditServerDialog>();
+        QCOMPARE(Form::text(edit, "nameEdit"), QStringLiteral("Alpha"));
+        QCOMPARE(Form::text(edit, "infoEdit"), QStringLiteral("10.0.0.2"));
+        QCOMPARE(Form::text(edit, "emailEdit"), QStringLiteral("me@norvell.example"));
+        QCOMPARE(Form::text(edit, "passEdit"), QStringLiteral("MyPass12!"));
+        QVERIFY(Form::part<QCheckBox>(edit, "rememberCheckBox")->isChecked());
+        Form::type(edit, "nameEdit", "Bravo");
+        QTest::keyClick(Form::part(edit, "nameEdit"), Qt::Key_Return);
+        QTRY_VERIFY(!Form::visible<EditServerDialog>());
+        QCOMPARE(visibleNames(), (QStringList{"Zulu", "Bravo", "<b>Mike</b>"}));
+        Form::click(m_dialog.get(), "saveButton");
+        QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Bravo|<b>Mike</b>"));
+        QCOMPARE(saved("id"), QStringLiteral("SVRZulu|SVRAlpha|SVR<b>Mike</b>"));
+        QCOMPARE(saved("pass"), QStringLiteral("MyPass12!|MyPass12!|MyPass12!"));
+    }
+
+    void deletedServerIsGone() {
+        QVERIFY(!Form::part(m_dialog.get(), "deleteButton")->isEnabled());
+        choose(0);
+        Form::click(m_dialog.get(), "deleteButton");
+        QCOMPARE(visibleNames(), (QStringList{"Alpha", "<b>Mike</b>"}));
+        // Nothing is selected now, so a second click has nothing to delete.
+        QVERIFY(!Form::part(m_dialog.get(), "deleteButton")->isEnabled());
+        Form::click(m_dialog.get(), "cancelButton");
+        QVERIFY(!m_dialog->isVisible());
+        QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Alpha|<b>Mike</b>"));
+        init();
+        choose(0);
+        Form::click(m_dialog.get(), "deleteButton");
+        Form::click(m_dialog.get(), "saveButton");
+        QCOMPARE(saved("svrname"), QStringLiteral("Alpha|<b>Mike</b>"));
+    }
+
+    void searchHidesTheOthers() {
+        QCOMPARE(m_table->item(2, 0)->toolTip(), QStringLiteral("<span>&lt;b&gt;Mike&lt;/b&gt;</span>"));
+        choose(0);
+        Form::type(m_dialog.get(), "remoteSearchEdit", "0.0.3");
+        QCOMPARE(visibleNames(), QStringList{"<b>Mike</b>"});
+        Form::type(m_dialog.get(), "remoteSearchEdit", "aLP");
+        QCOMPARE(visibleNames(), QStringList{"Alpha"});
+        // What is hidden is out of reach.
+        QVERIFY(!Form::part(m_dialog.get(), "editButton")->isEnabled());
+        QVERIFY(!Form::part(m_dialog.get(), "deleteButton")->isEnabled());
+        choose(1);
+        Form::click(m_dialog.get(), "deleteButton");
+        QCOMPARE(visibleNames(), QStringList());
+        Form::type(m_dialog.get(), "remoteSearchEdit", "");
+        QCOMPARE(visibleNames(), (QStringList{"Zulu", "<b>Mike</b>"}));
+    }
+
+private:
+    void choose(int row) {
+        QTest::mouseClick(m_table->viewport(), Qt::LeftButton, {},
+                          m_table->visualItemRect(m_table->item(row, 0)).center());
+    }
+
+    QStringList visibleNames() const {
+        QStringList names;
+        for (int row = 0; row < m_table->rowCount(); ++row) {
+            if (!m_table->isRowHidden(row))
+                names.append(m_table->item(row, 0)->text());
+        }
+        return names;
+    }
+
+    /// A member of all stored servers, in their order.
+    static QString saved(const char *member) {
+        JSON servers;
+        CClientStore::instance().loadServerList(servers);
+        QStringList values;
+        for (const JSON &server : servers)
+            values.append(QString::fromStdString(server.value(member, std::string("missing"))));
+        return values.join(u'|');
+    }
+
+    IsolatedRoot m_root;
+    std::unique_ptr<RemoteConnectionDialog> m_dialog;
+    std::unique_ptr<QSignalSpy> m_updated;
+    CustomTable *m_table = nullptr;
+};
+
+QTEST_MAIN(TestRemoteConnectionDialog)
+#include "tst_remoteconnectiondialog.moc"

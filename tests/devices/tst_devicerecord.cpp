@@ -1,0 +1,171 @@
+#include "devicerecord.h"
+#include "sortableiptablewidgetitem.h"
+
+#include <QTest>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+constexpr quint64 none = DeviceRecord::unknownKey;
+
+/// JSON written with single quotes.
+JSON json(QByteArray text) {
+    return JSON::parse(text.replace('\'', '"').toStdString());
+}
+
+DeviceRecordPtr parsed(const JSON &members) {
+    JSON value = {{"id", "DV000000000001"}};
+    value.update(members);
+    return DeviceRecords::parse(value);
+}
+
+} // namespace
+
+class TestDeviceRecord : public QObject {
+    Q_OBJECT
+
+private slots:
+    void columnText_data() {
+        QTest::addColumn<QByteArray>("record");
+        QTest::addColumn<int>("column");
+        QTest::addColumn<QString>("expected");
+        using Column = DeviceColumn;
+        const std::tuple<const char *, Column, const char *> rows[] = {
+            {"{'d_model':'NC-4210'}", Column::Model, "NC-4210"},
+            {"{'d_model':''}", Column::Model, "--"},
+            {"{'d_model':4210}", Column::Model, "--"},
+            {"{'d_hostname':'%n%s%1<b>'}", Column::HostName, "%n%s%1<b>"},
+            {"{'d_hostname':['a']}", Column::HostName, "--"},
+            {"{'d_hostname':null}", Column::HostName, "--"},
+            {"{'d_ip':'10.20.0.9'}", Column::Ip, "10.20.0.9"},
+            {"{'d_ip':'not-an-address'}", Column::Ip, "--"},
+            {"{'d_ip':168430090}", Column::Ip, "--"},
+            {"{'d_mac':'00:1A:07:00:00:01'}", Column::Mac, "00:1A:07:00:00:01"},
+            {"{'d_fw':'2.4.1'}", Column::Firmware, "2.4.1"},
+            {"{'d_http':80}", Column::HttpPort, "80"},
+            {"{'d_http':'80'}", Column::HttpPort, "80"},
+            {"{'d_http':'http'}", Column::HttpPort, "--"},
+            {"{'d_https':-1}", Column::HttpsPort, "--"},
+            {"{'d_https':18446744073709551615}", Column::HttpsPort, "--"},
+            {"{'https_enable':true}", Column::Https, "Enabled"},
+            {"{'https_enable':1}", Column::Https, "Enabled"},
+            {"{'https_enable':'on'}", Column::Https, "--"},
+            {"{'ieee8021x_enable':false}", Column::Ieee8021x, "Disabled"},
+            {"{'ieee8021x_enable':2}", Column::Ieee8021x, "--"},
+            {"{'d_sdstatus':'readonly'}", Column::SdCardStatus, "Ready"},
+            {"{'d_sdstatus':'detached'}", Column::SdCardStatus, "Detached"},
+            {"{'d_sdstatus':'worn out'}", Column::SdCardStatus, "worn out"},
+            {"{'d_sdusage':0}", Column::SdCardUsage, "0"},
+            {"{'d_sdusage':'full'}", Column::SdCardUsage, "--"},
+            {"{'d_dtime':'2026/01/15 09:00:00'}", Column::DateTime, "2026/01/15 09:00:00"},
+            {"{'d_powerfreq':50.5}", Column::PowerFrequency, "--"},
+            {"{'d_audio':'mute'}", Column::Audio, "Mute"},
+            {"{'d_audio':'unmute'}", Column::Audio, "Unmute"},
+            {"{'d_audio':true}", Column::Audio, "--"}};
+        for (const auto &[record, column, expected] : rows)
+            QTest::newRow(record) << QByteArray(record) << static_cast<int>(column)
+                                  << QString::fromLatin1(expected);
+    }
+    void columnText() {
+        QFETCH(QByteArray, record);
+        QFETCH(int, column);
+        QFETCH(QString, expected);
+        const DeviceRecordPtr device = parsed(json(record));
+        QCOMPARE(device->text(static_cast<DeviceColumn>(column)), expected);
+        QCOMPARE(device->sortKey(static_cast<DeviceColumn>(column)) == none, expected == QLatin1String("--"));
+        // One bad value spoils no other.
+        for (int other = 1; other < deviceColumnCount; ++other) {
+            if (other != column)
+                QCOMPARE(device->text(static_cast<DeviceColumn>(other)), QStringLiteral("--"));
+        }
+    }
+
+    void deviceClass() {
+        QCOMPARE(parsed(json("{'d_svrtype':'Camera'}"))->deviceClass, DeviceClass::Camera);
+        QCOMPARE(parsed(json("{'d_svrtype':'NVR'}"))->deviceClass, DeviceClass::Nvr);
+        for (const char *other :
+             {"{'d_svrtype':'Encoder'}", "{'d_svrtype':'camera'}", "{'d_svrtype':7}", "{}"})
+            QCOMPARE(parsed(json(other))->deviceClass, DeviceClass::Others);
+    }
+
+    void sites_data() {
+        QTest::addColumn<JSON>("siteid");
+        QTest::addColumn<QString>("expected");
+        QTest::newRow("array") << json("['SR1','SR2']") << "SR1 SR2";
+        QTest::newRow("text with an array") << JSON("[\"SR1\",\"SR2\"]") << "SR1 SR2";
+        QTest::newRow("not all are texts") << json("['SR1',7,null,['x'],'SR2']") << "SR1 SR2";
+        QTest::newRow("text that is no array") << JSON("SR1") << "";
+        QTest::newRow("text that breaks off") << JSON("[\"SR1\"") << "";
+        QTest::newRow("object") << json("{'SR1':1}") << "";
+        QTest::newRow("null") << JSON() << "";
+        QTest::newRow("very deep text") << JSON(std::string(200000, '[') + std::string(200000, ']')) << "";
+    }
+    void sites() {
+        QFETCH(JSON, siteid);
+        QTEST(parsed({{"siteid", siteid}})->siteIds.join(u' '), "expected");
+    }
+
+    void identity_data() {
+        QTest::addColumn<QByteArray>("record");
+        QTest::addColumn<QString>("expected"); // empty: no record
+        QTest::newRow("id") << QByteArray("{'id':'DV1','d_mac':'00:1a:07:00:00:01'}") << "DV1";
+        QTest::newRow("no id yet") << QByteArray("{'id':'','d_mac':'00:1a:07:00:00:01'}") << "001A07000001";
+        QTest::newRow("id of no text")
+            << QByteArray("{'id':5,'d_mac':'00-1A-07-00-00-01'}") << "001A07000001";
+        for (const char *bad :
+             {"{'d_ip':'10.0.0.1'}", "{'id':5,'d_mac':7}", "{}", "[{'id':'DV1'}]", "'DV1'", "null"})
+            QTest::newRow(bad) << QByteArray(bad) << "";
+    }
+    void identity() {
+        QFETCH(QByteArray, record);
+        QFETCH(QString, expected);
+        const DeviceRecordPtr device = DeviceRecords::parse(json(record));
+        QCOMPARE(DeviceRecords::identityOf(json(record)), expected);
+        QCOMPARE(device ? device->id : QString(), expected);
+    }
+
+    void keepsTheWholeRecord() {
+        JSON value = json("{'id':'DV1','d_http':'80','x_new':{'deep':[1,null,2.5]},'d_note':'S\xc3\xbc"
+                          "d'}");
+        value["d_model"] = std::string(10000, 'N');
+        const DeviceRecordPtr device = DeviceRecords::parse(value);
+        QCOMPARE(device->text(DeviceColumn::Model), QString(10000, u'N'));
+        QVERIFY(JSON::parse(device->json) == value);
+    }
+
+    void ipSortKey_data() {
+        QTest::addColumn<QString>("text");
+        QTest::addColumn<quint64>("key");
+        QTest::newRow("lowest") << "0.0.0.0" << quint64(0);
+        QTest::newRow("highest") << "255.255.255.255" << quint64(0xFFFFFFFF);
+        QTest::newRow("parts") << "1.2.3.4" << quint64(0x01020304);
+        QTest::newRow("leading zeros") << "010.000.0.09" << quint64(0x0A000009);
+        for (const char *text : {"", ".", "1.2.3", "1.2.3.", ".1.2.3.4", "1..3.4", "1.2.3.4.5", "256.0.0.1",
+                                 "1.2.3.4 ", " 1.2.3.4", "1.2.3.-4", "+1.2.3.4", "1.2.3.0x4", "0001.2.3.4",
+                                 "99999999999999999999.1.1.1", "a.b.c.d", "::1", "--", "\xef\xbc\x91.2.3.4"})
+            QTest::newRow(qPrintable(u'"' + QString::fromUtf8(text) + u'"'))
+                << QString::fromUtf8(text) << none;
+    }
+    void ipSortKey() {
+        QFETCH(QString, text);
+        QTEST(DeviceRecords::ipSortKey(text), "key");
+    }
+
+    void ipItemsCompareByNumbers() {
+        const auto less = [](const char *left, const char *right) {
+            return SortableIpTableWidgetItem(QString::fromLatin1(left)) <
+                   SortableIpTableWidgetItem(QString::fromLatin1(right));
+        };
+        QVERIFY(less("10.0.0.9", "10.0.0.10"));
+        QVERIFY(less("9.255.255.255", "10.0.0.0"));
+        QVERIFY(!less("10.0.0.0", "9.255.255.255"));
+        QVERIFY(!less("10.0.0.1", "10.0.0.1"));
+        QVERIFY(less("255.255.255.255", "--"));
+        QVERIFY(!less("--", "0.0.0.0"));
+        QVERIFY(!less("abc", "--"));
+    }
+};
+
+QTEST_MAIN(TestDeviceRecord)
+#include "tst_devicerecord.moc"

@@ -1,0 +1,330 @@
+#include "apiclient.h"
+#include "countedtabwidget.h"
+#include "devicewindow.h"
+#include "emulatorprocess.h"
+#include "isolatedroot.h"
+#include "localstore.h"
+#include "logcapture.h"
+#include "mainconsoletable.h"
+#include "nettask.h"
+#include "reconnectingdialog.h"
+#include "refreshdevicedialog.h"
+#include "sessionevents.h"
+#include "sitetree.h"
+
+#include <QLabel>
+#include <QPushButton>
+#include <QSignalSpy>
+#include <QStackedWidget>
+#include <QTabBar>
+#include <QTest>
+#include <QToolButton>
+#include <QTreeWidgetItemIterator>
+
+#include <algorithm>
+
+namespace {
+
+const char *account = "admin@norvell.example";
+const char *password = "Passw0rd!";
+/// The monitor's slowest beat is six seconds.
+constexpr int patienceMs = 12000;
+
+} // namespace
+
+class TestDeviceWindow : public QObject {
+    Q_OBJECT
+
+private slots:
+    void init() {
+        m_window = std::make_unique<DeviceWindow>();
+        m_window->resize(1280, 720);
+        m_window->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    }
+
+    void cleanup() {
+        if (m_window)
+            m_window->stopWork();
+        CLocalStore::instance().clearLoginInfo();
+        m_window.reset();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+        m_service.kill();
+    }
+
+    void showsTheInventory() {
+        QCOMPARE(shownPage(), QStringLiteral("loadingPage"));
+        workOn(20);
+        QCOMPARE(shownPage(), QStringLiteral("cameraTable"));
+        auto *tabs = m_window->findChild<CountedTabWidget *>("deviceTabs");
+        const std::pair<const char *, const char *> expected[] = {
+            {"Camera", "cameraTable"}, {"NVR", "nvrTable"}, {"Others", "othersTable"}};
+        for (int i = 0; i < 3; ++i) {
+            QCOMPARE(tabs->tabText(i), QString::fromLatin1(expected[i].first));
+            QCOMPARE(tabs->tabBar()->tabData(i).toString(),
+                     QString::number(table(expected[i].second)->rowCount()));
+        }
+        const int cameras = table("cameraTable")->rowCount();
+        QVERIFY(cameras > 1);
+        QTest::mouseClick(table("cameraTable")->viewport(), Qt::LeftButton, {}, QPoint(30, 18));
+        QCOMPARE(m_window->selectedDevices().size(), std::size_t(1));
+        QCOMPARE(m_window->findChild<QLabel *>("selectionLabel")->text(),
+                 QStringLiteral("1 of %1 devices selected").arg(cameras));
+        QTest::keyClick(table("cameraTable"), Qt::Key_A, Qt::ControlModifier);
+        QCOMPARE(m_window->selectedDevices().size(), std::size_t(cameras));
+        tabs->setCurrentIndex(1);
+        QCOMPARE(m_window->selectedDevices().size(), std::size_t(0));
+    }
+
+    void siteChoosesDevices() {
+        workOn(60);
+        auto *tree = m_window->findChild<SiteTree *>();
+        QStringList sites;
+        int inSites = 0;
+        for (QTreeWidgetItemIterator it(tree); *it; ++it) {
+            const QVariant id = (*it)->data(0, SiteTree::siteIdRole);
+            if (!id.isNull() && id.toString() != Sites::overviewId)
+                sites.append(id.toString());
+        }
+        QCOMPARE(sites.size(), 5);
+        for (const QString &site : sites) {
+            clickSite(site);
+            QCOMPARE(QString::number(rowsOfAllTables()),
+                     tree->currentItem()->data(0, SiteTree::countRole).toString());
+            inSites += rowsOfAllTables();
+            table("cameraTable")->selectAll();
+            for (const DeviceRecordPtr &device : m_window->selectedDevices())
+                QVERIFY2(device->siteIds.contains(site), qPrintable(device->id));
+        }
+        QVERIFY2(inSites > 0, "no device is in any site");
+        clickSite(Sites::overviewId);
+        QCOMPARE(rowsOfAllTables(), 60);
+    }
+
+    void emptyPageTellsWhatToDo() {
+        workOn(0);
+        QTRY_COMPARE(shownPage(), QStringLiteral("emptyPage"));
+        const auto *page = m_window->findChild<QTabWidget *>("deviceTabs")
+                               ->currentWidget()
+                               ->findChild<QWidget *>("emptyPage");
+        const auto *hint = page->findChild<QLabel *>("siteHintLabel");
+        const QList<QLabel *> labels = page->findChildren<QLabel *>();
+        QVERIFY(std::any_of(labels.begin(), labels.end(), [](const QLabel *label) {
+            return label->isVisible() && label->text() == "No Device";
+        }));
+        QVERIFY(!hint->isVisible());
+        const auto *tree = m_window->findChild<SiteTree *>();
+        clickSite(
+            tree->topLevelItem(tree->topLevelItemCount() - 1)->data(0, SiteTree::siteIdRole).toString());
+        QCOMPARE(shownPage(), QStringLiteral("emptyPage"));
+        QVERIFY(hint->isVisible());
+        QCOMPARE(hint->text(), QStringLiteral("Drag devices from the \"Device Overview\""));
+    }
+
+    void followsStatesAndDevices() {
+        workOn(20);
+        MainConsoleTable *cameras = table("cameraTable");
+        const QString first = cameras->item(0, 0)->data(MainConsoleTable::deviceIdRole).toString();
+        const QString second = cameras->item(1, 0)->data(MainConsoleTable::deviceIdRole).toString();
+        cameras->selectRow(1);
+        tell("status " + first + " Authorized Connected deviceRestart");
+        tell("status " + second + " Authorized Unreachable -");
+        QTRY_COMPARE_WITH_TIMEOUT(cameras->item(0, 0)->text(), QStringLiteral("  Maintaining..."),
+                                  patienceMs);
+        QCOMPARE(cameras->item(1, 0)->text(), QStringLiteral("  Unreachable"));
+        // What another client adds or removes shows without anything being done here.
+        tell("add 3");
+        tell("remove " + first);
+        QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), 22, patienceMs);
+        QCOMPARE(cameras->item(0, 0)->data(MainConsoleTable::deviceIdRole).toString(), second);
+        QCOMPARE(m_window->selectedDevices().size(), std::size_t(1));
+        QCOMPARE(m_window->selectedDevices().front()->id, second);
+    }
+
+    void failedReadingRecovers() {
+        startEmulator({"--fault", "status=500@/v1/dev/list,times=1"});
+        logIn();
+        const LogCapture log;
+        m_window->startWork();
+        QTRY_COMPARE(shownPage(), QStringLiteral("failedPage"));
+        QCOMPARE(log.count("HTTP API(listDevices) failed!"), 1);
+        QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), 20, patienceMs);
+        QCOMPARE(shownPage(), QStringLiteral("cameraTable"));
+        // A reading that fails later takes nothing away.
+        tell("fault code=3@/v1/dev/list");
+        m_window->reload();
+        QTRY_COMPARE(log.count("HTTP API(listDevices) failed!"), 2);
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCOMPARE(shownPage(), QStringLiteral("cameraTable"));
+        QCOMPARE(rowsOfAllTables(), 20);
+    }
+
+    void lostServerComesBack() {
+        workOn(20);
+        const QString port = QString::number(m_service.port());
+        m_service.kill();
+        QTRY_VERIFY_WITH_TIMEOUT(visible<ReconnectingDialog>(), 8000);
+        QVERIFY(visible<ReconnectingDialog>()->findChild<QWidget *>("statusWidget")->isVisible());
+        QCOMPARE(rowsOfAllTables(), 20);
+        QSignalSpy disconnects(m_window.get(), &DeviceWindow::disconnectRequested);
+        QTest::mouseClick(visible<ReconnectingDialog>()->findChild<QPushButton *>("disconnectButton"),
+                          Qt::LeftButton);
+        QCOMPARE(disconnects.size(), 1);
+
+        restartEmulator({"--port", port});
+        tell("add 1");
+        QTRY_VERIFY_WITH_TIMEOUT(visible<RefreshDeviceDialog>(), patienceMs);
+        QVERIFY(!visible<ReconnectingDialog>());
+        QTRY_VERIFY_WITH_TIMEOUT(!visible<RefreshDeviceDialog>(), patienceMs);
+        QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), 21, patienceMs);
+    }
+
+    void endedSessionIsToldOnce() {
+        workOn(20);
+        QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
+        tell("expire-sessions");
+        QTRY_COMPARE_WITH_TIMEOUT(lost.size(), 1, patienceMs);
+        const LogCapture log;
+        m_window->reload();
+        QTRY_COMPARE(log.count("HTTP API(listDevices) failed!"), 1);
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCOMPARE(lost.size(), 1);
+        // A new session has an end of its own.
+        logIn();
+        tell("expire-sessions");
+        m_window->reload();
+        QTRY_COMPARE(lost.size(), 2);
+    }
+
+    void refreshMayBeCancelledAndAskedAgain() {
+        workOn(20);
+        auto *refresh = m_window->findChild<QToolButton *>("refreshButton");
+        QTest::mouseClick(refresh, Qt::LeftButton);
+        QTRY_VERIFY(visible<RefreshDeviceDialog>());
+        QVERIFY(visible<RefreshDeviceDialog>()->isModal());
+        QTest::mouseClick(visible<RefreshDeviceDialog>()->findChild<QPushButton *>("cancelButton"),
+                          Qt::LeftButton);
+        QTRY_VERIFY(!m_window->findChild<RefreshDeviceDialog *>());
+        // The job of the first one still waits for the devices to settle.
+        QTest::mouseClick(refresh, Qt::LeftButton);
+        QTRY_VERIFY_WITH_TIMEOUT(!m_window->findChild<RefreshDeviceDialog *>(), patienceMs);
+        QVERIFY(!QApplication::activeModalWidget());
+        QTest::mouseClick(table("cameraTable")->viewport(), Qt::LeftButton, {}, QPoint(30, 18));
+        QCOMPARE(m_window->selectedDevices().size(), std::size_t(1));
+    }
+
+    void stopForgetsTheSession() {
+        workOn(20);
+        tell("fault late=1000@/v1/dev/list,times=1");
+        m_window->reload();
+        m_window->stopWork();
+        CLocalStore::instance().clearLoginInfo();
+        QCOMPARE(rowsOfAllTables(), 0);
+        QCOMPARE(shownPage(), QStringLiteral("loadingPage"));
+        QCOMPARE(m_window->findChild<SiteTree *>()->topLevelItemCount(), 3);
+        QCOMPARE(m_window->selectedDevices().size(), std::size_t(0));
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCOMPARE(rowsOfAllTables(), 0);
+        // The next session begins while the last answer to the old one is still on its way.
+        logIn();
+        tell("fault late=1000@/v1/dev/list,times=1");
+        m_window->startWork();
+        m_window->stopWork();
+        CLocalStore::instance().clearLoginInfo();
+        tell("add 2");
+        logIn();
+        m_window->startWork();
+        QTRY_COMPARE(rowsOfAllTables(), 22);
+        QCOMPARE(shownPage(), QStringLiteral("cameraTable"));
+    }
+
+    void mayBeDestroyedWhileJobsRun() {
+        startEmulator({"--fault", "late=1000@/v1/site/list,times=1"});
+        logIn();
+        const LogCapture log;
+        m_window->startWork();
+        QTest::mouseClick(m_window->findChild<QToolButton *>("refreshButton"), Qt::LeftButton);
+        QTRY_VERIFY(visible<RefreshDeviceDialog>());
+        QTRY_VERIFY(log.count("login info ip:") > 0);
+        m_window.reset();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        QCOMPARE(log.count("Encountered unexpected error"), 0);
+        // The turn of the jobs was given back: another window gets its own.
+        init();
+        m_window->startWork();
+        QTRY_COMPARE(rowsOfAllTables(), 20);
+    }
+
+private:
+    void tell(const QString &command) {
+        const QString answer = m_service.command(command);
+        QVERIFY2(answer.startsWith("ok"), qPrintable(answer));
+    }
+    /// A window at work on a service with so many devices.
+    void workOn(int devices) {
+        startEmulator({"--devices", QString::number(devices)});
+        logIn();
+        m_window->startWork();
+        QTRY_COMPARE(rowsOfAllTables(), devices);
+    }
+    void logIn() {
+        unsigned result = ApiException;
+        NetTask::runAndWait(
+            [&] { result = CApiClient("127.0.0.1", m_service.port()).loginServer(account, password); });
+        QCOMPARE(result, unsigned(ApiOk));
+        CLocalStore &store = CLocalStore::instance();
+        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access());
+    }
+
+    void startEmulator(const QStringList &arguments = {}) {
+        restartEmulator(arguments + QStringList{"--fresh"});
+    }
+    /// With the fleet and the sessions that it had.
+    void restartEmulator(const QStringList &arguments) {
+        QVERIFY(m_service.start(QStringList{"--account", QString::fromLatin1(account) + u':' + password} +
+                                arguments));
+    }
+
+    int rowsOfAllTables() const {
+        int rows = 0;
+        for (const MainConsoleTable *table : m_window->findChildren<MainConsoleTable *>())
+            rows += table->rowCount();
+        return rows;
+    }
+
+    QString shownPage() const {
+        const auto *tabs = m_window->findChild<QTabWidget *>("deviceTabs");
+        return qobject_cast<QStackedWidget *>(tabs->currentWidget())->currentWidget()->objectName();
+    }
+
+    MainConsoleTable *table(const char *name) const { return m_window->findChild<MainConsoleTable *>(name); }
+    void clickSite(const QString &id) {
+        auto *tree = m_window->findChild<SiteTree *>();
+        for (QTreeWidgetItemIterator it(tree); *it; ++it) {
+            if ((*it)->data(0, SiteTree::siteIdRole).toString() != id)
+                continue;
+            tree->scrollToItem(*it);
+            QTest::mouseClick(tree->viewport(), Qt::LeftButton, {}, tree->visualItemRect(*it).center());
+        }
+        QCOMPARE(tree->currentSite(), id);
+    }
+
+    template <typename Dialog>
+    Dialog *visible() const {
+        auto *dialog = m_window->findChild<Dialog *>();
+        return dialog && dialog->isVisible() ? dialog : nullptr;
+    }
+
+    IsolatedRoot m_root;
+    EmulatorProcess m_service{m_root.path()};
+    std::unique_ptr<DeviceWindow> m_window;
+};
+
+QTEST_MAIN(TestDeviceWindow)
+#include "tst_devicewindow.moc"

@@ -1,0 +1,127 @@
+#include "countedtabwidget.h"
+#include "framelessdialog.h"
+#include "passwordedit.h"
+#include "plaintext.h"
+#include "theme.h"
+#include "transientmessage.h"
+#include "warningline.h"
+
+#include <QFile>
+#include <QLabel>
+#include <QRegularExpression>
+#include <QSignalSpy>
+#include <QTabBar>
+#include <QTest>
+#include <QTextDocument>
+#include <QToolButton>
+
+class TestWidgets : public QObject {
+    Q_OBJECT
+
+private slots:
+    void eyeShowsAndHidesThePassword() {
+        PasswordEdit edit;
+        edit.resize(200, 32);
+        edit.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&edit));
+        QTest::keyClicks(&edit, "Passw0rd!");
+        QCOMPARE(edit.echoMode(), QLineEdit::Password);
+        QVERIFY(!edit.displayText().contains("Passw0rd!"));
+        auto *eye = edit.findChild<QToolButton *>();
+        const qint64 hiddenIcon = eye->icon().cacheKey();
+        QTest::mouseClick(eye, Qt::LeftButton);
+        QCOMPARE(edit.echoMode(), QLineEdit::Normal);
+        QCOMPARE(edit.displayText(), QStringLiteral("Passw0rd!"));
+        QVERIFY(eye->icon().cacheKey() != hiddenIcon);
+        QTest::mouseClick(eye, Qt::LeftButton);
+        QCOMPARE(edit.echoMode(), QLineEdit::Password);
+        QCOMPARE(edit.text(), QStringLiteral("Passw0rd!"));
+    }
+
+    void dialogThatMustBeAnswered() {
+        FramelessDialog dialog;
+        QSignalSpy rejected(&dialog, &QDialog::rejected);
+        auto *cross = dialog.findChild<QToolButton *>("dialogCloseButton");
+        dialog.setClosable(false);
+        dialog.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&dialog));
+        QVERIFY(!cross->isVisible());
+        QTest::keyClick(&dialog, Qt::Key_Escape);
+        QVERIFY(dialog.isVisible());
+        dialog.setClosable(true);
+        QTest::keyClick(&dialog, Qt::Key_Escape);
+        QVERIFY(!dialog.isVisible());
+        dialog.show();
+        QTest::mouseClick(cross, Qt::LeftButton);
+        QVERIFY(!dialog.isVisible());
+        QCOMPARE(rejected.size(), 2);
+    }
+
+    void toolTipShowsMarkupAsItStands() {
+        QTextDocument shown;
+        for (const char *text : {"Building A", "<b>NC-4210</b><img src=\"http://10.98.0.1/x.png\">",
+                                 "A &amp; B", "</span><h1>x"}) {
+            const QString tip = PlainText::toolTip(QString::fromLatin1(text));
+            QVERIFY2(Qt::mightBeRichText(tip), text);
+            shown.setHtml(tip);
+            QCOMPARE(shown.toPlainText(), QString::fromLatin1(text));
+        }
+        shown.setHtml(PlainText::toolTip(QString(10000, u'<')));
+        QVERIFY(shown.toPlainText().size() < 1000);
+        QVERIFY(shown.toPlainText().startsWith(u'<') && shown.toPlainText().endsWith(QChar(0x2026)));
+        QCOMPARE(PlainText::toolTip({}), QString());
+    }
+
+    void messagesTakeNoMarkup() {
+        QLabel icon;
+        QLabel text;
+        WarningLine line(&icon, &text);
+        line.setText("<i>no</i>");
+        QVERIFY(!icon.pixmap().isNull());
+        QCOMPARE(text.text(), QStringLiteral("<i>no</i>"));
+        QCOMPARE(text.textFormat(), Qt::PlainText);
+        line.setText({});
+        QVERIFY(icon.pixmap().isNull());
+        QCOMPARE(text.text(), QString());
+
+        QWidget window;
+        window.resize(600, 400);
+        auto *inner = new QWidget(&window);
+        TransientMessage::show(inner, "first");
+        TransientMessage::show(inner, "<b>second</b>");
+        QTRY_COMPARE(window.findChildren<TransientMessage *>().size(), 1);
+        QCOMPARE(window.findChild<TransientMessage *>()->text(), QStringLiteral("<b>second</b>"));
+        QCOMPARE(window.findChild<TransientMessage *>()->textFormat(), Qt::PlainText);
+        QVERIFY(window.rect().contains(window.findChild<TransientMessage *>()->geometry()));
+    }
+
+    void countStaysOutOfTheTabsText() {
+        CountedTabWidget tabs;
+        tabs.addTab(new QWidget, "Camera");
+        tabs.addTab(new QWidget, "NVR");
+        tabs.setCount(0, 5);
+        tabs.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&tabs));
+        const int narrow = tabs.tabBar()->tabRect(0).width();
+        tabs.setCount(0, 12345);
+        QCOMPARE(tabs.tabText(0), QStringLiteral("Camera"));
+        const int wide = tabs.tabBar()->tabRect(0).width();
+        QVERIFY2(wide > narrow, "a longer number needs more room");
+        QTest::mouseClick(tabs.tabBar(), Qt::LeftButton, {}, tabs.tabBar()->tabRect(1).center());
+        QCOMPARE(tabs.currentIndex(), 1);
+        QCOMPARE(tabs.tabBar()->tabRect(0).width(), wide);
+    }
+
+    void styleSheetNamesPicturesThatExist() {
+        static const QRegularExpression picture("url\\(\"?([^)\"]+)\"?\\)");
+        auto found = picture.globalMatch(Theme::styleSheet());
+        QVERIFY(found.hasNext());
+        while (found.hasNext()) {
+            const QString path = found.next().captured(1);
+            QVERIFY2(QFile::exists(path), qPrintable(path));
+        }
+    }
+};
+
+QTEST_MAIN(TestWidgets)
+#include "tst_widgets.moc"
