@@ -36,7 +36,8 @@ LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
       m_ui(formIn<Ui::LoginDialog>(content())),
       m_tip(m_ui->msgWarningIcon, m_ui->tipLabel),
       m_runner(new NetTask),
-      m_servers(std::make_unique<JSON>(JSON::array())) {
+      m_servers(std::make_unique<JSON>(JSON::array())),
+      m_closed(std::make_shared<std::atomic_bool>(false)) {
     setObjectName(QStringLiteral("LoginDialog"));
     setWindowTitle(tr("Login"));
     m_ui->remoteComboBox->lineEdit()->setPlaceholderText(tr("IP:Port/Domain Name"));
@@ -53,7 +54,9 @@ LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
     m_tip.setText(tip);
 }
 
-LoginDialog::~LoginDialog() = default;
+LoginDialog::~LoginDialog() {
+    *m_closed = true;
+}
 
 void LoginDialog::offerKnownAccounts() {
     const CClientStore &store = CClientStore::instance();
@@ -129,7 +132,8 @@ void LoginDialog::startLogin(const Credentials &credentials) {
     if (!credentials.thisComputer)
         lookUp = [address, server = credentials.server] { *address = server.resolved(); };
     const bool started = NetJob::post(
-        m_runner.get(), this, [credentials, address] { return logIn(credentials, *address); },
+        m_runner.get(), this,
+        [credentials, address, closed = m_closed] { return logIn(credentials, *address, *closed); },
         [this](const Outcome &outcome) { onOutcome(outcome); },
         [this](JobEnd end) {
             setBusy(false);
@@ -143,7 +147,8 @@ void LoginDialog::startLogin(const Credentials &credentials) {
     setBusy(true);
 }
 
-LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QString &address) {
+LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QString &address,
+                                        const std::atomic_bool &closed) {
     Outcome outcome{ApiException, address, credentials.server.port, credentials.account, {}};
     if (credentials.thisComputer) {
         outcome.port = CConfigStore().serverPort();
@@ -160,6 +165,11 @@ LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QS
                                         credentials.password.toUtf8().constData());
     if (outcome.result != ApiOk || client.accessToken().empty())
         return outcome;
+    if (closed) {
+        // Nobody waits for this session any more, and the service counts it.
+        client.logoutServer(client.accessToken().c_str());
+        return outcome;
+    }
     outcome.token = CLocalStore::instance().access();
     CClientStore &store = CClientStore::instance();
     store.setThisComputer(credentials.thisComputer);

@@ -6,6 +6,7 @@
 #include "serveraddress.h"
 #include "warningline.h"
 
+#include <atomic>
 #include <memory>
 
 namespace Ui {
@@ -46,10 +47,13 @@ private:
     void setBusy(bool busy);
     void manageServers();
 
-    static Outcome logIn(const Credentials &credentials, const QString &address);
+    static Outcome logIn(const Credentials &credentials, const QString &address,
+                         const std::atomic_bool &closed);
 
     std::unique_ptr<Ui::LoginDialog> m_ui;
     WarningLine m_tip;
     NetTask::Owner m_runner;
     std::unique_ptr<JSON> m_servers;
+    /// Outlives the dialog with a login that is under way.
+    std::shared_ptr<std::atomic_bool> m_closed;
 };

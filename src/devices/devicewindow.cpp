@@ -37,6 +37,8 @@ namespace {
 
 constexpr auto refreshDelay = 2000ms;
 constexpr auto selectionLogDelay = 200ms;
+/// Polls tell of devices that come and go; what else others change shows with a reading once a minute.
+constexpr int answersBetweenReadings = 10;
 constexpr int siteTreeWidth = 248;
 
 } // namespace
@@ -207,6 +209,7 @@ void DeviceWindow::reload() {
         return InventoryReader::readAll(session, snapshot, codes);
     };
     m_reloadWanted = false;
+    m_answersSinceReading = 0;
     m_reloading = ServiceRequest::post(
         m_netTask.get(), this, read, [this](const InventoryReader::Reading &reading) { onReading(reading); },
         [this](JobEnd end) {
@@ -261,6 +264,8 @@ void DeviceWindow::onServerAnswered() {
     }
     if (!m_online && !m_refreshing)
         openRefreshDialog();
+    else if (++m_answersSinceReading >= answersBetweenReadings)
+        reload();
 }
 
 void DeviceWindow::onServerLost() {

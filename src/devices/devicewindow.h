@@ -94,6 +94,7 @@ private:
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
     std::vector<DeviceRecordPtr> m_selected;
+    int m_answersSinceReading = 0;
     bool m_online = false;
     bool m_reloading = false;
     bool m_reloadWanted = false;
