@@ -70,58 +70,20 @@ class EmulatorTest : public QObject {
 private slots:
     void init();
 
-    void usage_data();
-    void usage();
     void files();
-    void folderInUse();
     void keyFile();
-    void malformedKeyFile();
     void survives_data();
     void survives();
-    void freshStore();
     void nothingPlainAtRest();
     void sameSeed_data();
     void sameSeed();
-    void fleet();
     void oddRecords();
-    void lifeIsRepeatable();
-    void lifeKeepsItsMeasure();
-    void heldDeviceStaysAway();
     void commands();
-    void refusedCommand_data();
-    void refusedCommand();
-    void endOfInput();
-    void stopCommand();
 };
 
 void EmulatorTest::init() {
     // A test with a key of its own must not leave it to the next.
     QVERIFY(nvlcryptoSetKeyFolder("/nonexistent", 12) == 0);
-}
-
-void EmulatorTest::usage_data() {
-    QTest::addColumn<QStringList>("arguments");
-    QTest::addColumn<int>("status");
-    QTest::addColumn<QString>("says");
-    QTest::newRow("help") << QStringList{"--help"} << 0 << "--fault";
-    QTest::newRow("version") << QStringList{"--version"} << 0 << "nvldm-emulator ";
-    QTest::newRow("no folder") << QStringList{} << 2 << "--root";
-    QTest::newRow("unknown") << QStringList{"--root", "/tmp/x", "--colour"} << 2 << "--colour";
-    QTest::newRow("no value") << QStringList{"--root"} << 2 << "--root";
-    QTest::newRow("no number") << QStringList{"--root=/tmp/x", "--port=http"} << 2 << "--port";
-    QTest::newRow("too large") << QStringList{"--root", "/tmp/x", "--port", "65536"} << 2 << "--port";
-    QTest::newRow("negative") << QStringList{"--root", "/tmp/x", "--devices", "-5"} << 2 << "--devices";
-    QTest::newRow("account") << QStringList{"--root", "/tmp/x", "--account", "a@b"} << 2 << "--account";
-    QTest::newRow("not a folder") << QStringList{"--root", "/dev/null/x"} << 1 << "/dev/null";
-}
-
-void EmulatorTest::usage() {
-    QFETCH(QStringList, arguments);
-    QFETCH(QString, says);
-    const auto outcome = EmulatorProcess::run(arguments);
-    QTEST(outcome.status, "status");
-    QVERIFY2((outcome.status == 0 ? outcome.output : outcome.errors).contains(says),
-             qPrintable(outcome.errors));
 }
 
 void EmulatorTest::files() {
@@ -143,15 +105,6 @@ void EmulatorTest::files() {
     QCOMPARE(stateOf(emulator.root()), QString("1"));
 }
 
-void EmulatorTest::folderInUse() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start());
-    const auto second = EmulatorProcess::run({"--root", emulator.root()});
-    QCOMPARE(second.status, 1);
-    QVERIFY(second.errors.contains("in use"));
-    QCOMPARE(stateOf(emulator.root()), QString("4"));
-}
-
 void EmulatorTest::keyFile() {
     EmulatorProcess emulator;
     QVERIFY(QDir().mkpath(emulator.root()));
@@ -166,17 +119,6 @@ void EmulatorTest::keyFile() {
     ServiceCaller caller(emulator.port());
     QCOMPARE(caller.login("admin", "admin").code, 0);
     QVERIFY(caller.call("/v1/config/get").data.is_object());
-}
-
-void EmulatorTest::malformedKeyFile() {
-    QTemporaryDir root;
-    QFile file(root.filePath("nvlcrypto.key"));
-    QVERIFY(file.open(QIODevice::WriteOnly));
-    file.write("5a5a");
-    file.close();
-    const auto outcome = EmulatorProcess::run({"--root", root.path()});
-    QCOMPARE(outcome.status, 1);
-    QVERIFY(outcome.errors.contains("key file"));
 }
 
 void EmulatorTest::survives_data() {
@@ -233,15 +175,6 @@ void EmulatorTest::survives() {
     QVERIFY(emulator.diagnostics().contains("keeps the 19 devices"));
 }
 
-void EmulatorTest::freshStore() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start());
-    QVERIFY(emulator.command("add 5").startsWith("ok"));
-    emulator.kill();
-    QVERIFY(emulator.start({"--fresh", "--devices", "7"}));
-    QVERIFY(emulator.command("counts").startsWith("ok devices=7 "));
-}
-
 void EmulatorTest::nothingPlainAtRest() {
     EmulatorProcess emulator;
     QVERIFY(emulator.start({"--account", "me@x.y:Very-Secret-77:admin"}));
@@ -282,39 +215,6 @@ void EmulatorTest::sameSeed() {
     QCOMPARE(ofLeft.list("/v1/dstatus/list") == ofRight.list("/v1/dstatus/list"), same);
 }
 
-void EmulatorTest::fleet() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start({"--devices", "3000", "--sites", "60"}));
-    ServiceCaller caller = admin(emulator);
-    const Json sites = caller.list("/v1/site/list");
-    QCOMPARE(sites.size(), std::size_t{60});
-    std::set<std::string> siteIds = {"DO000000000000"};
-    for (const Json &site : sites) {
-        siteIds.insert(site.at("siteid"));
-    }
-    std::set<std::string> ids, macs, addresses;
-    int cameras = 0;
-    int inSites = 0;
-    for (const Json &device : caller.list("/v1/dev/list")) {
-        ids.insert(device.at("id"));
-        macs.insert(device.at("d_mac"));
-        addresses.insert(device.at("d_ip"));
-        cameras += device.at("d_svrtype") == "Camera" ? 1 : 0;
-        inSites += device.at("siteid").size() > 1 ? 1 : 0;
-        QCOMPARE(device.at("siteid").front().get<std::string>(), std::string("DO000000000000"));
-        for (const Json &site : device.at("siteid")) {
-            QVERIFY(siteIds.count(site));
-        }
-    }
-    QCOMPARE(ids.size(), std::size_t{3000});
-    QCOMPARE(macs.size(), std::size_t{3000});
-    QCOMPARE(addresses.size(), std::size_t{3000});
-    QVERIFY(cameras > 2400 && cameras < 2700);
-    QVERIFY(inSites > 2600 && inSites < 2900);
-    // A hierarchy that the service itself would refuse would be no use.
-    QCOMPARE(caller.call("/v1/site/commit", {{"state", "all"}, {"sites", sites}}).code, 0);
-}
-
 void EmulatorTest::oddRecords() {
     EmulatorProcess emulator;
     QVERIFY(emulator.start({"--odd-records"}));
@@ -339,49 +239,6 @@ void EmulatorTest::oddRecords() {
     QCOMPARE(caller.call("/v1/dev/commit", {{"state", "all"}, {"devices", devices}}).code, 0);
 }
 
-void EmulatorTest::lifeIsRepeatable() {
-    const QStringList plan = {"--devices", "2000", "--life", "0"};
-    EmulatorProcess left;
-    EmulatorProcess right;
-    QVERIFY(left.start(plan));
-    QVERIFY(right.start(plan));
-    ServiceCaller ofLeft = admin(left);
-    ServiceCaller ofRight = admin(right);
-    const Json before = ofLeft.list("/v1/dstatus/list");
-    for (const char *ticks : {"tick 1", "tick 9", "tick 50"}) {
-        QCOMPARE(left.command(ticks), QString("ok"));
-        QCOMPARE(right.command(ticks), QString("ok"));
-        COMPARE_JSON(ofLeft.list("/v1/dstatus/list"), ofRight.list("/v1/dstatus/list"));
-    }
-    QVERIFY(ofLeft.list("/v1/dstatus/list") != before);
-}
-
-void EmulatorTest::lifeKeepsItsMeasure() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start({"--devices", "5000"}));
-    ServiceCaller caller = admin(emulator);
-    const auto before = unreachable(caller);
-    QCOMPARE(emulator.command("tick 300"), QString("ok"));
-    const auto after = unreachable(caller);
-    QVERIFY2(after.size() > 75 && after.size() < 225, qPrintable(QString::number(after.size())));
-    QVERIFY(before != after);
-    const QString counts = emulator.command("counts");
-    const int busy = QRegularExpression("busy=(\\d+)").match(counts).captured(1).toInt();
-    QVERIFY2(busy > 5 && busy < 60, qPrintable(counts));
-}
-
-void EmulatorTest::heldDeviceStaysAway() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start());
-    ServiceCaller caller = admin(emulator);
-    const std::string id = caller.list("/v1/dev/list").front().at("id");
-    QCOMPARE(emulator.command("drop " + QString::fromStdString(id)), QString("ok 1 device"));
-    QCOMPARE(emulator.command("tick 200"), QString("ok"));
-    QVERIFY(unreachable(caller).count(id));
-    QCOMPARE(emulator.command("restore " + QString::fromStdString(id)), QString("ok 1 device"));
-    QVERIFY(!unreachable(caller).count(id));
-}
-
 void EmulatorTest::commands() {
     EmulatorProcess emulator;
     QVERIFY(emulator.start());
@@ -404,40 +261,6 @@ void EmulatorTest::commands() {
     QCOMPARE(caller.list("/v1/dev/list").size(), std::size_t{23});
     QCOMPARE(emulator.command("expire-sessions"), QString("ok"));
     QCOMPARE(caller.call("/v1/config/get").code, 105);
-}
-
-void EmulatorTest::refusedCommand_data() {
-    QTest::addColumn<QString>("line");
-    for (const char *line :
-         {"", "nonsense", "drop", "drop DV404", "restore DV404", "remove DV404", "add some", "life maybe",
-          "status DV404 - - -", "faults", "tick x", "stop now"}) {
-        QTest::newRow(line) << line;
-    }
-}
-
-void EmulatorTest::refusedCommand() {
-    QFETCH(QString, line);
-    static EmulatorProcess emulator;
-    QVERIFY(emulator.isRunning() || emulator.start());
-    QVERIFY(emulator.command(line).startsWith("error "));
-    QVERIFY(emulator.command("counts").startsWith("ok devices=20 "));
-}
-
-void EmulatorTest::endOfInput() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start());
-    emulator.closeInput();
-    QTest::qWait(400);
-    QCOMPARE(ServiceCaller(emulator.port()).login("admin", "admin").code, 0);
-    QCOMPARE(emulator.stop(), 0);
-}
-
-void EmulatorTest::stopCommand() {
-    EmulatorProcess emulator;
-    QVERIFY(emulator.start());
-    QCOMPARE(emulator.command("stop"), QString("ok"));
-    QVERIFY(emulator.waitForEnd());
-    QCOMPARE(stateOf(emulator.root()), QString("1"));
 }
 
 QTEST_GUILESS_MAIN(EmulatorTest)

@@ -25,25 +25,14 @@ private slots:
     void answer();
     void wrongTypes_data();
     void wrongTypes();
-    void late();
-    void noAnswer();
-    void noAnswerEndsWithTheProgram();
     void reset();
-    void drip();
     void renew();
     void expire();
-    void undoneWork_data();
-    void undoneWork();
 
     void limits_data();
     void limits();
-    void rate();
-    void path();
-    void firstOfTwo();
-    void delayComesOnTop();
     void badSpec_data();
     void badSpec();
-    void latency();
 
 private:
     void put(const char *fault);
@@ -128,45 +117,6 @@ void EmulatorFaultsTest::wrongTypes() {
     }
 }
 
-void EmulatorFaultsTest::late() {
-    put("late=700@/v1/accm,times=1");
-    const ServiceCaller anybody(m_emulator.port());
-    QElapsedTimer timer;
-    timer.start();
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).code, 0);
-    QVERIFY(timer.elapsed() >= 700);
-    timer.start();
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).code, 0);
-    QVERIFY(timer.elapsed() < 700);
-}
-
-void EmulatorFaultsTest::noAnswer() {
-    put("no-answer,times=3");
-    ServiceCaller anybody(m_emulator.port());
-    anybody.setReadTimeout(1);
-    QElapsedTimer timer;
-    timer.start();
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).status, 0);
-    QVERIFY(timer.elapsed() >= 1000);
-}
-
-void EmulatorFaultsTest::noAnswerEndsWithTheProgram() {
-    put("no-answer");
-    const int port = m_emulator.port();
-    QElapsedTimer timer;
-    timer.start();
-    std::thread waiting([port] {
-        ServiceCaller anybody(port);
-        anybody.setReadTimeout(30);
-        anybody.post("/v1/accm/list", aPage);
-    });
-    QTest::qWait(300);
-    const int status = m_emulator.stop();
-    waiting.join();
-    QCOMPARE(status, 0);
-    QVERIFY(timer.elapsed() < 10000);
-}
-
 void EmulatorFaultsTest::reset() {
     put("reset@/v1/accm/list");
     httplib::SSLClient client("127.0.0.1", m_emulator.port());
@@ -188,22 +138,6 @@ void EmulatorFaultsTest::reset() {
     QVERIFY(!result);
     QVERIFY(announced > 0);
     QCOMPARE(received.size(), announced / 2);
-}
-
-void EmulatorFaultsTest::drip() {
-    put("drip@/isalive");
-    httplib::SSLClient client("127.0.0.1", m_emulator.port());
-    client.enable_server_certificate_verification(false);
-    std::string received;
-    QElapsedTimer timer;
-    timer.start();
-    client.Get("/isalive", {{"Authorization", ServiceCaller::genericToken()}},
-               [&](const char *data, std::size_t length) {
-                   received.append(data, length);
-                   return received.size() < 3;
-               });
-    QCOMPARE(received, std::string("{\"c"));
-    QVERIFY(timer.elapsed() >= 1900 && timer.elapsed() < 5000);
 }
 
 void EmulatorFaultsTest::renew() {
@@ -230,27 +164,7 @@ void EmulatorFaultsTest::expire() {
     QCOMPARE(admin.call("/v1/dev/list", aPage).code, 0);
 }
 
-void EmulatorFaultsTest::undoneWork_data() {
-    QTest::addColumn<QString>("fault");
-    QTest::addColumn<bool>("done");
-    QTest::newRow("code") << "code=3" << false;
-    QTest::newRow("status") << "status=500" << false;
-    QTest::newRow("no JSON") << "not-json" << true;
-    QTest::newRow("reset") << "reset" << true;
-}
-
 /// A caller that saw a failure cannot know whether the work was done; the emulator plays both.
-void EmulatorFaultsTest::undoneWork() {
-    QFETCH(QString, fault);
-    QFETCH(bool, done);
-    ServiceCaller admin(m_emulator.port());
-    QCOMPARE(admin.login("admin", "admin").code, 0);
-    const Json before = admin.list("/v1/site/list");
-    put((fault + "@/v1/site/new").toUtf8().constData());
-    admin.call("/v1/site/new", {{"sitename", "Maybe"}});
-    QCOMPARE(admin.list("/v1/site/list").size(), before.size() + (done ? 1 : 0));
-}
-
 void EmulatorFaultsTest::limits_data() {
     QTest::addColumn<QString>("fault");
     QTest::addColumn<QString>("expected");
@@ -279,42 +193,6 @@ void EmulatorFaultsTest::limits() {
     QTEST(seen, "expected");
 }
 
-void EmulatorFaultsTest::rate() {
-    put("code=9,rate=0.5");
-    const ServiceCaller anybody(m_emulator.port());
-    int hits = 0;
-    for (int i = 0; i < 200; ++i) {
-        hits += anybody.post("/v1/accm/list", aPage).code == 9 ? 1 : 0;
-    }
-    // Eight standard deviations to either side.
-    QVERIFY(hits > 43 && hits < 157);
-}
-
-void EmulatorFaultsTest::path() {
-    put("code=9@/v1/accm/l");
-    const ServiceCaller anybody(m_emulator.port());
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).code, 9);
-    QVERIFY(anybody.post("/v1/accm/new", aPage).code != 9);
-}
-
-void EmulatorFaultsTest::firstOfTwo() {
-    put("code=8,times=1");
-    put("code=9,times=1");
-    const ServiceCaller anybody(m_emulator.port());
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).code, 8);
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).code, 9);
-    QCOMPARE(anybody.post("/v1/accm/list", aPage).code, 0);
-}
-
-void EmulatorFaultsTest::delayComesOnTop() {
-    put("code=8");
-    put("late=400");
-    QElapsedTimer timer;
-    timer.start();
-    QCOMPARE(ServiceCaller(m_emulator.port()).post("/v1/accm/list", aPage).code, 8);
-    QVERIFY(timer.elapsed() >= 400);
-}
-
 void EmulatorFaultsTest::badSpec_data() {
     QTest::addColumn<QString>("spec");
     for (const char *spec : {"nonsense", "", "late", "late=", "late=soon", "late=-1", "status=99", "status",
@@ -331,15 +209,6 @@ void EmulatorFaultsTest::badSpec() {
     QVERIFY(outcome.errors.startsWith("nvldm-emulator: --fault: "));
     QVERIFY(m_emulator.command("fault \"" + spec + '"').startsWith("error"));
     QCOMPARE(ServiceCaller(m_emulator.port()).post("/v1/accm/list", aPage).code, 0);
-}
-
-void EmulatorFaultsTest::latency() {
-    EmulatorProcess slow;
-    QVERIFY(slow.start({"--latency", "300"}));
-    QElapsedTimer timer;
-    timer.start();
-    QCOMPARE(ServiceCaller(slow.port()).post("/v1/accm/list", aPage).code, 0);
-    QVERIFY(timer.elapsed() >= 300);
 }
 
 QTEST_GUILESS_MAIN(EmulatorFaultsTest)

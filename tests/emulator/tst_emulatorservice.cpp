@@ -88,44 +88,22 @@ private slots:
 
     void genericToken_data();
     void genericToken();
-    void judging_data();
-    void judging();
     void permission_data();
     void permission();
-    void loginOutcome_data();
-    void loginOutcome();
-    void sessionLimit();
-    void logoutEndsTheSession();
     void renewedToken();
-    void refusalRenewsNothing();
     void firstAccount();
-    void takenEmail();
-    void changedPassword();
-    void settings();
 
     void siteCommit_data();
     void siteCommit();
     void siteDeletion();
-    void singleSites();
 
-    void paging();
     void deviceUpsert();
-    void deviceCommitRefused_data();
-    void deviceCommitRefused();
     void deviceRemoval();
     void wholeBatch();
     void batchStage_data();
     void batchStage();
     void overdueBatch();
-    void batchOfAnotherSession();
 
-    void authorization_data();
-    void authorization();
-    void blockedAccount();
-    void passwordPolicy();
-    void scanResults_data();
-    void scanResults();
-    void foundDeviceIsAdded();
 
 private:
     /// Gives each test that changes something a service of its own.
@@ -210,67 +188,6 @@ void EmulatorServiceTest::genericToken() {
     QCOMPARE(anybody.send(alive).code, code);
 }
 
-void EmulatorServiceTest::judging_data() {
-    QTest::addColumn<QString>("verb");
-    QTest::addColumn<QString>("path");
-    QTest::addColumn<QString>("type");
-    QTest::addColumn<QString>("body");
-    QTest::addColumn<bool>("session");
-    QTest::addColumn<int>("status");
-    QTest::addColumn<int>("code");
-    const QString form = "application/x-www-form-urlencoded";
-    const QString page = R"({"id":"boss@x.y","start":0,"count":5})";
-    const auto row = [](const char *name, const char *verb, const char *path, const QString &type,
-                        const QString &body, bool session, int status, int code) {
-        QTest::newRow(name) << verb << path << type << body << session << status << code;
-    };
-    const auto list = "/v1/dev/list";
-    row("sound", "POST", list, form, page, true, 200, 0);
-    row("with charset", "POST", list, form + "; charset=utf-8", page, true, 200, 0);
-    row("other content type", "POST", list, "application/json", page, true, 200, 3);
-    row("longer content type", "POST", list, form + "x", page, true, 200, 3);
-    row("unknown path", "POST", "/v1/dev/lists", form, page, true, 404, -1);
-    row("path below", "POST", "/v1/dev/list/", form, page, true, 404, -1);
-    row("GET", "GET", list, form, "", true, 405, -1);
-    row("PUT", "PUT", list, form, page, true, 405, -1);
-    row("POST to alive", "POST", "/isalive", form, "", false, 405, -1);
-    row("no JSON", "POST", list, form, "id=boss", true, 200, 3);
-    row("empty", "POST", list, form, "", true, 200, 3);
-    row("an array", "POST", list, form, "[]", true, 200, 3);
-    row("broken UTF-8", "POST", list, form, QString(page).replace("boss", QString(QChar(0xd800))), true, 200,
-        105);
-    row("nested", "POST", list, form,
-        R"({"id":"boss@x.y","x":)" + QString(5000, '[') + QString(5000, ']') + "}", true, 200, 3);
-    row("no id", "POST", list, form, R"({"start":0,"count":5})", true, 200, 3);
-    row("id of another type", "POST", list, form, R"({"id":7,"start":0,"count":5})", true, 200, 3);
-    row("somebody else's id", "POST", list, form, R"({"id":"op@x.y","start":0,"count":5})", true, 200, 105);
-    row("generic token", "POST", list, form, page, false, 200, 105);
-    row("start missing", "POST", list, form, R"({"id":"boss@x.y","count":5})", true, 200, 3);
-    row("start as text", "POST", list, form, R"({"id":"boss@x.y","start":"0","count":5})", true, 200, 3);
-    row("start below 0", "POST", list, form, R"({"id":"boss@x.y","start":-1,"count":5})", true, 200, 3);
-    row("count broken", "POST", list, form, R"({"id":"boss@x.y","start":0,"count":1.5})", true, 200, 3);
-    row("too long", "POST", list, form, QString(17 << 20, ' '), true, 413, -1);
-    row("nearly too long", "POST", list, form, page + QString(15 << 20, ' '), true, 200, 0);
-}
-
-void EmulatorServiceTest::judging() {
-    QFETCH(QString, verb);
-    QFETCH(QString, path);
-    QFETCH(QString, type);
-    QFETCH(QString, body);
-    QFETCH(bool, session);
-    ServiceCaller boss = caller();
-    ServiceCaller::Request request;
-    request.verb = verb.toStdString();
-    request.path = path.toStdString();
-    request.body = body.toStdString();
-    request.contentType = type.toStdString();
-    request.token = session ? boss.token() : ServiceCaller::genericToken();
-    const Reply reply = boss.send(request);
-    QTEST(reply.status, "status");
-    QTEST(reply.code, "code");
-}
-
 void EmulatorServiceTest::permission_data() {
     QTest::addColumn<QString>("path");
     QTest::addColumn<bool>("writes");
@@ -296,52 +213,6 @@ void EmulatorServiceTest::permission() {
     QVERIFY(op.call(where, page).code != 5);
 }
 
-void EmulatorServiceTest::loginOutcome_data() {
-    QTest::addColumn<QString>("email");
-    QTest::addColumn<QString>("cipher");
-    QTest::addColumn<int>("code");
-    const QString right = QString::fromStdString(ServiceCaller::cipheredPassword(password));
-    const QString wrong = QString::fromStdString(ServiceCaller::cipheredPassword("Secret-pass-2"));
-    QTest::newRow("right") << "boss@x.y" << right << 0;
-    QTest::newRow("other case of the e-mail") << "Boss@X.y" << right << 0;
-    QTest::newRow("wrong password") << "boss@x.y" << wrong << 105;
-    QTest::newRow("unknown account") << "nobody@x.y" << right << 105;
-    QTest::newRow("factory account is replaced") << "admin" << right << 105;
-    QTest::newRow("plain password") << "boss@x.y" << QString(password) << 105;
-    QTest::newRow("tampered") << "boss@x.y" << right.left(right.size() - 6) + "AAAAA=" << 105;
-    QTest::newRow("empty") << "boss@x.y" << QString() << 105;
-}
-
-void EmulatorServiceTest::loginOutcome() {
-    QFETCH(QString, email);
-    QFETCH(QString, cipher);
-    const ServiceCaller anybody(m_emulator->port());
-    const Reply reply =
-        anybody.post("/v1/login", {{"email", email.toStdString()}, {"pass", cipher.toStdString()}});
-    QTEST(reply.code, "code");
-    QCOMPARE(reply.token.size(), reply.code == 0 ? std::size_t{43} : std::size_t{0});
-}
-
-void EmulatorServiceTest::sessionLimit() {
-    fresh({"--session-limit", "2"});
-    ServiceCaller first = caller();
-    caller();
-    ServiceCaller third(m_emulator->port());
-    QCOMPARE(third.login("boss@x.y", password).code, 108);
-    QCOMPARE(third.login("boss@x.y", "wrong").code, 105);
-    QCOMPARE(first.call("/v1/logout").code, 0);
-    QCOMPARE(third.login("boss@x.y", password).code, 0);
-}
-
-void EmulatorServiceTest::logoutEndsTheSession() {
-    fresh();
-    ServiceCaller boss = caller();
-    ServiceCaller other = caller();
-    QCOMPARE(boss.call("/v1/logout").code, 0);
-    QCOMPARE(boss.call("/v1/config/get").code, 105);
-    QCOMPARE(other.call("/v1/config/get").code, 0);
-}
-
 void EmulatorServiceTest::renewedToken() {
     fresh({"--fault", "renew@/v1/config/get,times=1", "--token-grace", "600"});
     ServiceCaller boss = caller();
@@ -354,13 +225,6 @@ void EmulatorServiceTest::renewedToken() {
     QTRY_COMPARE(boss.call("/v1/config/get").code, 105);
     boss.setToken(renewed);
     QCOMPARE(boss.call("/v1/config/get").code, 0);
-}
-
-void EmulatorServiceTest::refusalRenewsNothing() {
-    fresh({"--fault", "renew"});
-    ServiceCaller boss = caller();
-    QVERIFY(boss.call("/v1/dev/list").token.empty());
-    QVERIFY(!boss.call("/v1/site/list", {{"start", 0}, {"count", 1}}).token.empty());
 }
 
 void EmulatorServiceTest::firstAccount() {
@@ -389,57 +253,6 @@ void EmulatorServiceTest::firstAccount() {
     QCOMPARE(factory.call("/v1/config/get").code, 105);
     QCOMPARE(factory.login("admin", "admin").code, 105);
     QCOMPARE(factory.login("first@x.y", password).code, 0);
-}
-
-void EmulatorServiceTest::takenEmail() {
-    fresh();
-    const ServiceCaller anybody(m_emulator->port());
-    Json account = {
-        {"email", "OP@x.y"}, {"pass", ServiceCaller::cipheredPassword(password)}, {"permi", "viewer"}};
-    QCOMPARE(anybody.post("/v1/accm/new", account).code, 107);
-    account["email"] = "new@x.y";
-    account["permi"] = "owner";
-    QCOMPARE(anybody.post("/v1/accm/new", account).code, 3);
-    account["permi"] = "viewer";
-    account["pass"] = password;
-    QCOMPARE(anybody.post("/v1/accm/new", account).code, 3);
-    account["pass"] = ServiceCaller::cipheredPassword(password);
-    QCOMPARE(anybody.post("/v1/accm/new", account).code, 0);
-    QCOMPARE(anybody.post("/v1/accm/list", {{"start", 3}, {"count", 10}}).data.at("data").size(),
-             std::size_t{1});
-}
-
-void EmulatorServiceTest::changedPassword() {
-    fresh();
-    ServiceCaller boss = caller();
-    const auto change = [&](const char *email, const char *old, const char *fresh) {
-        return boss
-            .post("/v1/accm/revpas", {{"email", email},
-                                      {"old", ServiceCaller::cipheredPassword(old)},
-                                      {"new", ServiceCaller::cipheredPassword(fresh)}})
-            .code;
-    };
-    QCOMPARE(change("boss@x.y", "not it", "Other-pass-2"), 106);
-    QCOMPARE(change("nobody@x.y", password, "Other-pass-2"), 4);
-    QCOMPARE(change("boss@x.y", password, ""), 3);
-    QCOMPARE(change("boss@x.y", password, "Other-pass-2"), 0);
-    ServiceCaller again(m_emulator->port());
-    QCOMPARE(again.login("boss@x.y", password).code, 105);
-    QCOMPARE(again.login("boss@x.y", "Other-pass-2").code, 0);
-}
-
-void EmulatorServiceTest::settings() {
-    fresh();
-    ServiceCaller boss = caller();
-    const Json before = boss.call("/v1/config/get").data;
-    QCOMPARE(boss.call("/v1/config/set", {{"nf_alarms", false}, {"days", 45}, {"unheard_of", 1}}).code, 0);
-    Json expected = before;
-    expected["nf_alarms"] = false;
-    expected["log_keepdays"] = 45;
-    COMPARE_JSON(boss.call("/v1/config/get").data, expected);
-    QCOMPARE(boss.call("/v1/config/set", {{"nf_tasks", false}, {"rp_keepnum", "3"}}).code, 3);
-    QCOMPARE(boss.call("/v1/config/set", {{"log_keepdays", -1}}).code, 3);
-    COMPARE_JSON(boss.call("/v1/config/get").data, expected);
 }
 
 void EmulatorServiceTest::siteCommit_data() {
@@ -511,45 +324,6 @@ void EmulatorServiceTest::siteDeletion() {
     COMPARE_JSON(boss.list("/v1/dev/list").front().at("siteid"), arrayOf(overview));
 }
 
-void EmulatorServiceTest::singleSites() {
-    fresh();
-    ServiceCaller boss = caller();
-    const Reply top = boss.call("/v1/site/new", {{"sitename", "Top"}});
-    QVERIFY(top.secret);
-    const std::string topId = top.data.at("siteid");
-    QCOMPARE(topId.substr(0, 2), std::string("SR"));
-    const std::string below =
-        boss.call("/v1/site/new", {{"sitename", "Below"}, {"parentid", topId}}).data.at("siteid");
-    COMPARE_JSON(*withMember(boss.list("/v1/site/list"), "siteid", below),
-                 site(below.c_str(), topId.c_str(), "Below"));
-    const auto update = [&](const std::string &id, const std::string &parent) {
-        return boss.call("/v1/site/update", {{"siteid", id}, {"sitename", "Renamed"}, {"parentid", parent}})
-            .code;
-    };
-    QCOMPARE(update(below, rootSite), 0);
-    QCOMPARE(update(topId, below), 0);
-    QCOMPARE(update(below, topId), 3);
-    QCOMPARE(update("SR404", rootSite), 4);
-    QCOMPARE(update(below, "SR404"), 3);
-    COMPARE_JSON(*withMember(boss.list("/v1/site/list"), "siteid", below),
-                 site(below.c_str(), rootSite, "Renamed"));
-}
-
-void EmulatorServiceTest::paging() {
-    ServiceCaller boss = caller();
-    const Json whole = boss.list("/v1/dev/list");
-    QCOMPARE(whole.size(), std::size_t{20});
-    COMPARE_JSON(boss.list("/v1/dev/list", 7), whole);
-    const Json statuses = boss.list("/v1/dstatus/list", 3);
-    QCOMPARE(statuses.size(), whole.size());
-    for (std::size_t i = 0; i < whole.size(); ++i) {
-        COMPARE_JSON(statuses[i].at("id"), whole[i].at("id"));
-    }
-    COMPARE_JSON(boss.call("/v1/dev/list", {{"start", 20}, {"count", 5}}).data, Json::array());
-    COMPARE_JSON(boss.call("/v1/dev/list", {{"start", 0}, {"count", 0}}).data, Json::array());
-    QVERIFY(boss.call("/v1/dev/list", {{"start", 0}, {"count", 1}}).secret);
-}
-
 void EmulatorServiceTest::deviceUpsert() {
     fresh();
     ServiceCaller boss = caller();
@@ -581,40 +355,6 @@ void EmulatorServiceTest::deviceUpsert() {
     COMPARE_JSON(boss.list("/v1/dev/list").back().at("siteid"), Json({overview, someSite}));
     QCOMPARE(commit(newDevice("00:1B:07:AA:BB:0C")), 0);
     QCOMPARE(boss.list("/v1/dev/list").size(), std::size_t{22});
-}
-
-void EmulatorServiceTest::deviceCommitRefused_data() {
-    QTest::addColumn<QByteArray>("bad");
-    QTest::addColumn<int>("code");
-    const auto row = [](const char *name, Json changes, int code) {
-        Json device = newDevice("00:1B:07:00:00:01");
-        device.update(changes);
-        QTest::newRow(name) << QByteArray::fromStdString(device.dump()) << code;
-    };
-    row("unknown id", {{"id", "DV000000000404"}}, 4);
-    row("unknown site", {{"siteid", {overview, "SR404"}}}, 4);
-    row("removal of nothing", {{"siteid", Json::array()}}, 4);
-    row("no MAC", {{"d_mac", ""}}, 3);
-    row("broken MAC", {{"d_mac", "00:1B:07:00:00"}}, 3);
-    row("port as text", {{"d_http", "80"}}, 3);
-    row("model as number", {{"d_model", 4210}}, 3);
-    row("flag as number", {{"https_enable", 1}}, 3);
-    row("policy as text", {{"d_policy", "strong"}}, 3);
-    row("sites as object", {{"siteid", Json::object()}}, 3);
-    row("sites as other text", {{"siteid", "SR1"}}, 3);
-    row("site as number", {{"siteid", arrayOf(1)}}, 3);
-    QTest::newRow("no object") << QByteArray("[]") << 3;
-}
-
-void EmulatorServiceTest::deviceCommitRefused() {
-    QFETCH(QByteArray, bad);
-    ServiceCaller boss = caller();
-    const Json before = boss.list("/v1/dev/list");
-    Json renamed = before.front();
-    renamed["d_hostname"] = "renamed";
-    const Json devices = {renamed, newDevice("00:1B:07:00:00:02"), Json::parse(bad.toStdString())};
-    QTEST(boss.call("/v1/dev/commit", {{"state", "all"}, {"devices", devices}}).code, "code");
-    COMPARE_JSON(boss.list("/v1/dev/list"), before);
 }
 
 void EmulatorServiceTest::deviceRemoval() {
@@ -688,178 +428,6 @@ void EmulatorServiceTest::overdueBatch() {
     QCOMPARE(stage("update", "00:1B:07:00:00:02"), 3);
     QCOMPARE(stage("end", "00:1B:07:00:00:03"), 3);
     QCOMPARE(boss.list("/v1/dev/list").size(), std::size_t{20});
-}
-
-void EmulatorServiceTest::batchOfAnotherSession() {
-    fresh();
-    ServiceCaller boss = caller();
-    ServiceCaller op = caller("op@x.y");
-    const Json devices = arrayOf(newDevice("00:1B:07:00:00:01"));
-    QCOMPARE(boss.call("/v1/dev/commit", {{"state", "start"}, {"devices", devices}}).code, 0);
-    QCOMPARE(op.call("/v1/dev/commit", {{"state", "end"}, {"devices", Json::array()}}).code, 3);
-    QCOMPARE(boss.call("/v1/site/commit", {{"state", "end"}, {"sites", Json::array()}}).code, 3);
-    QCOMPARE(boss.call("/v1/dev/commit", {{"state", "end"}, {"devices", Json::array()}}).code, 0);
-}
-
-void EmulatorServiceTest::authorization_data() {
-    QTest::addColumn<QString>("account");
-    QTest::addColumn<QString>("password");
-    QTest::addColumn<QString>("connect");
-    QTest::addColumn<QString>("outcome");
-    QTest::newRow("right") << "root"
-                           << "longenough"
-                           << "Connected"
-                           << "Authorized";
-    QTest::newRow("wrong") << "root"
-                           << "wrong"
-                           << "Connected"
-                           << "Invalid Password";
-    QTest::newRow("short") << "root"
-                           << "1234567"
-                           << "Connected"
-                           << "Invalid Password";
-    QTest::newRow("other account") << "guest"
-                                   << "longenough"
-                                   << "Connected"
-                                   << "Access Denied";
-    QTest::newRow("out of reach") << "root"
-                                  << "longenough"
-                                  << "Unreachable"
-                                  << "Unauthorized";
-}
-
-void EmulatorServiceTest::authorization() {
-    fresh();
-    QFETCH(QString, account);
-    QFETCH(QString, password);
-    QFETCH(QString, connect);
-    QFETCH(QString, outcome);
-    ServiceCaller boss = caller();
-    QCOMPARE(
-        boss.call("/v1/dev/commit", {{"state", "all"}, {"devices", arrayOf(newDevice("00:1B:07:00:00:01"))}})
-            .code,
-        0);
-    const Json device = boss.list("/v1/dev/list").back();
-    const std::string id = device.at("id");
-    QVERIFY(!device.contains("d_fw"));
-    QCOMPARE(statusOf(boss, id), QString("Unauthorized"));
-    QVERIFY(m_emulator->command("status " + QString::fromStdString(id) + " - " + connect + " -")
-                .startsWith("ok"));
-
-    const Json body = {{"devices", arrayOf(id)},
-                       {"acc", account.toStdString()},
-                       {"pass", ServiceCaller::cipheredPassword(password.toStdString())}};
-    QCOMPARE(boss.call("/v1/dev/auth", body).code, 0);
-    QCOMPARE(statusOf(boss, id), QString("Unauthorized"));
-    if (connect == "Unreachable") {
-        QTest::qWait(1200);
-    }
-    QTRY_COMPARE(statusOf(boss, id), outcome);
-    const Json known = boss.list("/v1/dev/list").back();
-    QCOMPARE(known.contains("d_fw") && known.contains("d_hostname"), outcome == "Authorized");
-}
-
-void EmulatorServiceTest::blockedAccount() {
-    fresh();
-    ServiceCaller boss = caller();
-    const std::string id = boss.list("/v1/dev/list").front().at("id");
-    QVERIFY(m_emulator->command(QString::fromStdString("status " + id + " Unauthorized Connected -"))
-                .startsWith("ok"));
-    const auto offer = [&](const char *secret) {
-        const Json body = {{"devices", arrayOf({{"id", id}})},
-                           {"acc", "root"},
-                           {"pass", ServiceCaller::cipheredPassword(secret)}};
-        return boss.call("/v1/dev/auth", body).code;
-    };
-    QCOMPARE(offer("wrong"), 0);
-    QTRY_COMPARE(statusOf(boss, id), QString("Invalid Password"));
-    QCOMPARE(offer("wrong"), 0);
-    QCOMPARE(offer("wrong"), 0);
-    QTRY_COMPARE(statusOf(boss, id), QString("Account Blocked"));
-    QCOMPARE(offer("longenough"), 0);
-    QTest::qWait(1200);
-    QCOMPARE(statusOf(boss, id), QString("Account Blocked"));
-
-    const Json unknown = {
-        {"devices", arrayOf("DV404")}, {"acc", "root"}, {"pass", ServiceCaller::cipheredPassword("x")}};
-    QCOMPARE(boss.call("/v1/dev/auth", unknown).code, 4);
-    QCOMPARE(boss.call("/v1/dev/auth", {{"devices", arrayOf(id)}, {"acc", "root"}, {"pass", "plain"}}).code,
-             3);
-}
-
-void EmulatorServiceTest::passwordPolicy() {
-    fresh();
-    ServiceCaller boss = caller();
-    const Json id = boss.list("/v1/dev/list").front().at("id");
-    const auto set = [&](const Json &devices, const Json &type) {
-        return boss
-            .call("/v1/dev/setpolicy", {{"devices", devices}, {"plen", 12}, {"type", type}, {"tid", "T1"}})
-            .code;
-    };
-    QCOMPARE(set(arrayOf(id), "11"), 0);
-    COMPARE_JSON(boss.list("/v1/dev/list").front().at("d_policy"), Json({{"plen", 12}, {"type", 11}}));
-    QCOMPARE(set(arrayOf(id), 11), 3);
-    QCOMPARE(set(arrayOf(id), "eleven"), 3);
-    QCOMPARE(set({id, "DV404"}, "7"), 4);
-    QCOMPARE(boss.list("/v1/dev/list").front().at("d_policy").at("type").get<int>(), 11);
-}
-
-void EmulatorServiceTest::scanResults_data() {
-    QTest::addColumn<QString>("path");
-    QTest::addColumn<QByteArray>("body");
-    QTest::addColumn<int>("code");
-    QTest::addColumn<int>("unmanaged");
-    const auto row = [](const char *name, const char *path, const char *body, int code, int unmanaged) {
-        QTest::newRow(name) << path << QByteArray(body) << code << unmanaged;
-    };
-    row("network", "/v1/dev/scan", R"({"timeout":5})", 0, 40);
-    row("no time", "/v1/dev/scan", R"({"timeout":0})", 3, 0);
-    row("address", "/v1/dev/scanip", R"({"ip":"10.99.0.12","timeout":5})", 0, 1);
-    row("address and port", "/v1/dev/scanip", R"({"ip":"10.99.0.10:80","timeout":5})", 0, 1);
-    row("closed port", "/v1/dev/scanip", R"({"ip":"10.99.0.10:81","timeout":5})", 0, 0);
-    row("nobody there", "/v1/dev/scanip", R"({"ip":"10.99.0.9","timeout":5})", 0, 0);
-    row("no address", "/v1/dev/scanip", R"({"ip":"10.99.0","timeout":5})", 3, 0);
-    row("no port", "/v1/dev/scanip", R"({"ip":"10.99.0.12:http","timeout":5})", 3, 0);
-    row("range", "/v1/dev/scanips", R"({"ip_start":"10.99.0.1","ip_end":"10.99.0.19","timeout":5})", 0, 10);
-    row("range of one", "/v1/dev/scanips", R"({"ip_start":"10.99.0.49","ip_end":"10.99.0.49","timeout":5})",
-        0, 1);
-    row("backward", "/v1/dev/scanips", R"({"ip_start":"10.99.0.19","ip_end":"10.99.0.1","timeout":5})", 3, 0);
-}
-
-void EmulatorServiceTest::scanResults() {
-    QFETCH(QString, path);
-    QFETCH(QByteArray, body);
-    QFETCH(int, code);
-    QFETCH(int, unmanaged);
-    ServiceCaller boss = caller();
-    // An earlier scan's results must not be taken for this one's.
-    QCOMPARE(boss.call("/v1/dev/scanip", {{"ip", "10.99.0.1"}, {"timeout", 5}}).code, 0);
-    QCOMPARE(boss.call(path.toStdString(), Json::parse(body.toStdString())).code, code);
-    COMPARE_JSON(boss.call("/v1/dev/scanout").data, Json::array());
-    const auto found = [&] {
-        int count = 0;
-        for (const Json &device : boss.call("/v1/dev/scanout").data) {
-            count += device.at("id") == "" ? 1 : 0;
-        }
-        return count;
-    };
-    QTRY_COMPARE_WITH_TIMEOUT(found(), unmanaged, 4000);
-}
-
-void EmulatorServiceTest::foundDeviceIsAdded() {
-    fresh();
-    ServiceCaller boss = caller();
-    const Json scan = {{"ip", "10.99.0.20"}, {"timeout", 5}};
-    QCOMPARE(boss.call("/v1/dev/scanip", scan).code, 0);
-    Json found;
-    QTRY_VERIFY(!(found = boss.call("/v1/dev/scanout").data).empty());
-    QCOMPARE(boss.call("/v1/dev/commit", {{"state", "all"}, {"devices", found}}).code, 0);
-    const Json added = boss.list("/v1/dev/list").back();
-    COMPARE_JSON(added.at("d_mac"), found[0].at("d_mac"));
-    // Found once more it is a managed device, by its id.
-    QCOMPARE(boss.call("/v1/dev/scanip", scan).code, 0);
-    QTRY_COMPARE(boss.call("/v1/dev/scanout").data.size(), std::size_t{1});
-    COMPARE_JSON(boss.call("/v1/dev/scanout").data[0].at("id"), added.at("id"));
 }
 
 QTEST_GUILESS_MAIN(EmulatorServiceTest)
