@@ -9,6 +9,8 @@
 
 #include <httplib.h>
 
+#include <sys/socket.h>
+
 #include <iostream>
 #include <stdexcept>
 #include <thread>
@@ -34,6 +36,12 @@ void configure(httplib::SSLServer &server) {
     // Callers come back with a fresh connection each time; tickets that nobody reads would only disturb
     // the close of a connection.
     SSL_CTX_set_num_tickets(server.ssl_context(), 0);
+    // The library would share the port with another server that asks for it; only a port whose last
+    // connections are still dying may be taken again.
+    server.set_socket_options([](socket_t descriptor) {
+        const int on = 1;
+        ::setsockopt(descriptor, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on);
+    });
     server.new_task_queue = [] { return new httplib::ThreadPool(threads); };
     server.set_tcp_nodelay(true);
     server.set_keep_alive_timeout(2);

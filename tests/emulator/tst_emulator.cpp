@@ -71,6 +71,7 @@ private slots:
     void init();
 
     void files();
+    void portInUse();
     void keyFile();
     void survives_data();
     void survives();
@@ -103,6 +104,17 @@ void EmulatorTest::files() {
     }
     QCOMPARE(emulator.stop(), 0);
     QCOMPARE(stateOf(emulator.root()), QString("1"));
+}
+
+void EmulatorTest::portInUse() {
+    EmulatorProcess emulator;
+    QVERIFY(emulator.start());
+    QTemporaryDir other;
+    const auto second =
+        EmulatorProcess::run({"--root", other.path(), "--port", QString::number(emulator.port())});
+    QCOMPARE(second.status, 1);
+    QVERIFY(second.errors.contains("cannot listen"));
+    QCOMPARE(stateOf(other.path()), QString());
 }
 
 void EmulatorTest::keyFile() {

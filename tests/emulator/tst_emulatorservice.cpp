@@ -104,7 +104,6 @@ private slots:
     void batchStage();
     void overdueBatch();
 
-
 private:
     /// Gives each test that changes something a service of its own.
     void fresh(const QStringList &more = {});
