@@ -70,7 +70,7 @@ private slots:
 private:
     /// A fresh client with the session of the last login.
     std::unique_ptr<CApiClient> client() const {
-        auto made = std::make_unique<CApiClient>("localhost", m_emulator.port());
+        auto made = std::make_unique<CApiClient>("127.0.0.1", m_emulator.port());
         made->setAccount(account);
         made->setAccessToken(CLocalStore::instance().access().constData());
         return made;
@@ -99,7 +99,7 @@ void TestApiClientEmulator::initTestCase() {
 
 void TestApiClientEmulator::init() {
     m_log = std::make_unique<LogCapture>();
-    QCOMPARE(CApiClient("localhost", m_emulator.port()).loginServer(account, password), unsigned(ApiOk));
+    QCOMPARE(CApiClient("127.0.0.1", m_emulator.port()).loginServer(account, password), unsigned(ApiOk));
 }
 
 void TestApiClientEmulator::cleanup() {

@@ -104,8 +104,8 @@ private slots:
         QCOMPARE(sessions(), 1);
     }
 
-    void logsInToAServerThatIsNamed() {
-        const QString server = "localhost:" + QString::number(m_service.port());
+    void logsInToARemoteServer() {
+        const QString server = "127.0.0.1:" + QString::number(m_service.port());
         fillRemote(server);
         Form::click(m_dialog.get(), "loginButton");
         QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), 1, patienceMs);

@@ -1,5 +1,6 @@
 #include "serveraddress.h"
 
+#include <QHostInfo>
 #include <QTest>
 
 class TestServerAddress : public QObject {
@@ -41,9 +42,12 @@ private slots:
     }
 
     void nameIsLookedUp() {
-        QCOMPARE(ServerAddress{"localhost"}.resolved(), QStringLiteral("127.0.0.1"));
         QCOMPARE(ServerAddress{"10.1.2.3"}.resolved(), QStringLiteral("10.1.2.3"));
         QCOMPARE(ServerAddress{"no-such-host.invalid"}.resolved(), QStringLiteral("no-such-host.invalid"));
+        // A bare file system has no table of hosts, and then nobody knows this name.
+        if (QHostInfo::fromName("localhost").error() != QHostInfo::NoError)
+            QSKIP("localhost has no address on this machine");
+        QCOMPARE(ServerAddress{"localhost"}.resolved(), QStringLiteral("127.0.0.1"));
     }
 };
 
