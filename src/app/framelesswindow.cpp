@@ -126,6 +126,10 @@ void FramelessWindow::connectParts() {
     connect(&SessionEvents::instance(), &SessionEvents::sessionLost, this, &FramelessWindow::onSessionLost);
 }
 
+QWidget *FramelessWindow::contentParent() const {
+    return m_stack;
+}
+
 void FramelessWindow::setContent(MainWindow *content) {
     m_content = content;
     m_stack->addWidget(content);

@@ -23,6 +23,8 @@ public:
     /// Ends the session on the service too, and waits for the answer for a few seconds at most.
     ~FramelessWindow() override;
 
+    /// The parent for the main window to be made with, which spares styling it twice.
+    QWidget *contentParent() const;
     /// Takes the main window over as the frame's content.
     void setContent(MainWindow *content);
 

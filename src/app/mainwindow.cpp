@@ -20,6 +20,8 @@ constexpr QSize railButtonSize{44, 44};
 
 /// Made before its children: a tree of widgets that moves to another parent is styled all over again.
 QWidget *makeCentral(QMainWindow *window) {
+    // It lives inside the frame, so it is no window of its own; said while there is nothing to style yet.
+    window->setWindowFlags(Qt::Widget);
     auto *central = new QWidget(window);
     central->setAttribute(Qt::WA_TranslucentBackground);
     auto *layout = new QHBoxLayout(central);

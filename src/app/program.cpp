@@ -41,8 +41,7 @@ int runWindows(QApplication &application, const std::function<void(QWidget &)> &
     splash.showMessage(QCoreApplication::applicationName(), Qt::AlignLeft | Qt::AlignBottom, Qt::white);
 
     FramelessWindow frame;
-    // The frame takes it over; until then it is nobody's.
-    auto *content = new MainWindow;
+    auto *content = new MainWindow(frame.contentParent());
     content->setWindowTitle(QCoreApplication::translate("main", "Norvell Device Manager"));
     frame.setContent(content);
     frame.show();

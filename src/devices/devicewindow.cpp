@@ -78,7 +78,7 @@ void DeviceWindow::buildTabs() {
     const std::pair<QString, const char *> tabs[] = {
         {tr("Camera"), "cameraTable"}, {tr("NVR"), "nvrTable"}, {tr("Others"), "othersTable"}};
     for (int i = 0; i < deviceClassCount; ++i) {
-        auto *tab = new DeviceTab(static_cast<DeviceClass>(i), &m_inventory, m_tabs);
+        auto *tab = new DeviceTab(static_cast<DeviceClass>(i), &m_inventory, m_tabs->pageParent());
         tab->table()->setObjectName(QLatin1String(tabs[i].second));
         tab->table()->setAccessibleName(tabs[i].first);
         m_tabs->addTab(tab, tabs[i].first);

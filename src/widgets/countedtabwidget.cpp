@@ -4,6 +4,7 @@
 
 #include <QLocale>
 #include <QPainter>
+#include <QStackedWidget>
 #include <QTabBar>
 
 namespace {
@@ -79,4 +80,8 @@ void CountedTabWidget::setCount(int tab, int count) {
     const QString name = tabText(tab);
     tabBar()->setTabText(tab, QString());
     tabBar()->setTabText(tab, name);
+}
+
+QWidget *CountedTabWidget::pageParent() const {
+    return findChild<QStackedWidget *>(QString(), Qt::FindDirectChildrenOnly);
 }

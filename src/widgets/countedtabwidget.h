@@ -10,4 +10,7 @@ public:
     explicit CountedTabWidget(QWidget *parent = nullptr);
 
     void setCount(int tab, int count);
+
+    /// The parent for pages to be made with: adding one moves it there, and a move styles it all over again.
+    QWidget *pageParent() const;
 };
