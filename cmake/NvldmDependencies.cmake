@@ -1,6 +1,9 @@
 # Everything the project calls and did not write: packages of the distribution, never copies.
 
 find_package(Qt6 6.4 REQUIRED COMPONENTS Core Gui Widgets Network)
+if(UNIX AND NOT APPLE)
+    find_package(Qt6 6.4 REQUIRED COMPONENTS DBus)
+endif()
 if(NVLDM_BUILD_TESTS OR NVLDM_BUILD_BENCH)
     find_package(Qt6 6.4 REQUIRED COMPONENTS Test)
 endif()

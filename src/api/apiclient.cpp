@@ -122,11 +122,17 @@ unsigned CApiClient::post(const Call &call, const JSON &body, JSON *output) {
         }
         return judge(call, answer, output);
     } catch (const std::exception &error) {
-        std::cout << "API Client Error: " << error.what() << std::endl;
+        logException(call, error.what());
     } catch (...) {
-        std::cout << "API Client Error: Unknown exception" << std::endl;
+        logException(call, "Unknown exception");
     }
     return ApiException;
+}
+
+void CApiClient::logException(const Call &call, const std::string &error) {
+    std::cout << "API Client Error: " << error << std::endl;
+    if (call.logException)
+        call.logException(call, error);
 }
 
 unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, JSON *output) {

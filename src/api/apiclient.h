@@ -74,6 +74,33 @@ public:
     /// A page of status records; nStart counts from 0.
     virtual unsigned listDeviceStatus(int nStart, int nCount, JSON &statuses);
 
+    // Commands on devices
+
+    /// Lets devices run commands. cgis: array of commands, each a path of a device. devices: array of ids, or
+    /// of objects with "id" and "tid" to run under a task, which is answered at once. answers: one a device.
+    virtual unsigned runCustomCgisEx(const JSON &cgis, const JSON &devices, JSON &answers);
+
+    // Tasks, alarms, log
+
+    /// Registers a task. devices: array of ids or of objects with "id" and the task's parameters. task: its
+    /// record.
+    virtual unsigned newTaskState(const char *szType, const JSON &devices, JSON &task);
+    /// A page of task records, newest first; nStart counts from 0.
+    virtual unsigned listTaskStatus(int nStart, int nCount, JSON &tasks);
+    /// Takes finished tasks off the service's list. tids: array of their ids.
+    virtual unsigned removeTaskStatus(const JSON &tids);
+    /// Ends a task. szState: "pTaskDone", "pTaskAborted" or "pTaskFailed".
+    virtual unsigned updateTaskState(const char *szTaskId, const char *szState);
+    /// A page of alarms, newest first: an object with "items" and "total_items".
+    virtual unsigned listAlarmInfo(int nStart, int nCount, JSON &alarms);
+    /// alids: array of the ids of alarms.
+    virtual unsigned removeAlarmInfo(const JSON &alids);
+    /// Log entries of a time range, both ends Unix ms as decimal text and inclusive. table: array of objects
+    /// whose members are named like the columns of the log page; ApiException when an entry lacks a value.
+    virtual unsigned browseLogs(const char *szStart, const char *szEnd, JSON &table);
+    /// Has debug information collected. szStorePath: where, on the service's machine.
+    virtual unsigned exportDebugInfo(const char *szStorePath, const JSON &devices, JSON &answer);
+
     // Service settings
 
     virtual unsigned loadServerSettings(JSON &settings);
@@ -90,6 +117,7 @@ protected:
         Payload payload = Payload::None;
         bool genericToken = false; ///< a fresh token of its own in place of the session's
         void (*logTransportError)(const Call &call, const std::string &error) = nullptr;
+        void (*logException)(const Call &call, const std::string &error) = nullptr;
         unsigned (*judgeCode)(int code) = nullptr; ///< in place of the usual judging of "code"
     };
 
@@ -106,6 +134,7 @@ protected:
 
 private:
     unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
+    static void logException(const Call &call, const std::string &error);
     void renewToken(const Call &call, const std::string &token);
 
     std::string m_strHost;

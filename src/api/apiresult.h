@@ -1,5 +1,7 @@
 #pragma once
 
+#include <QString>
+
 /// Results of the service client's methods. Callers compare with ApiOk and show or log the number otherwise.
 enum ApiResult : unsigned {
     ApiOk = 0,
@@ -14,3 +16,7 @@ enum ApiResult : unsigned {
     ApiCode108 = 18,         ///< no more sessions
     ApiEmailTaken = 1003     ///< newMember of the local client: the e-mail has an account already
 };
+
+/// What a result other than ApiOk means to the user: the part of a sentence that follows "could not be done:
+/// ".
+QString apiResultText(unsigned result);

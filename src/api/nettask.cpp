@@ -2,18 +2,19 @@
 
 #include <QDeadlineTimer>
 #include <QDebug>
-#include <QMutex>
 
 #include <algorithm>
+#include <chrono>
+#include <mutex>
 #include <vector>
 
 namespace {
 
-constexpr int turnWaitMs = 30000;
+constexpr std::chrono::milliseconds turnWait{30000};
 /// The transport matches status lines with a recursive expression; a long line needs a deep stack.
 constexpr uint stackBytes = 64u << 20;
 
-QMutex turnMutex;
+std::timed_mutex turnMutex;
 
 /// Every runner that exists; touched in the user-interface thread only.
 std::vector<NetTask *> &runners() {
@@ -30,7 +31,7 @@ void NetTask::LetGo::operator()(NetTask *runner) const {
         delete runner;
 }
 
-NetTask::NetTask(QObject *parent) : QThread(parent) {
+NetTask::NetTask(Turn turn) : m_turn(turn) {
     setStackSize(stackBytes);
     runners().push_back(this);
 }
@@ -60,9 +61,9 @@ void NetTask::run() {
 }
 
 void NetTask::runJob() {
-    if (!turnMutex.tryLock(turnWaitMs))
+    std::unique_lock lock(turnMutex, std::defer_lock);
+    if (m_turn == Turn::Wait && !lock.try_lock_for(turnWait))
         return;
-    const std::unique_lock lock(turnMutex, std::adopt_lock);
     if (m_job)
         m_job(m_context);
 }

@@ -8,13 +8,15 @@
 /// Runs one blocking job on a thread of its own, one job of the whole process at a time.
 ///
 /// Set up with a job and started, from the user-interface thread; a long-lived runner takes the next job when
-/// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that.
+/// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that. A runner beside
+/// the turn does neither: it is for the polls, which nobody's click should wait for.
 class NetTask : public QThread {
     Q_OBJECT
 
 public:
     using Job = std::function<void(quintptr context)>;
     using Preparation = std::function<void()>;
+    enum class Turn { Wait, Beside };
 
     /// Lets a runner go without waiting for it: one that still runs deletes itself when it has finished.
     struct LetGo {
@@ -23,7 +25,7 @@ public:
     /// How a window owns a runner: the window may close while a job runs.
     using Owner = std::unique_ptr<NetTask, LetGo>;
 
-    explicit NetTask(QObject *parent = nullptr);
+    explicit NetTask(Turn turn = Turn::Wait);
     ~NetTask() override;
 
     /// Stores the job in place of any earlier one, and what to do before the job waits for its turn: name
@@ -42,6 +44,7 @@ protected:
 private:
     void runJob();
 
+    Turn m_turn;
     quintptr m_context = 0;
     Job m_job;
     Preparation m_preparation;

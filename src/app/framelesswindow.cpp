@@ -8,14 +8,18 @@
 #include "localstore.h"
 #include "logindialog.h"
 #include "mainwindow.h"
+#include "notifier.h"
 #include "popupmenu.h"
 #include "servicecontrol.h"
 #include "servicerequest.h"
+#include "sidepanel.h"
 #include "startcheck.h"
+#include "taskinfopool.h"
 #include "titlebar.h"
 #include "welcomepage.h"
 
 #include <QApplication>
+#include <QCloseEvent>
 #include <QDebug>
 #include <QMouseEvent>
 #include <QStackedWidget>
@@ -123,6 +127,8 @@ void FramelessWindow::connectParts() {
     connect(m_startCheck, &StartCheck::loginNeeded, this, &FramelessWindow::openLoginDialog);
     connect(m_welcome, &WelcomePage::loginRequested, this, &FramelessWindow::checkLoginDialog);
     connect(m_idle, &IdleWatch::idle, this, &FramelessWindow::logoutIfIdle);
+    connect(&Notifier::instance(), &Notifier::notificationClicked, this,
+            &FramelessWindow::onNotificationClicked);
     connect(&SessionEvents::instance(), &SessionEvents::sessionLost, this, &FramelessWindow::onSessionLost);
 }
 
@@ -136,6 +142,7 @@ void FramelessWindow::setContent(MainWindow *content) {
     connect(content->deviceWindow(), &DeviceWindow::disconnectRequested, this, &FramelessWindow::onLogOff);
     connect(content->deviceWindow(), &DeviceWindow::remoteServerChosen, this,
             &FramelessWindow::onRemoteServerChosen);
+    connect(content->deviceWindow(), &DeviceWindow::allTasksDone, this, &FramelessWindow::logoutIfIdle);
 }
 
 void FramelessWindow::setWindowTitle(const QString &title) {
@@ -239,11 +246,48 @@ void FramelessWindow::onAbout() {
 void FramelessWindow::onLogOff() {
     if (!m_loggedIn)
         return;
-    endSession(Notice::TellService);
-    checkLoginDialog();
+    confirmUnfinished([this] {
+        endSession(Notice::TellService);
+        checkLoginDialog();
+    });
+}
+
+bool FramelessWindow::hasUnfinishedWork() const {
+    return m_loggedIn && CTaskInfoPool::instance().hasRequestedTask();
+}
+
+/// Goes on at once, or when the user has agreed to leave a task behind that was requested and has not begun.
+void FramelessWindow::confirmUnfinished(std::function<void()> goOn) {
+    if (!hasUnfinishedWork())
+        return goOn();
+    if (m_unfinishedConfirm)
+        return m_unfinishedConfirm->raise();
+    m_unfinishedConfirm = new ConfirmDialog(ConfirmDialog::Kind::UnfinishedTask, this);
+    m_unfinishedConfirm->setAttribute(Qt::WA_DeleteOnClose);
+    connect(m_unfinishedConfirm, &QDialog::accepted, this, std::move(goOn));
+    m_unfinishedConfirm->open();
+}
+
+void FramelessWindow::closeEvent(QCloseEvent *event) {
+    if (m_closeConfirmed || !hasUnfinishedWork())
+        return QWidget::closeEvent(event);
+    event->ignore();
+    confirmUnfinished([this] {
+        m_closeConfirmed = true;
+        close();
+    });
+}
+
+void FramelessWindow::onNotificationClicked(int type) {
+    topWindow();
+    if (m_loggedIn && m_content)
+        m_content->sidePanel()->open(type == Notifier::Alarm ? SidePanel::Panel::Alarms
+                                                             : SidePanel::Panel::Tasks);
 }
 
 void FramelessWindow::logoutIfIdle() {
+    if (CTaskInfoPool::instance().hasRunningTask())
+        return;
     if (m_idle->wasActiveSinceLastTick() || !m_loggedIn)
         return;
     endSession(Notice::TellService);
@@ -278,6 +322,7 @@ void FramelessWindow::endSession(Notice notice) {
     if (notice == Notice::TellService)
         tellLogOff();
     CLocalStore::instance().clearLoginInfo();
+    CTaskInfoPool::instance().clear();
     m_loggedIn = false;
     m_idle->stop();
     m_titleBar->accountButton()->hide();

@@ -5,6 +5,8 @@
 #include <QPointer>
 #include <QWidget>
 
+#include <functional>
+
 class IdleWatch;
 class FramelessDialog;
 class LoginDialog;
@@ -60,6 +62,7 @@ signals:
 
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
+    void closeEvent(QCloseEvent *event) override;
     void changeEvent(QEvent *event) override;
     void mousePressEvent(QMouseEvent *event) override;
     void mouseMoveEvent(QMouseEvent *event) override;
@@ -70,10 +73,13 @@ private:
     void buildLayout();
     void connectParts();
     void probeLocalService();
+    bool hasUnfinishedWork() const;
+    void confirmUnfinished(std::function<void()> goOn);
     void endSession(Notice notice);
     void tellLogOff();
     void openAccountSetupDialog();
     void onSessionLost();
+    void onNotificationClicked(int type);
     void onRemoteServerChosen(const QString &serverId);
     void showDialog(FramelessDialog *dialog);
     Qt::Edges edgesAt(const QPoint &position) const;
@@ -82,8 +88,10 @@ private:
     QStackedWidget *m_stack;
     WelcomePage *m_welcome;
     MainWindow *m_content = nullptr;
+    QPointer<FramelessDialog> m_unfinishedConfirm;
     QPointer<FramelessDialog> m_dialog; ///< the login or account set-up dialog that is shown
     StartCheck *m_startCheck;
     IdleWatch *m_idle;
     bool m_loggedIn = false;
+    bool m_closeConfirmed = false;
 };

@@ -1,13 +1,17 @@
 #include "mainwindow.h"
 
+#include "alarmpanel.h"
+#include "badgebutton.h"
 #include "devicewindow.h"
 #include "icons.h"
+#include "sidepanel.h"
 
 #include <QButtonGroup>
 #include <QCursor>
 #include <QDebug>
 #include <QEvent>
 #include <QHBoxLayout>
+#include <QSplitter>
 #include <QStackedWidget>
 #include <QToolButton>
 #include <QToolTip>
@@ -17,6 +21,7 @@ namespace {
 constexpr int railWidth = 56;
 constexpr QSize pictureSize{20, 20};
 constexpr QSize railButtonSize{44, 44};
+constexpr int sidePanelWidth = 340;
 
 /// Made before its children: a tree of widgets that moves to another parent is styled all over again.
 QWidget *makeCentral(QMainWindow *window) {
@@ -35,8 +40,10 @@ QWidget *makeCentral(QMainWindow *window) {
 
 MainWindow::MainWindow(QWidget *parent)
     : QMainWindow(parent),
-      m_pages(new QStackedWidget(makeCentral(this))),
+      m_splitter(new QSplitter(makeCentral(this))),
+      m_pages(new QStackedWidget(m_splitter)),
       m_deviceWindow(new DeviceWindow(m_pages)),
+      m_sidePanel(new SidePanel(m_splitter)),
       m_navigation(new QButtonGroup(this)) {
     qDebug("MainWindow constructor");
     setObjectName(QStringLiteral("MainWindow"));
@@ -44,7 +51,13 @@ MainWindow::MainWindow(QWidget *parent)
     m_pages->addWidget(m_deviceWindow);
     auto *layout = static_cast<QHBoxLayout *>(centralWidget()->layout());
     layout->addWidget(buildRail());
-    layout->addWidget(m_pages, 1);
+    layout->addWidget(m_splitter, 1);
+    m_splitter->setHandleWidth(1);
+    m_splitter->setChildrenCollapsible(false);
+    m_splitter->setStretchFactor(0, 1);
+    m_splitter->setSizes({1000, sidePanelWidth});
+    m_sidePanel->hide();
+    connectPanels();
 }
 
 MainWindow::~MainWindow() {
@@ -58,16 +71,16 @@ QWidget *MainWindow::buildRail() {
     auto *layout = new QVBoxLayout(rail);
     layout->setContentsMargins(0, 8, 0, 8);
     layout->setSpacing(4);
-    QToolButton *device =
+    BadgeButton *device =
         addRailButton(rail, "deviceButton", QStringLiteral("nav_device_line"), tr("Device"));
-    QToolButton *log = addRailButton(rail, "logButton", QStringLiteral("nav_logs_line"), tr("Logs"));
-    QToolButton *settings =
+    BadgeButton *log = addRailButton(rail, "logButton", QStringLiteral("nav_logs_line"), tr("Logs"));
+    BadgeButton *settings =
         addRailButton(rail, "settingsButton", QStringLiteral("nav_settings_line"), tr("Settings"));
     layout->addStretch();
-    QToolButton *alarm = addRailButton(rail, "alarmButton", QStringLiteral("nav_alarm_line"), tr("Alarms"));
-    QToolButton *task = addRailButton(rail, "taskButton", QStringLiteral("nav_task_line"), tr("Tasks"));
-    // Their pages and panels do not exist yet.
-    for (QToolButton *button : {log, settings, alarm, task})
+    m_alarmButton = addRailButton(rail, "alarmButton", QStringLiteral("nav_alarm_line"), tr("Alarms"));
+    m_taskButton = addRailButton(rail, "taskButton", QStringLiteral("nav_task_line"), tr("Tasks"));
+    // Their pages do not exist yet.
+    for (QToolButton *button : {log, settings})
         button->setEnabled(false);
     m_navigation->setExclusive(true);
     m_navigation->addButton(device, 0);
@@ -79,9 +92,40 @@ QWidget *MainWindow::buildRail() {
     return rail;
 }
 
-QToolButton *MainWindow::addRailButton(QWidget *rail, const char *name, const QString &icon,
+void MainWindow::connectPanels() {
+    for (QToolButton *button : {m_alarmButton, m_taskButton})
+        connect(button, &QToolButton::clicked, this, [this, button] { togglePanel(button); });
+    connect(m_sidePanel, &SidePanel::changed, this, &MainWindow::showPanelButtons);
+    connect(m_sidePanel->alarmPanel(), &AlarmPanel::alarmUnreadCountUpdated, this, [this](int count) {
+        m_alarmButton->setBadge(count);
+        m_sidePanel->setUnreadCount(count);
+    });
+    connect(m_sidePanel->alarmPanel(), &AlarmPanel::deviceChosen, this,
+            [this](const QString &deviceId, const QString &ip) {
+                m_navigation->button(0)->setChecked(true);
+                m_deviceWindow->selectDevice(deviceId, ip);
+            });
+}
+
+/// A button opens its panel, and closes it when it is the one that is open.
+void MainWindow::togglePanel(QToolButton *button) {
+    const auto panel = button == m_alarmButton ? SidePanel::Panel::Alarms : SidePanel::Panel::Tasks;
+    if (m_sidePanel->isVisible() && m_sidePanel->current() == panel)
+        m_sidePanel->hide();
+    else
+        m_sidePanel->open(panel);
+    showPanelButtons();
+}
+
+void MainWindow::showPanelButtons() {
+    const bool open = !m_sidePanel->isHidden();
+    m_alarmButton->setChecked(open && m_sidePanel->current() == SidePanel::Panel::Alarms);
+    m_taskButton->setChecked(open && m_sidePanel->current() == SidePanel::Panel::Tasks);
+}
+
+BadgeButton *MainWindow::addRailButton(QWidget *rail, const char *name, const QString &icon,
                                        const QString &text) {
-    auto *button = new QToolButton(rail);
+    auto *button = new BadgeButton(rail);
     button->setObjectName(QLatin1String(name));
     button->setAccessibleName(text);
     button->setIcon(Icons::icon(QStringLiteral(":/images/%1.svg").arg(icon), pictureSize));

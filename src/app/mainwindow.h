@@ -4,8 +4,11 @@
 
 class DeviceWindow;
 class QButtonGroup;
+class BadgeButton;
+class QSplitter;
 class QStackedWidget;
 class QToolButton;
+class SidePanel;
 
 /// The frame's content: the pages, and the rail of buttons that lead to them.
 class MainWindow : public QMainWindow {
@@ -16,15 +19,23 @@ public:
     ~MainWindow() override;
 
     DeviceWindow *deviceWindow() const { return m_deviceWindow; }
+    SidePanel *sidePanel() const { return m_sidePanel; }
 
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
     QWidget *buildRail();
-    QToolButton *addRailButton(QWidget *rail, const char *name, const QString &icon, const QString &text);
+    BadgeButton *addRailButton(QWidget *rail, const char *name, const QString &icon, const QString &text);
+    void connectPanels();
+    void togglePanel(QToolButton *button);
+    void showPanelButtons();
 
+    QSplitter *m_splitter;
     QStackedWidget *m_pages;
     DeviceWindow *m_deviceWindow;
+    SidePanel *m_sidePanel;
     QButtonGroup *m_navigation;
+    BadgeButton *m_alarmButton = nullptr;
+    BadgeButton *m_taskButton = nullptr;
 };

@@ -5,6 +5,7 @@
 #include "mainwindow.h"
 #include "messagelog.h"
 #include "nettask.h"
+#include "pluraltranslator.h"
 #include "processsetup.h"
 #include "requestdeadline.h"
 #include "singleinstance.h"
@@ -74,6 +75,8 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         QGuiApplication::setApplicationDisplayName(QCoreApplication::applicationName());
         QApplication::setWindowIcon(applicationIcon());
         Theme::installFonts();
+        PluralTranslator plurals;
+        QCoreApplication::installTranslator(&plurals);
         application.setStyleSheet(Theme::styleSheet());
         status = runWindows(application, shown);
         RequestDeadline::cutAll();

@@ -50,7 +50,7 @@ DeviceFooter::DeviceFooter(QWidget *parent)
 
 void DeviceFooter::setSelection(int selected, int shown) {
     const QLocale locale;
-    m_selection->setText(tr("%1 of %n devices selected", nullptr, shown).arg(locale.toString(selected)));
+    m_selection->setText(tr("%1 of %n device(s) selected", nullptr, shown).arg(locale.toString(selected)));
 }
 
 void DeviceFooter::setStatuses(const DeviceInventory &inventory, const std::vector<int> &shown) {

@@ -2,6 +2,7 @@
 
 #include "messagelog.h"
 #include "servicerequest.h"
+#include "taskinfopool.h"
 
 #include <QDebug>
 
@@ -39,10 +40,14 @@ void DeviceMonitor::stop() {
 
 void DeviceMonitor::monitorLoop() {
     const MonitorBeat::Due due = m_beat.tick();
-    if (due.poll)
+    if (due.poll) {
         poll();
+        CTaskInfoPool::instance().loadTaskStatuses();
+        CTaskInfoPool::instance().loadAlarmInfo();
+    }
     if (due.check)
         checkConnection();
+    emit ticked();
 }
 
 void DeviceMonitor::poll() {

@@ -28,8 +28,9 @@ private:
     bool m_force = false;
 };
 
-/// Follows the devices of the present session: polls their states once in three seconds and looks every six
-/// whether the server answers. User-interface thread; requests run on a runner of its own.
+/// Follows the devices of the present session: polls their states, and the service's tasks and alarms, once
+/// in three seconds and looks every six whether the server answers. User-interface thread; requests run on a
+/// runner of its own.
 class DeviceMonitor : public QObject {
     Q_OBJECT
 
@@ -49,6 +50,8 @@ public slots:
     void monitorLoop();
 
 signals:
+    /// At the end of every tick.
+    void ticked();
     /// A poll has succeeded.
     void updateStatus(const DeviceStatusUpdate &update);
     /// The server answered a check.

@@ -18,6 +18,8 @@ constexpr int narrowestButton = 54;
 constexpr int buttonPadding = 6;
 constexpr int buttonHeight = 58;
 constexpr int textHeight = 28;
+constexpr int buttonGap = 1;
+constexpr int groupGap = 8;
 
 /// A button whose text stands under the icon in up to two lines, with a small arrow when it has a menu.
 class OperationButton : public QToolButton {
@@ -91,6 +93,17 @@ constexpr Operation operations[] = {
     {"deleteButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Delete Device"), "tool_delete_line"},
 };
 
+/// Stands for a button that does not fit, in the menu of those.
+void addSubstitute(QMenu *menu, QToolButton *button) {
+    if (button->menu()) {
+        menu->addMenu(button->menu())->setText(button->text());
+    } else {
+        QAction *entry = menu->addAction(button->icon(), button->text());
+        QObject::connect(entry, &QAction::triggered, button, &QToolButton::click);
+    }
+    menu->actions().constLast()->setEnabled(button->isEnabled());
+}
+
 void addEntries(QMenu *menu, std::initializer_list<QString> entries) {
     for (const QString &entry : entries)
         menu->addAction(entry)->setEnabled(false);
@@ -102,10 +115,10 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
     setObjectName(QStringLiteral("deviceToolBar"));
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 6);
-    layout->setSpacing(1);
+    layout->setSpacing(buttonGap);
     for (const Operation &operation : operations) {
         if (operation.groupBegins)
-            layout->addSpacing(8);
+            layout->addSpacing(groupGap);
         auto *button = new OperationButton(this);
         button->setObjectName(QLatin1String(operation.name));
         button->setText(QCoreApplication::translate("DeviceToolBar", operation.text));
@@ -116,7 +129,9 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
         button->setFocusPolicy(Qt::TabFocus);
         button->setEnabled(false);
         layout->addWidget(button);
+        m_buttons.push_back(button);
     }
+    buildMoreButton();
     layout->addStretch();
 
     auto *exportMenu = new PopupMenu(this);
@@ -135,6 +150,53 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
     auto *restoreMenu = new PopupMenu(this);
     addEntries(restoreMenu, {tr("Restore to Restore Point"), tr("Restore to Factory Default")});
     button(QStringLiteral("restoreButton"))->setMenu(restoreMenu);
+}
+
+void DeviceToolBar::buildMoreButton() {
+    m_more = new OperationButton(this);
+    m_more->setObjectName(QStringLiteral("moreButton"));
+    m_more->setText(tr("More"));
+    m_more->setAccessibleName(m_more->text());
+    m_more->setIcon(Icons::icon(QStringLiteral(":/images/icon_general_more_line.svg"), pictureSize));
+    m_more->setPopupMode(QToolButton::InstantPopup);
+    m_more->setFocusPolicy(Qt::TabFocus);
+    m_more->hide();
+    auto *menu = new PopupMenu(this);
+    connect(menu, &QMenu::aboutToShow, this, [this, menu] {
+        menu->clear();
+        for (QToolButton *button : m_buttons) {
+            if (button->isHidden())
+                addSubstitute(menu, button);
+        }
+    });
+    m_more->setMenu(menu);
+    layout()->addWidget(m_more);
+}
+
+QSize DeviceToolBar::minimumSizeHint() const {
+    return {m_more->sizeHint().width() * 3, QFrame::minimumSizeHint().height()};
+}
+
+void DeviceToolBar::resizeEvent(QResizeEvent *event) {
+    QFrame::resizeEvent(event);
+    fitButtons();
+}
+
+/// Shows as many buttons as there is room for; the others move to the menu at the end.
+void DeviceToolBar::fitButtons() {
+    const auto widthOf = [this](std::size_t i) {
+        return m_buttons[i]->sizeHint().width() + buttonGap + (operations[i].groupBegins ? groupGap : 0);
+    };
+    int all = 0;
+    for (std::size_t i = 0; i < m_buttons.size(); ++i)
+        all += widthOf(i);
+    const bool overflow = all > width();
+    int room = overflow ? width() - m_more->sizeHint().width() : width();
+    for (std::size_t i = 0; i < m_buttons.size(); ++i) {
+        room -= widthOf(i);
+        m_buttons[i]->setVisible(room >= 0);
+    }
+    m_more->setVisible(overflow);
 }
 
 QToolButton *DeviceToolBar::button(const QString &objectName) const {

@@ -2,11 +2,14 @@
 
 #include <QFrame>
 
+#include <vector>
+
 class QToolButton;
 
 /// The tool bar of the console: one button an operation, four of them with a menu.
 ///
-/// Operations are found by object name. A button is enabled by whoever carries its operation out.
+/// Buttons that do not fit stand in a menu at its end. Operations are found by object name. A button is
+/// enabled by whoever carries its operation out.
 class DeviceToolBar : public QFrame {
     Q_OBJECT
 
@@ -14,4 +17,16 @@ public:
     explicit DeviceToolBar(QWidget *parent = nullptr);
 
     QToolButton *button(const QString &objectName) const;
+
+    QSize minimumSizeHint() const override;
+
+protected:
+    void resizeEvent(QResizeEvent *event) override;
+
+private:
+    void buildMoreButton();
+    void fitButtons();
+
+    std::vector<QToolButton *> m_buttons;
+    QToolButton *m_more = nullptr;
 };

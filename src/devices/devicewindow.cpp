@@ -1,7 +1,9 @@
 #include "devicewindow.h"
 
 #include "clientstore.h"
+#include "confirmdialog.h"
 #include "countedtabwidget.h"
+#include "deviceactions.h"
 #include "devicefooter.h"
 #include "devicelog.h"
 #include "devicemonitor.h"
@@ -13,6 +15,7 @@
 #include "refreshdevicedialog.h"
 #include "servicerequest.h"
 #include "sitetree.h"
+#include "taskinfopool.h"
 #include "transientmessage.h"
 
 #include <QComboBox>
@@ -40,6 +43,8 @@ constexpr auto selectionLogDelay = 200ms;
 /// Polls tell of devices that come and go; what else others change shows with a reading once a minute.
 constexpr int answersBetweenReadings = 10;
 constexpr int siteTreeWidth = 248;
+/// While tasks run, readings take one part in so many of the time at most.
+constexpr int readingShare = 4;
 
 } // namespace
 
@@ -51,6 +56,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_splitter(new QSplitter(this)),
       m_console(new QWidget(m_splitter)),
       m_siteTree(new SiteTree(m_splitter)),
+      m_actions(new DeviceActions(this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_remoteCombo(new QComboBox(m_console)),
       m_tabs(new CountedTabWidget(m_console)),
@@ -138,6 +144,10 @@ void DeviceWindow::connectParts() {
     connect(m_monitor.get(), &DeviceMonitor::updateStatus, this, &DeviceWindow::onUpdateDeviceStatus);
     connect(m_monitor.get(), &DeviceMonitor::serverAnswered, this, &DeviceWindow::onServerAnswered);
     connect(m_monitor.get(), &DeviceMonitor::serverLost, this, &DeviceWindow::onServerLost);
+    connect(m_monitor.get(), &DeviceMonitor::ticked, this, &DeviceWindow::onTick);
+    connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this,
+            &DeviceWindow::onTaskListUpdated);
+    connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
     connect(m_tabs, &CountedTabWidget::currentChanged, this, [this] {
         showStatusCounts();
@@ -155,6 +165,8 @@ void DeviceWindow::connectParts() {
     });
     QToolButton *refresh = m_toolBar->button(QStringLiteral("refreshButton"));
     connect(refresh, &QToolButton::clicked, this, &DeviceWindow::openRefreshDialog);
+    connect(m_toolBar->button(QStringLiteral("restartButton")), &QToolButton::clicked, this,
+            &DeviceWindow::on_restartButton_clicked);
 }
 
 void DeviceWindow::startWork() {
@@ -210,10 +222,12 @@ void DeviceWindow::reload() {
     };
     m_reloadWanted = false;
     m_answersSinceReading = 0;
+    m_sinceReading.start();
     m_reloading = ServiceRequest::post(
         m_netTask.get(), this, read, [this](const InventoryReader::Reading &reading) { onReading(reading); },
         [this](JobEnd end) {
             m_reloading = false;
+            m_readingMs = m_sinceReading.restart();
             if (end != JobEnd::Delivered && end != JobEnd::SessionGone) {
                 m_lastReadFailed = true;
                 showContent();
@@ -223,6 +237,37 @@ void DeviceWindow::reload() {
         });
     // The runner may still be busy with the last answer of a session that has ended.
     m_reloadWanted = !m_reloading;
+}
+
+/// A task that has moved has changed devices, mostly. How soon they are read again depends on what that
+/// costs.
+void DeviceWindow::onTick() {
+    CTaskInfoPool &pool = CTaskInfoPool::instance();
+    if (m_reloading || m_reloadWanted || !pool.isTasksChanged() ||
+        m_sinceReading.elapsed() < m_readingMs * (readingShare - 1))
+        return;
+    reload();
+    pool.clearTasksChanged();
+}
+
+void DeviceWindow::onTaskListUpdated() {
+    const bool running = CTaskInfoPool::instance().hasRunningTask();
+    if (std::exchange(m_tasksRunning, running) && !running)
+        emit allTasksDone();
+}
+
+void DeviceWindow::on_restartButton_clicked() {
+    QStringList ids;
+    for (const DeviceRecordPtr &device : m_selected)
+        ids += device->id;
+    auto *confirm =
+        new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this, static_cast<int>(ids.size()));
+    confirm->setAttribute(Qt::WA_DeleteOnClose);
+    connect(confirm, &QDialog::accepted, this, [this, ids] {
+        qDebug("on_restartButton_clicked accepted");
+        m_actions->restart(ids);
+    });
+    confirm->open();
 }
 
 void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
@@ -334,6 +379,23 @@ void DeviceWindow::onSiteChanged(const QString &siteId) {
     onSelectionChanged();
 }
 
+void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
+    const DeviceSnapshot &devices = *m_inventory.snapshot();
+    int place = devices.indexOf(id);
+    for (int each = 0; place < 0 && each < devices.size(); ++each) {
+        if (!ip.isEmpty() && devices.at(each)->text(DeviceColumn::Ip) == ip)
+            place = each;
+    }
+    if (place < 0)
+        return showDefAnimateMsgDlg(tr("The device is not managed any more."));
+    const int tab = static_cast<int>(devices.at(place)->deviceClass);
+    m_tabs->setCurrentIndex(tab);
+    if (!currentTab()->table()->selectDevice(place)) {
+        m_siteTree->select(Sites::overviewId);
+        currentTab()->table()->selectDevice(place);
+    }
+}
+
 void DeviceWindow::onSelectionChanged() {
     const MainConsoleTable *table = currentTab()->table();
     m_selected.clear();
@@ -341,6 +403,7 @@ void DeviceWindow::onSelectionChanged() {
         m_selected.push_back(m_inventory.snapshot()->at(device));
     qDebug("device selected: %d", static_cast<int>(m_selected.size()));
     m_selectionLogDelay->start();
+    m_toolBar->button(QStringLiteral("restartButton"))->setEnabled(!m_selected.empty());
     m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount());
 }
 

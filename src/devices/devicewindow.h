@@ -4,12 +4,14 @@
 #include "inventoryreader.h"
 #include "nettask.h"
 
+#include <QElapsedTimer>
 #include <QPointer>
 #include <QWidget>
 
 #include <memory>
 
 class CountedTabWidget;
+class DeviceActions;
 class DeviceFooter;
 class DeviceMonitor;
 class DeviceTab;
@@ -42,10 +44,14 @@ public:
 public slots:
     /// Reads sites and devices again.
     void reload();
+    /// Selects the device with the id, or else the one with the address, and brings it into view.
+    void selectDevice(const QString &id, const QString &ip);
     /// Shows a transient message.
     void showDefAnimateMsgDlg(const QString &message);
 
 signals:
+    /// No task is at work any more.
+    void allTasksDone();
     void onShowAnimatedMsgDlg(const QString &message);
     /// The user gives the lost server up.
     void disconnectRequested();
@@ -57,6 +63,10 @@ private:
     QWidget *buildNoticeBar();
     void buildTabs();
     void connectParts();
+
+    void onTick();
+    void onTaskListUpdated();
+    void on_restartButton_clicked();
 
     void onReading(const InventoryReader::Reading &reading);
     void onUpdateDeviceStatus(const DeviceStatusUpdate &update);
@@ -83,6 +93,7 @@ private:
     QSplitter *m_splitter;
     QWidget *m_console; ///< right of the tree
     SiteTree *m_siteTree;
+    DeviceActions *m_actions;
     DeviceToolBar *m_toolBar;
     QFrame *m_noticeBar = nullptr;
     QComboBox *m_remoteCombo;
@@ -94,7 +105,10 @@ private:
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
     std::vector<DeviceRecordPtr> m_selected;
+    QElapsedTimer m_sinceReading; ///< since the last reading began, then since it ended
+    qint64 m_readingMs = 0;       ///< how long it took
     int m_answersSinceReading = 0;
+    bool m_tasksRunning = false;
     bool m_online = false;
     bool m_reloading = false;
     bool m_reloadWanted = false;

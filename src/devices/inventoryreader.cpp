@@ -1,5 +1,6 @@
 #include "inventoryreader.h"
 
+#include "pagereader.h"
 #include "servicesession.h"
 
 #include <QDebug>
@@ -11,32 +12,9 @@ namespace InventoryReader {
 namespace {
 
 constexpr int pageSize = 500;
-/// A service whose pages never end is not followed for ever.
-constexpr int pageLimit = 400;
-
-using ListCall = unsigned (CApiClient::*)(int, int, JSON &);
-
-/// Hands every page to the taker until one is short. Returns the first result that is not ApiOk.
-unsigned readPages(ServiceSession &session, ListCall list, const std::function<void(JSON &)> &take) {
-    for (int page = 0; page < pageLimit; ++page) {
-        JSON records;
-        const unsigned result = session.call(
-            [&](CApiClient &client) { return (client.*list)(page * pageSize, pageSize, records); });
-        if (result != ApiOk)
-            return result;
-        if (!records.is_array())
-            return ApiMissingData;
-        const std::size_t count = records.size();
-        take(records);
-        if (count < pageSize)
-            break;
-    }
-    return ApiOk;
-}
-
 std::optional<Sites::List> readSites(ServiceSession &session) {
     JSON all = JSON::array();
-    const unsigned result = readPages(session, &CApiClient::listSites, [&](JSON &page) {
+    const unsigned result = PageReader::readAll(session, &CApiClient::listSites, pageSize, [&](JSON &page) {
         for (JSON &site : page)
             all.push_back(std::move(site));
     });
@@ -71,7 +49,7 @@ bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
 DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous) {
     std::vector<DeviceRecordPtr> records;
     int unreadable = 0;
-    const unsigned result = readPages(session, &CApiClient::listDevices, [&](JSON &page) {
+    const unsigned result = PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
         for (const JSON &value : page) {
             if (DeviceRecordPtr record = recordOf(value, *previous))
                 records.push_back(std::move(record));
@@ -99,20 +77,21 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
     const auto size = static_cast<std::size_t>(snapshot.size());
     StatusReading reading{std::vector<DeviceStatusCode>(size, DeviceStatusCode::Unauthorized)};
     std::vector<bool> seen(size, false);
-    const unsigned result = readPages(session, &CApiClient::listDeviceStatus, [&](JSON &page) {
-        for (const JSON &record : page) {
-            const int index = snapshot.indexOf(std::string(textMember(record, "id")));
-            if (index < 0) {
-                reading.devicesDiffer = true;
-                continue;
+    const unsigned result =
+        PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](JSON &page) {
+            for (const JSON &record : page) {
+                const int index = snapshot.indexOf(std::string(textMember(record, "id")));
+                if (index < 0) {
+                    reading.devicesDiffer = true;
+                    continue;
+                }
+                const auto place = static_cast<std::size_t>(index);
+                seen[place] = true;
+                reading.codes[place] = DeviceStatus::codeOf(textMember(record, "connect_status"),
+                                                            textMember(record, "auth_status"),
+                                                            textMember(record, "action_status"));
             }
-            const auto place = static_cast<std::size_t>(index);
-            seen[place] = true;
-            reading.codes[place] =
-                DeviceStatus::codeOf(textMember(record, "connect_status"), textMember(record, "auth_status"),
-                                     textMember(record, "action_status"));
-        }
-    });
+        });
     if (result != ApiOk) {
         qDebug("HTTP API(listDeviceStatus) failed! (%d)", static_cast<int>(result));
         return std::nullopt;

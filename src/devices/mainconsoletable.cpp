@@ -298,6 +298,16 @@ QVariant MainConsoleTable::cellData(int row, int column, int role) const {
     }
 }
 
+bool MainConsoleTable::selectDevice(int place) {
+    const auto found = std::find(m_order.begin(), m_order.end(), place);
+    if (found == m_order.end())
+        return false;
+    const QModelIndex index = model()->index(static_cast<int>(found - m_order.begin()), 0);
+    selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
+    scrollTo(index, QAbstractItemView::PositionAtCenter);
+    return true;
+}
+
 std::vector<int> MainConsoleTable::selectedDevices() const {
     std::vector<int> rows;
     for (const QItemSelectionRange &range : selectionModel()->selection()) {

@@ -36,6 +36,9 @@ public:
     /// The devices of the selected rows, as places in the inventory, in the order of the rows.
     std::vector<int> selectedDevices() const;
 
+    /// Selects a device alone and brings it into view. False when the table does not show it.
+    bool selectDevice(int place);
+
     /// What an item of the table answers.
     QVariant cellData(int row, int column, int role) const;
 

@@ -27,6 +27,9 @@ public:
     QString currentSite() const;
     QString currentSiteName() const;
 
+    /// Selects a site, or the overview where there is no such site.
+    void select(const QString &siteId);
+
 signals:
     void currentSiteChanged(const QString &siteId);
 
@@ -34,7 +37,6 @@ private:
     void build();
     void addCaption(const QString &text);
     QTreeWidgetItem *addOverview();
-    void select(const QString &siteId);
 
     Sites::List m_sites;
     bool m_built = false;

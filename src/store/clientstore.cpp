@@ -14,6 +14,7 @@ const QString kIsThisComputer = QStringLiteral("kIsThisComputer");
 const QString kIsLoginRememberMe = QStringLiteral("kIsLoginRememberMe");
 const QString kThisComputerAccountInfo = QStringLiteral("kThisComputerAccountInfo");
 const QString kRemoteComputerAccountInfo = QStringLiteral("kRemoteComputerAccountInfo");
+const QString kAlarmReadHistory = QStringLiteral("kAlarmReadHistory");
 
 constexpr const char *serverColumns =
     "id TEXT PRIMARY KEY, svrname TEXT, info TEXT, acc TEXT, pass TEXT, remember TEXT";
@@ -86,6 +87,14 @@ bool CClientStore::setAccount(const QString &key, const AccountInfo &account) {
                          {"email", account.email.toStdString()},
                          {"pass", Ciphers::sealSecret(account.password.toStdString()).value_or("")}};
     return m_store.replace(key, QString::fromStdString(dumpJson(object)));
+}
+
+QString CClientStore::alarmReadHistory() const {
+    return m_store.query(kAlarmReadHistory);
+}
+
+bool CClientStore::setAlarmReadHistory(const QString &json) {
+    return m_store.replace(kAlarmReadHistory, json);
 }
 
 unsigned CClientStore::loadServerList(JSON &servers) const {

@@ -30,6 +30,10 @@ public:
     AccountInfo remoteComputerAccount() const;
     bool setRemoteComputerAccount(const AccountInfo &account);
 
+    /// JSON text of the alarms that were read; empty where none is stored.
+    QString alarmReadHistory() const;
+    bool setAlarmReadHistory(const QString &json);
+
     /// Reads the saved servers: an array of objects with "id", "svrname", "info", "acc", "pass" (plain) and
     /// "remember". Returns 0, or serverListUnreadable with an empty array.
     unsigned loadServerList(JSON &servers) const;

@@ -10,26 +10,57 @@ struct Wording {
     QString accept;
 };
 
-Wording wordingOf(ConfirmDialog::Kind kind) {
+Wording wordingOf(ConfirmDialog::Kind kind, int count) {
     switch (kind) {
     case ConfirmDialog::Kind::SwitchServer:
         return {ConfirmDialog::tr("Remote Connection"),
                 ConfirmDialog::tr(
                     "Are you sure you want to connect to another server? The present session ends."),
                 ConfirmDialog::tr("Connect")};
+    case ConfirmDialog::Kind::UnfinishedTask:
+        return {ConfirmDialog::tr("Unfinished Task"),
+                ConfirmDialog::tr("A task was requested and has not begun yet. It may fail when the session "
+                                  "ends now. Are you sure you want to go on?"),
+                ConfirmDialog::tr("End session")};
+    case ConfirmDialog::Kind::CancelTask:
+        return {ConfirmDialog::tr("Cancel Task"),
+                ConfirmDialog::tr("Are you sure you want to cancel %n task(s)? Devices that are done already "
+                                  "stay as they are.",
+                                  nullptr, count),
+                ConfirmDialog::tr("Cancel task")};
+    case ConfirmDialog::Kind::RemoveTasks:
+        return {ConfirmDialog::tr("Remove Finished Tasks"),
+                ConfirmDialog::tr("Are you sure you want to remove %n finished task(s) from the list, with "
+                                  "their results? This action cannot be undone.",
+                                  nullptr, count),
+                ConfirmDialog::tr("Remove")};
+    case ConfirmDialog::Kind::DeleteAlarms:
+        return {
+            ConfirmDialog::tr("Delete Alarms"),
+            ConfirmDialog::tr("Are you sure you want to delete %n alarm(s)? This action cannot be undone.",
+                              nullptr, count),
+            ConfirmDialog::tr("Delete")};
+    case ConfirmDialog::Kind::RestartDevices:
+        return {
+            ConfirmDialog::tr("Restart Device"),
+            ConfirmDialog::tr("Are you sure you want to restart device? This operation may take some time."),
+            ConfirmDialog::tr("Restart")};
     }
     return {};
 }
 
 } // namespace
 
-ConfirmDialog::ConfirmDialog(Kind kind, QWidget *parent)
+ConfirmDialog::ConfirmDialog(Kind kind, QWidget *parent, int count)
     : FramelessDialog(parent), m_ui(formIn<Ui::ConfirmDialog>(content())) {
     setObjectName(QStringLiteral("ConfirmDialog"));
-    const Wording wording = wordingOf(kind);
+    const Wording wording = wordingOf(kind, count);
     setWindowTitle(wording.title);
     m_ui->messageLabel->setText(wording.text);
     m_ui->acceptButton->setText(wording.accept);
+    // Beside a button that cancels something else, "Cancel" would say the opposite of what it does.
+    if (kind == Kind::CancelTask)
+        m_ui->cancelButton->setText(tr("Keep running"));
     connect(m_ui->acceptButton, &QPushButton::clicked, this, &QDialog::accept);
     connect(m_ui->cancelButton, &QPushButton::clicked, this, &QDialog::reject);
 }

@@ -14,10 +14,15 @@ class ConfirmDialog : public FramelessDialog {
 
 public:
     enum class Kind {
-        SwitchServer ///< ends the present session for one with another server
+        SwitchServer,   ///< ends the present session for one with another server
+        UnfinishedTask, ///< ends the session while a task is still being requested
+        CancelTask,     ///< ends tasks, as many as the count says
+        RemoveTasks,    ///< takes as many finished tasks off the list
+        DeleteAlarms,   ///< as many as the count says
+        RestartDevices  ///< as many as the count says
     };
 
-    explicit ConfirmDialog(Kind kind, QWidget *parent = nullptr);
+    explicit ConfirmDialog(Kind kind, QWidget *parent = nullptr, int count = 1);
     ~ConfirmDialog() override;
 
 private:

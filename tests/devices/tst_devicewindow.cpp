@@ -71,7 +71,7 @@ private slots:
         QTest::mouseClick(table("cameraTable")->viewport(), Qt::LeftButton, {}, QPoint(30, 18));
         QCOMPARE(m_window->selectedDevices().size(), std::size_t(1));
         QCOMPARE(m_window->findChild<QLabel *>("selectionLabel")->text(),
-                 QStringLiteral("1 of %1 devices selected").arg(cameras));
+                 QStringLiteral("1 of %1 device(s) selected").arg(cameras));
         QTest::keyClick(table("cameraTable"), Qt::Key_A, Qt::ControlModifier);
         QCOMPARE(m_window->selectedDevices().size(), std::size_t(cameras));
         tabs->setCurrentIndex(1);

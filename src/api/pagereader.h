@@ -1,0 +1,19 @@
+#pragma once
+
+#include "apiclient.h"
+
+#include <functional>
+
+class ServiceSession;
+
+namespace PageReader {
+
+/// A method of the client that lists a page: first record, number of records, the page.
+using ListCall = unsigned (CApiClient::*)(int, int, JSON &);
+
+/// Reads a list of the service page by page, and hands every page to the taker, until one is short. Returns
+/// the first result that is not ApiOk; ApiMissingData for a page that is no array. For a runner's thread.
+unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
+                 const std::function<void(JSON &page)> &take);
+
+} // namespace PageReader

@@ -1,0 +1,32 @@
+#pragma once
+
+#include <QHash>
+#include <QStringList>
+
+#include <functional>
+
+class TaskList;
+
+/// What this client knows of the tasks that it has started: how to do the same for other devices. For tasks
+/// of other clients, and of earlier runs, it knows nothing. User-interface thread.
+class TaskRepeats {
+public:
+    struct Repeat {
+        /// Does it again, for the devices with these ids.
+        std::function<void(const QStringList &deviceIds)> again;
+        /// It had a password or a key, which is not kept: again opens the dialog that asks for it.
+        bool needsDialog = false;
+    };
+
+    static TaskRepeats &instance();
+
+    void remember(const QString &tid, Repeat repeat);
+    /// Null for a task whose parameters are not known here.
+    const Repeat *find(const QString &tid) const;
+    /// Forgets the tasks that the service has no more.
+    void keepOnly(const TaskList &tasks);
+    void clear() { m_repeats.clear(); }
+
+private:
+    QHash<QString, Repeat> m_repeats;
+};

@@ -1,0 +1,302 @@
+#include "alarmpanel.h"
+#include "confirmdialog.h"
+#include "fakelists.h"
+#include "isolatedroot.h"
+#include "logcapture.h"
+#include "notifier.h"
+#include "taskinfopool.h"
+#include "taskpanel.h"
+#include "taskrepeats.h"
+#include "toast.h"
+
+#include <QClipboard>
+#include <QGuiApplication>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListView>
+#include <QPushButton>
+#include <QScrollBar>
+#include <QSignalSpy>
+#include <QTest>
+#include <QToolButton>
+#include <QTreeView>
+
+using nlohmann::json;
+
+namespace {
+
+json device(int n, const char *state) {
+    const std::string number = std::to_string(n);
+    return {{"id", "DV" + number},     {"d_ip", "10.0.0." + number},
+            {"d_mac", "MAC" + number}, {"d_model", "NC-1"},
+            {"state", state},          {"progress", 100}};
+}
+
+json task(const std::string &tid, const char *state, json devices, bool active = false) {
+    return {{"tid", tid},
+            {"type", "deviceFWUpgrade"},
+            {"user", "admin"},
+            {"status", state},
+            {"state", state},
+            {"progress", 50},
+            {"active", active},
+            {"created_at", 1700000000000},
+            {"devices", std::move(devices)}};
+}
+
+json alarm(int n, const char *about, int description = 2) {
+    return {{"alid", "a" + std::to_string(n)},
+            {"despid", description},
+            {"actinfo", about},
+            {"initm", std::to_string(1000 + n)},
+            {"deviceid", std::string("DV") + about},
+            {"d_ip", "10.0.0.1"}};
+}
+
+json page(const std::vector<json> &items) {
+    return {{"items", items}, {"total_items", items.size()}};
+}
+
+/// A desktop that notes what it is shown, and can click on it.
+class NotedToasts : public ToastPresenter {
+public:
+    bool initialize(const QString &, const QString &) override { return true; }
+    void showToast(const Toast &toast, std::unique_ptr<ToastHandler> handler) override {
+        texts += toast.text;
+        last = std::move(handler);
+    }
+    QStringList texts;
+    std::unique_ptr<ToastHandler> last;
+};
+
+} // namespace
+
+/// The two panels as a user meets them, on lists of a service that is not there otherwise.
+class TestPanels : public QObject {
+    Q_OBJECT
+
+private slots:
+    void init() {
+        m_log = std::make_unique<LogCapture>();
+        m_service = std::make_unique<FakeLists>();
+        auto toasts = std::make_unique<NotedToasts>();
+        m_toasts = toasts.get();
+        Notifier::instance().setPresenter(std::move(toasts));
+    }
+    void cleanup() {
+        m_tasks.reset();
+        m_alarms.reset();
+        QVERIFY(NetTask::waitForAll(10000));
+        m_service.reset();
+        m_pool.clear();
+        m_log.reset();
+    }
+
+    void refreshesKeepSelectionOpenRowsAndPlace() {
+        std::vector<json> list;
+        for (int i = 0; i < 60; ++i)
+            list.push_back(
+                task("t" + std::to_string(i), "pTaskDone", {device(1, "pTaskDone"), device(2, "pTaskDone")}));
+        showTasks(list);
+        auto *tree = m_tasks->findChild<QTreeView *>("taskTree");
+        const QPersistentModelIndex opened = tree->model()->index(10, 0);
+        tree->expand(opened);
+        QTest::mouseClick(tree->viewport(), Qt::LeftButton, {},
+                          tree->visualRect(tree->model()->index(1, 0)).center());
+        tree->scrollTo(opened, QAbstractItemView::PositionAtTop);
+        const QPersistentModelIndex selected = tree->currentIndex();
+        const int place = tree->visualRect(opened).top();
+
+        list.insert(list.begin(), task("new", "pTaskProcessing", {device(3, "pTaskProcessing")}, true));
+        list.erase(list.begin() + 3);
+        m_service->setTasks(list);
+        loadTasks();
+        QCOMPARE(tree->model()->rowCount(), 60);
+        QVERIFY(tree->isExpanded(opened));
+        QCOMPARE(tree->visualRect(opened).top(), place);
+        QVERIFY(tree->selectionModel()->isSelected(selected));
+        QCOMPARE(selected.row(), 2);
+    }
+
+    void failedDevicesAreRetriedByWhoeverKnowsHow() {
+        showTasks({task("mine", "pTaskFailed", {device(1, "pTaskDone"), device(2, "pTaskBrokenFile_01")}),
+                   task("theirs", "pTaskFailed", {device(3, "pTaskFailed")})});
+        QStringList repeated;
+        TaskRepeats::instance().remember("mine", {[&](const QStringList &ids) { repeated = ids; }});
+        auto *retry = m_tasks->findChild<QToolButton *>("retryTaskButton");
+        select(1);
+        QVERIFY(!retry->isEnabled());
+        QVERIFY(m_tasks->findChild<QLabel *>("taskHintLabel")->text().contains("started elsewhere"));
+        select(0);
+        QTest::mouseClick(retry, Qt::LeftButton);
+        QCOMPARE(repeated, QStringList{"DV2"});
+    }
+
+    void runningTaskIsCancelledAfterAQuestion() {
+        showTasks({task("run", "pTaskProcessing", {device(1, "pTaskProcessing")}, true)});
+        QVERIFY(!button("cancelTaskButton")->isEnabled());
+        select(0);
+        QVERIFY(!button("removeTaskButton")->isEnabled());
+        QTest::mouseClick(button("cancelTaskButton"), Qt::LeftButton);
+        answerQuestion("cancelButton");
+        QTest::mouseClick(button("cancelTaskButton"), Qt::LeftButton);
+        answerQuestion("acceptButton");
+        QTRY_VERIFY(!m_service->sentTo("/v1/task/updateState").empty());
+        const auto sent = m_service->sentTo("/v1/task/updateState");
+        QCOMPARE(sent.size(), 1u);
+        QVERIFY(sent[0]["task_id"] == "run");
+        QVERIFY(sent[0]["task_state"] == "pTaskAborted");
+        QTRY_VERIFY(button("cancelTaskButton")->isEnabled());
+    }
+
+    void finishedTasksAreRemovedEvenWhenOneIsGone() {
+        showTasks({task("a", "pTaskDone", json::array()), task("run", "pTaskProcessing", json::array(), true),
+                   task("b", "pTaskFailed", json::array())});
+        m_service->setTasks(
+            {task("run", "pTaskProcessing", json::array(), true), task("b", "pTaskFailed", json::array())});
+        m_service->refuse("/v1/task/rm", 4);
+        QTest::mouseClick(button("removeFinishedButton"), Qt::LeftButton);
+        answerQuestion("acceptButton");
+        QTRY_VERIFY(m_tasks->findChild<QTreeView *>("taskTree")->model()->rowCount() == 2);
+        QTRY_VERIFY(button("removeFinishedButton")->isEnabled());
+        const auto sent = m_service->sentTo("/v1/task/rm");
+        QCOMPARE(sent.size(), 2u);
+        QVERIFY(sent[0]["tids"] == (json{"a", "b"}));
+        QVERIFY(sent[1]["tids"] == json::array({"b"}));
+    }
+
+    void copiedTaskNamesItsFailedDevicesFirst() {
+        showTasks(
+            {task("t", "pTaskFailed", {device(1, "pTaskDone"), device(2, "pTaskFailedToConnectToDevice")})});
+        select(0);
+        QTest::keySequence(m_tasks->findChild<QTreeView *>("taskTree"), QKeySequence::Copy);
+        const QStringList lines = QGuiApplication::clipboard()->text().split('\n');
+        QCOMPARE(lines.size(), 5);
+        QCOMPARE(lines[2], QString("1 of 2 failed: 1 Failed to connect to device"));
+        QCOMPARE(lines[3], QString("NC-1\t10.0.0.2\tMAC2\tFailed to connect to device\t100 %"));
+    }
+
+    void searchAndFilterSayWhenNothingMatches() {
+        showTasks({task("t", "pTaskDone", {device(7, "pTaskDone")})});
+        auto *tree = m_tasks->findChild<QTreeView *>("taskTree");
+        QTest::keyClicks(m_tasks->findChild<QLineEdit *>("taskSearchEdit"), "10.0.0.8");
+        QTRY_COMPARE(tree->model()->rowCount(), 0);
+        QVERIFY(m_tasks->findChild<QLabel *>("panelEmptyLabel")->text().contains("matches"));
+        m_tasks->findChild<QLineEdit *>("taskSearchEdit")->clear();
+        QTRY_COMPARE(tree->model()->rowCount(), 1);
+        QTest::mouseClick(button("taskFilterFailedButton"), Qt::LeftButton);
+        QCOMPARE(tree->model()->rowCount(), 0);
+    }
+
+    void failedPollSaysHowOldTheListIs() {
+        showTasks({task("t", "pTaskDone", json::array())});
+        auto *stale = m_tasks->findChild<QLabel *>("taskStaleLabel");
+        QVERIFY(stale->isHidden());
+        m_service->refuse("/v1/task/list", 3);
+        m_pool.loadTaskStatuses();
+        QTRY_VERIFY(stale->isVisible());
+        QCOMPARE(m_tasks->findChild<QTreeView *>("taskTree")->model()->rowCount(), 1);
+    }
+
+    void uploadEndsOnTheDesktop() {
+        showTasks({task("t", "pTaskProcessing", json::array(), true)});
+        QCOMPARE(m_toasts->texts, QStringList());
+        m_service->setTasks({task("t", "pTaskFailed", json::array())});
+        loadTasks();
+        QCOMPARE(m_toasts->texts, QStringList{"Task - Upload Firmware finished"});
+        QSignalSpy clicked(&Notifier::instance(), &Notifier::notificationClicked);
+        m_toasts->last->toastActivated(1);
+        m_toasts->last->toastDismissed();
+        QCOMPARE(clicked.count(), 0);
+        m_toasts->last->toastActivated(0);
+        m_toasts->last->toastActivated();
+        QCOMPARE(clicked.count(), 2);
+        QCOMPARE(clicked[0][0].toInt(), 1);
+        Notifier::instance().setEnabled(true, false);
+        Notifier::instance().ShowMessage("no", Notifier::Task);
+        Notifier::instance().ShowMessage("no", 2);
+        QCOMPARE(m_toasts->texts.size(), 1);
+        QCOMPARE(m_log->count("Unsupported notification type when Notifier::ShowMessage"), 1);
+        Notifier::instance().setEnabled(true, true);
+    }
+
+    void alarmsAreReadOnceThePanelIsSeen() {
+        m_alarms = std::make_unique<AlarmPanel>();
+        QSignalSpy unread(m_alarms.get(), &AlarmPanel::alarmUnreadCountUpdated);
+        m_service->setAlarms(page({alarm(2, "two"), alarm(1, "one")}));
+        loadAlarms();
+        QCOMPARE(unread.last()[0].toInt(), 2);
+        m_alarms->show();
+        QCOMPARE(unread.last()[0].toInt(), 0);
+        m_alarms->hide();
+        m_service->setAlarms(page({alarm(3, "three"), alarm(2, "two")}));
+        loadAlarms();
+        QCOMPARE(unread.last()[0].toInt(), 1);
+        QCOMPARE(m_toasts->texts, QStringList{"Lost connection to three"});
+
+        // Another run of the client knows what was read in this one; the session does not matter.
+        m_alarms = std::make_unique<AlarmPanel>();
+        QSignalSpy again(m_alarms.get(), &AlarmPanel::alarmUnreadCountUpdated);
+        loadAlarms();
+        QCOMPARE(again.last()[0].toInt(), 1);
+    }
+
+    void clickedAlarmNamesItsDevice() {
+        m_alarms = std::make_unique<AlarmPanel>();
+        m_alarms->resize(340, 600);
+        m_alarms->show();
+        m_service->setAlarms(page({alarm(2, "two"), alarm(1, "one")}));
+        loadAlarms();
+        auto *list = m_alarms->findChild<QListView *>("alarmList");
+        QSignalSpy chosen(m_alarms.get(), &AlarmPanel::deviceChosen);
+        QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
+                          list->visualRect(list->model()->index(1, 0)).center());
+        QCOMPARE(chosen.count(), 1);
+        QCOMPARE(chosen[0][0].toString(), QString("DVone"));
+        QTest::keyClick(list, Qt::Key_Delete);
+        QTRY_VERIFY(!m_service->sentTo("/v1/alarm/rm").empty());
+        const auto sent = m_service->sentTo("/v1/alarm/rm");
+        QVERIFY(sent[0]["alids"] == json::array({"a1"}));
+    }
+
+private:
+    void showTasks(const std::vector<json> &list) {
+        m_tasks = std::make_unique<TaskPanel>();
+        m_tasks->resize(340, 600);
+        m_tasks->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_tasks.get()));
+        m_service->setTasks(list);
+        loadTasks();
+    }
+    void loadTasks() { load(&CTaskInfoPool::loadTaskStatuses, &CTaskInfoPool::taskListUpdated); }
+    void loadAlarms() { load(&CTaskInfoPool::loadAlarmInfo, &CTaskInfoPool::alarmListUpdated); }
+    void load(void (CTaskInfoPool::*start)(), void (CTaskInfoPool::*updated)()) {
+        NetTask::waitForAll(5000);
+        QSignalSpy spy(&m_pool, updated);
+        (m_pool.*start)();
+        QTRY_VERIFY(spy.count() > 0);
+    }
+    void select(int row) {
+        auto *tree = m_tasks->findChild<QTreeView *>("taskTree");
+        QTest::mouseClick(tree->viewport(), Qt::LeftButton, {},
+                          tree->visualRect(tree->model()->index(row, 0)).center());
+    }
+    QToolButton *button(const char *name) { return m_tasks->findChild<QToolButton *>(name); }
+    void answerQuestion(const char *with) {
+        QPointer<ConfirmDialog> question = m_tasks->findChild<ConfirmDialog *>();
+        QVERIFY(question);
+        QTest::mouseClick(question->findChild<QPushButton *>(with), Qt::LeftButton);
+        QTRY_VERIFY(!question);
+    }
+
+    IsolatedRoot m_root;
+    CTaskInfoPool &m_pool = CTaskInfoPool::instance();
+    std::unique_ptr<LogCapture> m_log;
+    std::unique_ptr<FakeLists> m_service;
+    std::unique_ptr<TaskPanel> m_tasks;
+    std::unique_ptr<AlarmPanel> m_alarms;
+    NotedToasts *m_toasts = nullptr;
+};
+
+QTEST_MAIN(TestPanels)
+#include "tst_panels.moc"
