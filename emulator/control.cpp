@@ -1,6 +1,7 @@
 #include "control.h"
 
 #include "answer.h"
+#include "clock.h"
 #include "device_commit.h"
 #include "faults.h"
 #include "fleet.h"
@@ -12,6 +13,7 @@
 #include <signal.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <iostream>
@@ -49,10 +51,19 @@ std::optional<std::size_t> numberOf(const std::string &text) {
     return whole ? std::optional(number) : std::nullopt;
 }
 
-void hold(Model &model, Device &device, bool reachable) {
+void changeConnection(Model &model, Device &device, bool reachable) {
+    const bool changes = device.reachable != reachable;
     device.reachable = reachable;
-    device.held = !reachable;
     model.devices.saveState(device);
+    if (changes) {
+        const AlarmKind kind = reachable ? AlarmKind::ConnectionRestored : AlarmKind::LostConnection;
+        model.alarms.raise(kind, &device, nowMs());
+    }
+}
+
+void hold(Model &model, Device &device, bool reachable) {
+    device.held = !reachable;
+    changeConnection(model, device, reachable);
 }
 
 std::string counted(std::size_t devices) {
@@ -176,6 +187,26 @@ std::string Control::runOnDevices(const Words &words) {
     if (command == "status" && words.size() == 5) {
         return status(words);
     }
+    return runOnTasks(words);
+}
+
+std::string Control::runOnTasks(const Words &words) {
+    const std::string command = words.empty() ? std::string() : words[0];
+    if (command == "task" && (words.size() == 3 || words.size() == 4)) {
+        return task(words);
+    }
+    if ((command == "task-pace" || command == "task-failures") && words.size() == 2) {
+        return taskRule(command, words[1]);
+    }
+    if (command == "touch-tasks" && words.size() == 2 && numberOf(words[1])) {
+        const std::size_t count = *numberOf(words[1]);
+        return "ok " +
+               std::to_string(m_service.withModel([&](Model &model) { return model.tasks.touch(count); })) +
+               " tasks";
+    }
+    if (command == "alarm" && (words.size() == 2 || words.size() == 3)) {
+        return alarm(words);
+    }
     throw std::runtime_error("no such command");
 }
 
@@ -241,12 +272,15 @@ std::string Control::status(const Words &words) {
     }
     m_service.withModel([&](Model &model) {
         Device &device = model.devices.get(id);
+        const bool wasAuthorized = device.authorization == Authorization::Authorized;
         device.authorization = auth == "-" ? device.authorization : authorization;
+        if (wasAuthorized && device.authorization != Authorization::Authorized) {
+            model.alarms.raise(AlarmKind::AuthorizationLost, &device, nowMs());
+        }
         device.action = action == "-" ? device.action : action;
         const bool reachable = connect == "-" ? device.reachable : connect == "Connected";
         device.held = connect == "-" ? device.held : !reachable;
-        device.reachable = reachable;
-        model.devices.saveState(device);
+        changeConnection(model, device, reachable);
     });
     return counted(1);
 }
@@ -261,6 +295,68 @@ std::string Control::counts() {
                " accounts=" + std::to_string(model.accounts.all().size()) +
                " sessions=" + std::to_string(model.sessions.count());
     });
+}
+
+std::string Control::task(const Words &words) {
+    const auto count = numberOf(words[2]);
+    const auto delay = words.size() == 4 ? numberOf(words[3]) : std::optional<std::size_t>(0);
+    if (!count || !delay || *delay > 1000000000) {
+        throw std::runtime_error("task takes a type, a number of devices and a delay");
+    }
+    return "ok " + m_service.withModel([&](Model &model) {
+        const std::int64_t now = nowMs();
+        Json devices = Json::array();
+        std::vector<DeviceWork> work;
+        for (std::size_t i = 0; i < std::min(*count, model.devices.size()); ++i) {
+            const std::string &id = model.devices.at(i).id;
+            const auto time =
+                *delay == 0 ? std::string() : std::to_string(now + static_cast<std::int64_t>(*delay));
+            devices.push_back({{"id", id}, {"actm", time}});
+            work.push_back({id, Json::object(), false, {}});
+        }
+        const std::string user = model.accounts.all().front().email;
+        const std::string id = model.engine.create(words[1], user, devices, now).id;
+        model.engine.startWork(id, work, now);
+        return id;
+    });
+}
+
+std::string Control::taskRule(const std::string &rule, const std::string &value) {
+    double number = -1;
+    const auto [end, error] = std::from_chars(value.data(), value.data() + value.size(), number);
+    const double most = rule == "task-pace" ? 3600000 : 1;
+    if (error != std::errc() || end != value.data() + value.size() || !(number >= 0 && number <= most)) {
+        throw std::runtime_error(rule + " takes no such number");
+    }
+    m_service.withModel([&](Model &model) {
+        TaskRules &rules = model.engine.rules();
+        if (rule == "task-pace") {
+            rules.paceMs = static_cast<std::int64_t>(number);
+        } else {
+            rules.failures = number;
+        }
+    });
+    return "ok";
+}
+
+std::string Control::alarm(const Words &words) {
+    const auto kind = numberOf(words[1]);
+    const auto count = words.size() == 3 ? numberOf(words[2]) : std::optional<std::size_t>(1);
+    if (!kind || *kind < 1 || *kind > 6 || !count || *count > 100000) {
+        throw std::runtime_error("alarm takes a number from 1 to 6 and how often");
+    }
+    m_service.withModel([&](Model &model) {
+        const auto what = static_cast<AlarmKind>(*kind);
+        const bool ofServer = what == AlarmKind::ServerStarted || what == AlarmKind::ServerStopped;
+        Transaction transaction(model.store.database());
+        for (std::size_t i = 0; i < *count; ++i) {
+            const bool hasDevice = !ofServer && model.devices.size() != 0;
+            const Device *device = hasDevice ? &model.devices.at(i % model.devices.size()) : nullptr;
+            model.alarms.raise(what, device, nowMs());
+        }
+        transaction.commit();
+    });
+    return "ok " + std::to_string(*count) + " alarms";
 }
 
 } // namespace emulator

@@ -24,6 +24,7 @@ private:
     std::string answer(const std::string &line);
     std::string run(const Words &words);
     std::string runOnDevices(const Words &words);
+    std::string runOnTasks(const Words &words);
 
     std::string fault(const std::string &text);
     std::string drop(const std::string &what);
@@ -33,6 +34,9 @@ private:
     std::string tick(const std::string &count);
     std::string status(const Words &words);
     std::string counts();
+    std::string task(const Words &words);
+    std::string taskRule(const std::string &rule, const std::string &value);
+    std::string alarm(const Words &words);
 
     Service &m_service;
     Faults &m_faults;

@@ -1,6 +1,7 @@
 #include "device_commit.h"
 
 #include "answer.h"
+#include "clock.h"
 #include "device_maker.h"
 #include "model.h"
 
@@ -220,6 +221,7 @@ void removeDevices(Model &model, const std::vector<std::string> &ids) {
     for (const std::string &id : ids) {
         model.scans.release(model.devices.get(id));
     }
+    model.engine.forget({ids.begin(), ids.end()}, nowMs());
     model.devices.remove({ids.begin(), ids.end()});
 }
 

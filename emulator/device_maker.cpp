@@ -6,6 +6,7 @@
 #include <array>
 #include <charconv>
 #include <cstdio>
+#include <utility>
 
 namespace emulator {
 
@@ -141,6 +142,14 @@ Json firstRecord(const Appearance &appearance) {
     return {{"d_model", appearance.model}, {"d_ip", appearance.ip},
             {"d_mac", appearance.mac},     {"d_http", appearance.http},
             {"d_https", appearance.https}, {"d_svrtype", classOf(appearance.model)}};
+}
+
+Device withMembers(const Device &device, const Json &members) {
+    Device changed = device;
+    Json record = Json::parse(device.body);
+    record.update(members);
+    setRecord(changed, std::move(record));
+    return changed;
 }
 
 void setRecord(Device &device, Json record) {

@@ -41,5 +41,7 @@ Endpoints deviceEndpoints();
 Endpoints accountEndpoints();
 Endpoints taskEndpoints();
 Endpoints alarmEndpoints();
+Endpoints logEndpoints();
+Endpoints commandEndpoints();
 
 } // namespace emulator

@@ -1,19 +1,28 @@
 #include "endpoint.h"
+#include "service.h"
 
 namespace emulator {
 
 namespace {
 
-/// This service has no alarms to tell.
-Answer listAlarms(Service &, const Call &call) {
-    pageOf(call.body);
-    return Answer::secret(R"({"items":[],"total_items":0})");
+Answer listAlarms(Service &service, const Call &call) {
+    const Page page = pageOf(call.body);
+    return Answer::secret(service.withModel([&](Model &model) { return model.alarms.pageText(page); }));
+}
+
+Answer removeAlarms(Service &service, const Call &call) {
+    const auto ids = textsMember(call.body, "alids");
+    service.withModel([&](Model &model) { model.alarms.remove(ids); });
+    return {};
 }
 
 } // namespace
 
 Endpoints alarmEndpoints() {
-    return {{"POST", "/v1/alarm/list", Gate::Reader, &listAlarms}};
+    return {
+        {"POST", "/v1/alarm/list", Gate::Reader, &listAlarms},
+        {"POST", "/v1/alarm/rm", Gate::Writer, &removeAlarms},
+    };
 }
 
 } // namespace emulator

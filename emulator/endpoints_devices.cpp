@@ -2,6 +2,7 @@
 #include "credentials.h"
 #include "device_commit.h"
 #include "device_maker.h"
+#include "device_targets.h"
 #include "endpoint.h"
 #include "service.h"
 
@@ -10,27 +11,6 @@
 namespace emulator {
 
 namespace {
-
-/// The ids of a "devices" argument, whose elements are ids or objects with an id.
-std::vector<std::string> deviceIds(const Json &body) {
-    std::vector<std::string> ids;
-    for (const Json &element : arrayMember(body, "devices")) {
-        if (element.is_string()) {
-            ids.push_back(element.get<std::string>());
-        } else if (element.is_object()) {
-            ids.push_back(textMember(element, "id"));
-        } else {
-            throw Refusal(Code::Malformed, "an element of \"devices\" names no device");
-        }
-    }
-    return ids;
-}
-
-void checkKnown(const Model &model, const std::vector<std::string> &ids) {
-    for (const std::string &id : ids) {
-        model.devices.get(id);
-    }
-}
 
 int policyMask(const Json &body) {
     const std::string text = textMember(body, "type");
@@ -46,6 +26,7 @@ Answer listDevices(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
     return Answer::secret(service.withModel([&](Model &model) {
         model.authorization.settle(nowMs());
+        model.engine.settle(nowMs());
         return model.devices.pageText(page);
     }));
 }
@@ -54,6 +35,7 @@ Answer listStatuses(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
     return Answer::secret(service.withModel([&](Model &model) {
         model.authorization.settle(nowMs());
+        model.engine.settle(nowMs());
         return model.devices.statusText(page);
     }));
 }
@@ -101,35 +83,56 @@ Answer scanResults(Service &service, const Call &) {
     return Answer::secret(service.withModel([](Model &model) { return model.scans.foundText(nowMs()); }));
 }
 
+void setPolicyAtOnce(Model &model, const std::vector<Target> &targets, const Json &changes) {
+    Transaction transaction(model.store.database());
+    for (const Target &target : targets) {
+        Device &device = model.devices.get(target.id);
+        model.devices.update(device, withMembers(device, changes));
+    }
+    transaction.commit();
+}
+
+void setPolicyUnder(const Task &task, Model &model, const std::vector<Target> &targets, const Json &changes) {
+    if (task.type != "devicePassPolicy") {
+        throw Refusal(Code::Malformed, "the task is for something else");
+    }
+    std::vector<DeviceWork> work;
+    for (const Target &target : targets) {
+        work.push_back({target.id, changes, false, {}});
+    }
+    model.engine.startWork(task.id, work, nowMs());
+}
+
 Answer setPolicy(Service &service, const Call &call) {
-    const auto ids = deviceIds(call.body);
-    const Json policy = {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}};
-    textMember(call.body, "tid");
+    const auto targets = targetsOf(call.body);
+    const Json changes = {
+        {"d_policy", {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}}}};
+    const std::string taskId = textMember(call.body, "tid");
     service.withModel([&](Model &model) {
-        checkKnown(model, ids);
-        Transaction transaction(model.store.database());
-        for (const std::string &id : ids) {
-            Device &device = model.devices.get(id);
-            Device changed = device;
-            Json record = Json::parse(device.body);
-            record["d_policy"] = policy;
-            setRecord(changed, std::move(record));
-            model.devices.update(device, std::move(changed));
+        model.engine.settle(nowMs());
+        checkKnown(model, targets);
+        if (const Task *task = model.tasks.find(taskId)) {
+            setPolicyUnder(*task, model, targets, changes);
+        } else {
+            setPolicyAtOnce(model, targets, changes);
         }
-        transaction.commit();
     });
     return {};
 }
 
 Answer authorize(Service &service, const Call &call) {
-    const auto ids = deviceIds(call.body);
+    const auto targets = targetsOf(call.body);
     const std::string account = filledTextMember(call.body, "acc");
     const auto password = plainPassword(textMember(call.body, "pass"));
     if (!password) {
         throw Refusal(Code::Malformed, "\"pass\" does not decipher");
     }
     service.withModel([&](Model &model) {
-        checkKnown(model, ids);
+        checkKnown(model, targets);
+        std::vector<std::string> ids;
+        for (const Target &target : targets) {
+            ids.push_back(target.id);
+        }
         model.authorization.request(ids, account, *password, nowMs());
     });
     return {};

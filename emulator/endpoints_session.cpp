@@ -20,13 +20,19 @@ Answer login(Service &service, const Call &call) {
         throw Refusal(Code::NotAccepted, "wrong e-mail or password");
     }
     Answer answer;
-    answer.token =
-        service.withModel([&](Model &model) { return model.sessions.open(account->email, nowMs()); });
+    answer.token = service.withModel([&](Model &model) {
+        std::string token = model.sessions.open(account->email, nowMs());
+        model.log.add(nowMs(), "System", "Audit", "Logged in", account->email);
+        return token;
+    });
     return answer;
 }
 
 Answer logout(Service &service, const Call &call) {
-    service.withModel([&](Model &model) { model.sessions.close(call.session.session); });
+    service.withModel([&](Model &model) {
+        model.sessions.close(call.session.session);
+        model.log.add(nowMs(), "System", "Audit", "Logged off", call.session.account);
+    });
     return {};
 }
 
@@ -35,7 +41,10 @@ Answer getSettings(Service &service, const Call &) {
 }
 
 Answer setSettings(Service &service, const Call &call) {
-    service.withModel([&](Model &model) { model.settings.change(call.body); });
+    service.withModel([&](Model &model) {
+        model.settings.change(call.body);
+        model.log.add(nowMs(), "System", "Audit", "Settings changed", call.session.account);
+    });
     return {};
 }
 

@@ -94,6 +94,17 @@ const Json &arrayMember(const Json &object, const char *name) {
     return value;
 }
 
+std::vector<std::string> textsMember(const Json &body, const char *name) {
+    std::vector<std::string> texts;
+    for (const Json &element : arrayMember(body, name)) {
+        if (!element.is_string()) {
+            throw Refusal(Code::Malformed, std::string("\"") + name + "\" holds something else than texts");
+        }
+        texts.push_back(element.get<std::string>());
+    }
+    return texts;
+}
+
 std::string optionalText(const Json &object, const char *name) {
     const auto found = object.find(name);
     if (found == object.end() || found->is_null()) {

@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace emulator {
 
@@ -22,6 +23,7 @@ std::string textMember(const Json &object, const char *name);
 std::string filledTextMember(const Json &object, const char *name);
 std::int64_t integerMember(const Json &object, const char *name);
 const Json &arrayMember(const Json &object, const char *name);
+std::vector<std::string> textsMember(const Json &object, const char *name);
 
 /// Empty where the member is missing or null; throws for another type.
 std::string optionalText(const Json &object, const char *name);

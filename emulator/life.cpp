@@ -1,5 +1,7 @@
 #include "life.h"
 
+#include "clock.h"
+#include "device_maker.h"
 #include "model.h"
 #include "random.h"
 
@@ -14,6 +16,8 @@ constexpr auto tickKey = "tick";
 // Outages of sixty ticks on the average, three devices of a hundred at a time.
 constexpr double dropsPerDevice = 0.03 / 60;
 constexpr double actionsPerDevice = 0.005 / 12;
+// Every quarter of an hour or so in a fleet of five hundred.
+constexpr double troublesPerDevice = 0.000002;
 constexpr int mostTries = 8;
 
 std::uint64_t keptTick(Store &store) {
@@ -34,6 +38,7 @@ void Life::tick() {
     takeTurns();
     dropSome();
     keepSomeBusy();
+    causeTrouble();
     m_model.store.setValue(tickKey, std::to_string(m_tick));
     transaction.commit();
 }
@@ -61,6 +66,7 @@ void Life::takeTurns() {
             } else if (!device->held && !device->reachable) {
                 device->reachable = true;
                 m_model.devices.saveState(*device);
+                raise(AlarmKind::ConnectionRestored, *device);
             }
         }
     }
@@ -71,6 +77,7 @@ void Life::dropSome() {
         if (Device *device = pickIdle()) {
             device->reachable = false;
             m_model.devices.saveState(*device);
+            raise(AlarmKind::LostConnection, *device);
             after(20 + draw(81), {device->id, {}});
         }
     }
@@ -86,6 +93,29 @@ void Life::keepSomeBusy() {
             after(5 + draw(15), {device->id, device->action});
         }
     }
+}
+
+void Life::causeTrouble() {
+    for (std::uint64_t n = shareOf(troublesPerDevice); n > 0; --n) {
+        Device *device = pickIdle();
+        if (device && device->authorization == Authorization::Authorized) {
+            m_model.devices.update(*device,
+                                   withMembers(*device, {{"d_sdstatus", "Error"}, {"d_sdusage", 0}}));
+            raise(AlarmKind::CardError, *device);
+        }
+    }
+    for (std::uint64_t n = shareOf(troublesPerDevice); n > 0; --n) {
+        Device *device = pickIdle();
+        if (device && device->authorization == Authorization::Authorized) {
+            device->authorization = Authorization::InvalidPassword;
+            m_model.devices.saveState(*device);
+            raise(AlarmKind::AuthorizationLost, *device);
+        }
+    }
+}
+
+void Life::raise(AlarmKind kind, const Device &device) {
+    m_model.alarms.raise(kind, &device, nowMs());
 }
 
 Device *Life::pickIdle() {

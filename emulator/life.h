@@ -1,5 +1,6 @@
 #pragma once
 
+#include "alarm_table.h"
 #include "records.h"
 
 #include <cstdint>
@@ -30,6 +31,8 @@ private:
     void takeTurns();
     void dropSome();
     void keepSomeBusy();
+    void causeTrouble();
+    void raise(AlarmKind kind, const Device &device);
     Device *pickIdle();
     std::uint64_t shareOf(double perDevice);
     void after(std::uint64_t ticks, Turn turn);

@@ -42,11 +42,8 @@ void useKeyOf(const std::filesystem::path &folder) {
     }
 }
 
-void live(emulator::Service &service, const emulator::StopSignal &stop, int lifeMs) {
-    // Without a life there is still work that falls due.
-    const auto period = lifeMs > 0 ? std::chrono::milliseconds(lifeMs) : 1000ms;
-    service.letLive(lifeMs > 0);
-    while (!stop.waitFor(period)) {
+void live(emulator::Service &service, const emulator::StopSignal &stop) {
+    while (!stop.waitFor(service.restTime())) {
         try {
             service.lookAfter();
         } catch (const std::exception &error) {
@@ -82,12 +79,13 @@ int serve(const emulator::Options &options) {
     files.writePort(port);
     files.writeRunning();
     const auto serving = std::async(std::launch::async, [&] { server.serve(); });
-    const auto living = std::async(std::launch::async, [&] { live(service, stop, options.lifeMs); });
+    const auto living = std::async(std::launch::async, [&] { live(service, stop); });
     const emulator::Control control(service, faults, stop);
     server.waitUntilServing();
     std::cout << "nvldm-emulator: listening on https://" << options.host << ':' << port << std::endl;
     int signal = 0;
     sigwait(&stops, &signal);
+    service.noteStop();
     stop.raise();
     server.stop();
     leaveWithin(serving, files);

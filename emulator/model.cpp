@@ -22,7 +22,11 @@ Model::Model(const std::filesystem::path &storePath, const ModelLimits &limits)
       devices(store),
       authorization(devices, store),
       scans(devices),
-      batches(limits.batchTimeoutMs) {}
+      batches(limits.batchTimeoutMs),
+      log(store),
+      alarms(store, log),
+      tasks(store),
+      engine(store, tasks, devices, log) {}
 
 bool Model::hasFleet() {
     return !store.value(seedKey).empty();

@@ -1,14 +1,17 @@
 #pragma once
 
 #include "accounts.h"
+#include "alarm_table.h"
 #include "batches.h"
 #include "device_authorization.h"
 #include "device_table.h"
+#include "log_table.h"
 #include "scans.h"
 #include "sessions.h"
 #include "settings.h"
 #include "site_tree.h"
 #include "store.h"
+#include "task_engine.h"
 
 #include <filesystem>
 
@@ -39,6 +42,10 @@ struct Model {
     DeviceAuthorization authorization;
     Scans scans;
     Batches batches;
+    LogTable log;
+    AlarmTable alarms;
+    TaskTable tasks;
+    TaskEngine engine;
 };
 
 /// Drops sites from the tree and from the devices in one step.

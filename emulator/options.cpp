@@ -25,6 +25,16 @@ Fleet
   --seed N              the same seed makes the same fleet and the same life (1)
   --odd-records         add records with missing, wrong and hostile members
   --life MS             length of a tick of the fleet's life; 0 holds it still (1000)
+Past of a new fleet
+  --tasks N             tasks that have ended in the last days (0)
+  --task-devices N      devices of each of them (20)
+  --alarms N            alarms that nobody has removed (0); 5000 are kept at most
+  --log-entries N       log entries of the last 8 days (0); 20000 are kept at most
+Tasks
+  --task-pace MS        length of a step; the work on a device takes 6 to 8 of them (1000)
+  --task-failures P     share of the devices that fail by chance (0)
+  --task-work-timeout MS
+                        how long a task waits for its work (120000)
 Accounts
   --account EMAIL:PASSWORD[:PERMISSION]
                         have this account (admin, operator or viewer; admin when left out); repeatable.
@@ -57,17 +67,23 @@ Commands on standard input, one a line, each answered by one line "ok ..." or "e
   drop ID|N             restore ID|all        remove ID             add N            life on|off
   status ID AUTH CONNECT ACTION    texts with blanks in double quotes, "-" keeps what is there
   tick N                live N ticks at once
+  task TYPE COUNT [DELAY_MS]       another client's task on COUNT devices, run at once or scheduled
+  task-pace MS          task-failures P       as the options
+  touch-tasks N         show another progress for the newest N tasks
+  alarm DESPID [COUNT]  raise alarms; nothing happens to the devices
 
 Devices that nobody manages yet answer to scans at 10.99.0.10 to 10.99.0.49. A device lets the account "root" in
 with any password of 8 characters or more and denies other accounts; a shorter password is wrong, and three
-wrong ones block the account for a minute.
+wrong ones block the account for a minute. Tasks run on 20 devices at a time. A device that is ordered to
+restart or restore is away for three steps, which raises no alarm.
 )";
 
 template <typename Number>
 Number numberOf(const std::string &name, const std::string &text, Number least, Number most) {
     Number value{};
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (error != std::errc() || end != text.data() + text.size() || value < least || value > most) {
+    const bool isWithin = value >= least && value <= most;
+    if (error != std::errc() || end != text.data() + text.size() || !isWithin) {
         throw UsageError(name + " takes a number from " + std::to_string(least) + " to " +
                          std::to_string(most));
     }
@@ -119,6 +135,13 @@ Setters valueSetters(Options &options) {
         {"--session-limit", numberInto<std::size_t>("--session-limit", options.sessionLimit, 1000000)},
         {"--batch-timeout", numberInto("--batch-timeout", options.batchTimeoutMs, longestHold)},
         {"--token-grace", numberInto("--token-grace", options.tokenGraceMs, longestHold)},
+        {"--task-pace", numberInto("--task-pace", options.taskPaceMs, longestHold)},
+        {"--task-work-timeout", numberInto("--task-work-timeout", options.taskWorkTimeoutMs, longestHold)},
+        {"--task-failures", numberInto("--task-failures", options.taskFailures, 1.0)},
+        {"--tasks", numberInto<std::size_t>("--tasks", options.tasks, 20000)},
+        {"--task-devices", numberInto<std::size_t>("--task-devices", options.taskDevices, 1000)},
+        {"--alarms", numberInto<std::size_t>("--alarms", options.alarms, 5000)},
+        {"--log-entries", numberInto<std::size_t>("--log-entries", options.logEntries, 20000)},
         {"--fault", [&](const std::string &text) { options.faults.push_back(text); }},
         {"--account", [&](const std::string &text) { options.accounts.push_back(accountOf(text)); }},
     };

@@ -28,6 +28,13 @@ struct Options {
     std::size_t sessionLimit = 0;
     std::int64_t batchTimeoutMs = 60000;
     std::int64_t tokenGraceMs = 60000;
+    std::int64_t taskPaceMs = 1000;
+    std::int64_t taskWorkTimeoutMs = 120000;
+    double taskFailures = 0;
+    std::size_t tasks = 0;
+    std::size_t taskDevices = 20;
+    std::size_t alarms = 0;
+    std::size_t logEntries = 0;
     std::vector<std::string> faults;
     std::vector<StartAccount> accounts;
     bool fresh = false;

@@ -2,8 +2,10 @@
 
 #include "clock.h"
 #include "fleet.h"
+#include "history.h"
 #include "options.h"
 
+#include <algorithm>
 #include <iostream>
 
 namespace emulator {
@@ -14,12 +16,24 @@ ModelLimits limitsOf(const Options &options) {
     return {{options.sessionLimit, options.tokenGraceMs}, options.batchTimeoutMs};
 }
 
+using Clock = std::chrono::steady_clock;
+
 } // namespace
 
 Service::Service(const Options &options, const std::filesystem::path &storePath)
-    : m_genericTokens(options.root), m_model(storePath, limitsOf(options)) {
-    prepareFleet(options);
+    : m_genericTokens(options.root),
+      m_model(storePath, limitsOf(options)),
+      m_lives(options.lifeMs > 0),
+      m_tickLength(options.lifeMs > 0 ? options.lifeMs : 1000),
+      m_nextTick(Clock::now() + m_tickLength) {
+    const bool isNew = prepareFleet(options);
     prepareAccounts(options);
+    if (isNew) {
+        makeHistory(m_model, {options.tasks, options.taskDevices, options.alarms, options.logEntries});
+    }
+    m_model.engine.rules() = {options.taskPaceMs, options.taskWorkTimeoutMs, options.taskFailures,
+                              m_model.seed()};
+    m_model.alarms.raise(AlarmKind::ServerStarted, nullptr, nowMs());
     m_model.scans.seedNeighbours(m_model.seed());
     m_life = std::make_unique<Life>(m_model);
 }
@@ -28,9 +42,23 @@ void Service::lookAfter() {
     const std::lock_guard lock(m_mutex);
     m_model.authorization.settle(nowMs());
     m_model.batches.dropOverdue(nowMs());
+    m_model.engine.settle(nowMs());
+    if (Clock::now() < m_nextTick) {
+        return;
+    }
+    // A tick that comes late is not made up for.
+    m_nextTick = std::max(m_nextTick + m_tickLength, Clock::now());
     if (m_lives) {
         m_life->tick();
     }
+}
+
+std::chrono::milliseconds Service::restTime() {
+    using std::chrono::milliseconds;
+    const std::lock_guard lock(m_mutex);
+    const milliseconds pace(m_model.engine.rules().paceMs);
+    const milliseconds untilTick = std::chrono::ceil<milliseconds>(m_nextTick - Clock::now());
+    return std::clamp(std::min(pace, untilTick), milliseconds(10), milliseconds(1000));
 }
 
 void Service::liveTick() {
@@ -43,13 +71,19 @@ void Service::letLive(bool lives) {
     m_lives = lives;
 }
 
-void Service::prepareFleet(const Options &options) {
+void Service::noteStop() {
+    const std::lock_guard lock(m_mutex);
+    m_model.alarms.raise(AlarmKind::ServerStopped, nullptr, nowMs());
+}
+
+bool Service::prepareFleet(const Options &options) {
     if (m_model.hasFleet()) {
         std::cerr << "nvldm-emulator: keeps the " << m_model.devices.size()
                   << " devices of its store; --devices, --sites and --seed are not used\n";
-        return;
+        return false;
     }
     makeFleet(m_model, {options.devices, options.sites, options.seed, options.oddRecords});
+    return true;
 }
 
 void Service::prepareAccounts(const Options &options) {

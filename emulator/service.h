@@ -4,6 +4,7 @@
 #include "life.h"
 #include "model.h"
 
+#include <chrono>
 #include <filesystem>
 #include <mutex>
 #include <string>
@@ -29,21 +30,27 @@ public:
 
     const GenericTokenJudge &genericTokens() const { return m_genericTokens; }
 
-    /// Does what has fallen due and, unless life is off, lives one tick.
+    /// Does what has fallen due and, unless life is off, lives a tick when it is time for one.
     void lookAfter();
+    /// How long nothing needs to be looked after.
+    std::chrono::milliseconds restTime();
     /// Lives one tick, life off or not.
     void liveTick();
     void letLive(bool lives);
+    /// To be called once, before the program ends in good order.
+    void noteStop();
 
 private:
-    void prepareFleet(const Options &options);
+    bool prepareFleet(const Options &options);
     void prepareAccounts(const Options &options);
 
     GenericTokenJudge m_genericTokens;
     std::mutex m_mutex;
     Model m_model;
     std::unique_ptr<Life> m_life;
-    bool m_lives = true;
+    bool m_lives;
+    std::chrono::milliseconds m_tickLength;
+    std::chrono::steady_clock::time_point m_nextTick;
 };
 
 } // namespace emulator

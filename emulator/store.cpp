@@ -21,6 +21,10 @@ CREATE TABLE IF NOT EXISTS site(row INTEGER PRIMARY KEY, id TEXT UNIQUE NOT NULL
 CREATE TABLE IF NOT EXISTS device(row INTEGER PRIMARY KEY, id TEXT UNIQUE NOT NULL, body TEXT NOT NULL,
     sites TEXT NOT NULL, sites_as_text INTEGER NOT NULL, mac_key TEXT NOT NULL, ip TEXT NOT NULL,
     authorized INTEGER NOT NULL, reachable INTEGER NOT NULL, held INTEGER NOT NULL, refused INTEGER NOT NULL);
+CREATE TABLE IF NOT EXISTS task(row INTEGER PRIMARY KEY AUTOINCREMENT, head TEXT NOT NULL,
+    devices TEXT NOT NULL, work TEXT NOT NULL);
+CREATE TABLE IF NOT EXISTS alarm(row INTEGER PRIMARY KEY AUTOINCREMENT, at INTEGER NOT NULL, body TEXT NOT NULL);
+CREATE TABLE IF NOT EXISTS log(row INTEGER PRIMARY KEY AUTOINCREMENT, at INTEGER NOT NULL, body TEXT NOT NULL);
 )";
 
 std::vector<std::string> listOf(const std::string &json) {
@@ -71,6 +75,12 @@ std::string Store::value(const std::string &key) {
 
 void Store::setValue(const std::string &key, const std::string &value) {
     m_setValue.bind(key).bind(value).run();
+}
+
+std::int64_t Store::lastRow(const std::string &table) {
+    Statement sequence(m_database, "SELECT seq FROM sqlite_sequence WHERE name=?");
+    sequence.bind(table);
+    return sequence.step() ? sequence.integer(0) : 0;
 }
 
 std::vector<Account> Store::accounts() {

@@ -20,6 +20,9 @@ public:
     std::string value(const std::string &key);
     void setValue(const std::string &key, const std::string &value);
 
+    /// The highest row that a table had ever, of those that never use one again.
+    std::int64_t lastRow(const std::string &table);
+
     std::vector<Account> accounts();
     void saveAccount(const Account &account);
     void removeAccount(const std::string &email);

@@ -190,13 +190,15 @@ void EmulatorServiceTest::genericToken() {
 void EmulatorServiceTest::permission_data() {
     QTest::addColumn<QString>("path");
     QTest::addColumn<bool>("writes");
-    for (const char *path : {"/v1/config/set", "/v1/site/new", "/v1/site/update", "/v1/site/rms",
-                             "/v1/site/commit", "/v1/dev/commit", "/v1/dev/scan", "/v1/dev/scanip",
-                             "/v1/dev/scanips", "/v1/dev/setpolicy", "/v1/dev/auth"}) {
+    for (const char *path :
+         {"/v1/config/set", "/v1/site/new", "/v1/site/update", "/v1/site/rms", "/v1/site/commit",
+          "/v1/dev/commit", "/v1/dev/scan", "/v1/dev/scanip", "/v1/dev/scanips", "/v1/dev/setpolicy",
+          "/v1/dev/auth", "/v1/task/init", "/v1/task/rm", "/v1/task/updateState", "/v1/alarm/rm",
+          "/v1/cgi/commit", "/v1/cgi/custom", "/v1/cgi/customx"}) {
         QTest::newRow(path) << path << true;
     }
     for (const char *path : {"/v1/config/get", "/v1/site/list", "/v1/dev/list", "/v1/dev/scanout",
-                             "/v1/dstatus/list", "/v1/task/list", "/v1/alarm/list"}) {
+                             "/v1/dstatus/list", "/v1/task/list", "/v1/alarm/list", "/v1/cgi/list"}) {
         QTest::newRow(path) << path << false;
     }
 }

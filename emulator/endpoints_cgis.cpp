@@ -1,0 +1,161 @@
+#include "clock.h"
+#include "device_targets.h"
+#include "endpoint.h"
+#include "service.h"
+
+#include <algorithm>
+#include <map>
+
+namespace emulator {
+
+namespace {
+
+constexpr auto storedKey = "custom_commands";
+
+Json storedCommands(Model &model) {
+    const std::string text = model.store.value(storedKey);
+    return text.empty() ? Json::array() : Json::parse(text);
+}
+
+void checkMethod(const Json &command) {
+    const std::string method = optionalText(command, "method");
+    if (!method.empty() && method != "GET" && method != "POST") {
+        throw Refusal(Code::Malformed, "a command is sent with GET or POST");
+    }
+}
+
+void checkStored(const Json &commands) {
+    for (const Json &command : commands) {
+        if (!command.is_object()) {
+            throw Refusal(Code::Malformed, "a command is no object");
+        }
+        for (const char *name : {"cgiid", "name", "method", "command"}) {
+            filledTextMember(command, name);
+        }
+        textMember(command, "description");
+        checkMethod(command);
+    }
+}
+
+Answer listCommands(Service &service, const Call &call) {
+    const Page page = pageOf(call.body);
+    const Json all = service.withModel(&storedCommands);
+    Json part = Json::array();
+    for (std::size_t i = page.start; i < all.size() && part.size() < page.count; ++i) {
+        part.push_back(all[i]);
+    }
+    return Answer::secret(jsonText(part));
+}
+
+Answer commitCommands(Service &service, const Call &call) {
+    const std::string stage = textMember(call.body, "state");
+    const Json &commands = arrayMember(call.body, "cgis");
+    service.withModel([&](Model &model) {
+        const auto complete = model.batches.take("cgis " + call.session.session, stage, commands, nowMs());
+        if (complete) {
+            checkStored(*complete);
+            model.store.setValue(storedKey, jsonText(*complete));
+        }
+    });
+    return {};
+}
+
+/// The commands to run: texts, or objects as they are stored.
+std::vector<std::string> commandsOf(const Json &body) {
+    std::vector<std::string> commands;
+    for (const Json &element : arrayMember(body, "cgis")) {
+        if (element.is_object()) {
+            checkMethod(element);
+            commands.push_back(filledTextMember(element, "command"));
+        } else if (element.is_string() && !element.get_ref<const std::string &>().empty()) {
+            commands.push_back(element.get<std::string>());
+        } else {
+            throw Refusal(Code::Malformed, "an element of \"cgis\" is no command");
+        }
+    }
+    if (commands.empty()) {
+        throw Refusal(Code::Malformed, "there is no command to run");
+    }
+    return commands;
+}
+
+/// The action of a device that gets the commands; empty where they leave it running.
+std::string actionOf(const std::vector<std::string> &commands) {
+    const auto any = [&](const char *parameter) {
+        return std::any_of(commands.begin(), commands.end(), [&](const std::string &command) {
+            return command.find(parameter) != std::string::npos;
+        });
+    };
+    if (any("system_restore=1") || any("system_restoreexcept")) {
+        return "deviceRestore";
+    }
+    return any("system_reset=0") ? "deviceRestart" : "";
+}
+
+Json answerAtOnce(Model &model, Device &device, const std::string &action) {
+    if (!device.reachable) {
+        return {{"id", device.id}, {"status", 503}, {"body", "no connection"}};
+    }
+    if (device.authorization != Authorization::Authorized) {
+        return {{"id", device.id}, {"status", 401}, {"body", "not authorized"}};
+    }
+    if (!action.empty()) {
+        model.engine.restart(device, action, nowMs());
+    }
+    return {{"id", device.id}, {"status", 200}, {"body", "ok"}};
+}
+
+/// All of it is judged before any of it starts.
+void startUnderTasks(Model &model, const std::vector<Target> &targets, bool restarts) {
+    std::map<std::string, std::vector<DeviceWork>> works;
+    for (const Target &target : targets) {
+        if (!target.taskId.empty()) {
+            works[target.taskId].push_back({target.id, Json::object(), restarts, {}});
+        }
+    }
+    for (const auto &[taskId, work] : works) {
+        model.engine.judgeWork(taskId, work);
+    }
+    for (const auto &[taskId, work] : works) {
+        model.engine.startWork(taskId, work, nowMs());
+    }
+}
+
+Json runCommands(Service &service, const Call &call) {
+    const std::string action = actionOf(commandsOf(call.body));
+    const auto targets = targetsOf(call.body);
+    return service.withModel([&](Model &model) {
+        model.engine.settle(nowMs());
+        checkKnown(model, targets);
+        startUnderTasks(model, targets, !action.empty());
+        Json answers = Json::array();
+        for (const Target &target : targets) {
+            answers.push_back(target.taskId.empty()
+                                  ? answerAtOnce(model, model.devices.get(target.id), action)
+                                  : Json{{"id", target.id}, {"status", 0}, {"body", ""}});
+        }
+        return answers;
+    });
+}
+
+Answer runSilently(Service &service, const Call &call) {
+    runCommands(service, call);
+    return {};
+}
+
+Answer runTelling(Service &service, const Call &call) {
+    return Answer::plain(jsonText(runCommands(service, call)));
+}
+
+} // namespace
+
+Endpoints commandEndpoints() {
+    return {
+        {"POST", "/v1/cgi/list", Gate::Reader, &listCommands},
+        {"POST", "/v1/cgi/commit", Gate::Writer, &commitCommands},
+        {"POST", "/v1/cgi/custom", Gate::Writer, &runSilently},
+        {"POST", "/v1/cgi/customx", Gate::Writer, &runTelling},
+    };
+}
+
+} // namespace emulator

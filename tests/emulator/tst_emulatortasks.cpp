@@ -1,0 +1,158 @@
+#include "emulatorprocess.h"
+#include "servicecaller.h"
+
+#include <QTest>
+
+/// Tasks, and the alarms and log entries that the service writes beside them.
+class EmulatorTasksTest : public QObject {
+    Q_OBJECT
+
+private slots:
+    void lifecycle() {
+        fresh();
+        const Json task = newTask("deviceRestart", 30), tids = Json::array({task.at("tid")});
+        COMPARE_JSON(task.at("state"), "pTaskInitState");
+        COMPARE_JSON(task.at("devices")[7].at("d_mac"), m_devices[7].at("d_mac"));
+        COMPARE_JSON(runUnder(task)[0], Json({{"id", m_devices[0].at("id")}, {"status", 0}, {"body", ""}}));
+        COMPARE_JSON(newest().at("status"), "pTaskQueueState");
+        QCOMPARE(code("/v1/task/rm", {{"tids", tids}}), 3);
+        std::size_t mostAway = 0, mostRunning = 0;
+        for (Json last = newest(), now = last; now.at("active"); last = now, now = newest()) {
+            mostAway = std::max(mostAway, withStatus("connect_status", "Unreachable"));
+            mostRunning = std::max(mostRunning, withStatus("action_status", "deviceRestart"));
+            QVERIFY(now.at("progress") >= last.at("progress"));
+        }
+        QVERIFY(mostAway > 0 && mostAway <= 20);
+        QCOMPARE(mostRunning, std::size_t{20});
+        COMPARE_JSON(newest().at("state"), "pTaskDone");
+        QCOMPARE(count(newest().at("devices"), "progress", 100), std::size_t{30});
+        QCOMPARE(withStatus("connect_status", "Connected") + withStatus("action_status", "Standby"), 80UL);
+        QCOMPARE(close(task, "pTaskAborted"), 3);
+        QCOMPARE(code("/v1/task/rm", {{"tids", {tids[0], "TK404"}}}), 4);
+        QCOMPARE(code("/v1/task/rm", {{"tids", tids}}), 0);
+        QVERIFY(m_caller.list("/v1/task/list", 300).empty());
+        QVERIFY(newTask("deviceDance", 1).is_null() && newTask("deviceRestart", 0).is_null());
+    }
+
+    void failuresAndAbort() {
+        Json outcomes = Json::array();
+        for (int run = 0; run < 2; ++run) {
+            fresh({"--task-failures", "0.5"});
+            m_emulator->command("drop " + QString::fromStdString(m_devices[3].at("id")));
+            runUnder(newTask("deviceCustomCommand", 30));
+            outcomes.push_back(ended());
+        }
+        COMPARE_JSON(outcomes[0].at("state"), "pTaskFailed");
+        COMPARE_JSON(outcomes[0].at("devices")[3].at("state"), "pTaskFailedToConnectToDevice");
+        QVERIFY(count(outcomes[0].at("devices"), "state", "pTaskDone") > 3);
+        COMPARE_JSON(outcomes[0].at("devices"), outcomes[1].at("devices"));
+        QCOMPARE(m_emulator->command("task-pace 300"), "ok");
+        const Json task = newTask("deviceFWUpgrade", 30);
+        runUnder(task);
+        QTRY_VERIFY(newest().at("devices")[3].at("state") == "pTaskFailedToConnectToDevice");
+        QCOMPARE(close(task, "pTaskProcessing"), 3);
+        QCOMPARE(close(task, "pTaskAborted"), 0);
+        QVERIFY(count(newest().at("devices"), "state", "pTaskAborted") > 10);
+        QCOMPARE(withStatus("action_status", "Standby"), std::size_t{40});
+    }
+
+    void waiting() {
+        fresh({"--task-work-timeout", "300"});
+        COMPARE_JSON(newTask("devicePackageUpload", 2).at("active"), true);
+        COMPARE_JSON(ended().at("state"), "pTaskFailed");
+        QVERIFY(m_emulator->command("task deviceFWUpgrade 5 500").startsWith("ok TK"));
+        COMPARE_JSON(newest().at("state"), "pTaskScheduled");
+        COMPARE_JSON(ended().at("state"), "pTaskDone");
+    }
+
+    void alarmsAndLog() {
+        fresh({"--log-entries", "300"});
+        const std::size_t before = alarms().at("total_items");
+        QCOMPARE(m_emulator->command("drop 25"), "ok 25 devices");
+        const Json alarm = alarms().at("items")[0];
+        COMPARE_JSON(alarms().at("total_items"), before + 25);
+        QCOMPARE(count(alarms().at("items"), "despid", 2), std::size_t{25});
+        QCOMPARE(count(m_devices, "id", alarm.at("deviceid")), std::size_t{1});
+        QCOMPARE(code("/v1/alarm/rm", {{"alids", {alarm.at("alid"), "AL0"}}}), 4);
+        QCOMPARE(code("/v1/alarm/rm", {{"alids", Json::array({alarm.at("alid")})}}), 0);
+        COMPARE_JSON(alarms().at("total_items"), before + 24);
+        const auto read = [&](const Json &from, const Json &to) {
+            return m_caller.call("/v1/logs/list", {{"start_time", from}, {"end_time", to}});
+        };
+        const Json all = read("0", "99999999999999").data.at("items");
+        QVERIFY(count(all, "type", "Alarm") >= 25 && count(all, "user", "admin") > 0);
+        const std::string from = all[200].at("created_at").dump(), to = all[100].at("created_at").dump();
+        COMPARE_JSON(read(from, to).data.at("items"), Json(all.begin() + 100, all.begin() + 201));
+        QVERIFY(read("soon", "9").code == 3 && read("-1", "9").code == 3 && read(5, "9").code == 3);
+    }
+
+    void survivesCrash() {
+        fresh();
+        runUnder(newTask("deviceCustomCommand", 3));
+        const Json finished = ended(), removed = newTask("deviceRestore", 1);
+        QCOMPARE(close(removed, "pTaskFailed"), 0);
+        QCOMPARE(code("/v1/task/rm", {{"tids", Json::array({removed.at("tid")})}}), 0);
+        QCOMPARE(m_emulator->command("task-pace 60000"), "ok");
+        const Json unfinished = newTask("deviceSetTemplate", 4), alarm = alarms().at("items")[0];
+        runUnder(unfinished);
+        m_emulator->kill();
+        start({"--task-pace", "40"});
+        COMPARE_JSON(ended().at("tid"), unfinished.at("tid"));
+        COMPARE_JSON(newest().at("state"), "pTaskDone");
+        QCOMPARE(m_caller.list("/v1/task/list", 300).size(), std::size_t{2});
+        COMPARE_JSON(m_caller.list("/v1/task/list", 300)[1], finished);
+        COMPARE_JSON(alarms().at("items")[1], alarm);
+    }
+
+private:
+    void start(const QStringList &arguments) {
+        QVERIFY(m_emulator->start(arguments));
+        m_caller = ServiceCaller(m_emulator->port());
+        QCOMPARE(m_caller.login("admin", "admin").code, 0);
+    }
+    /// A quick service with forty devices, all of them there.
+    void fresh(const QStringList &more = {}) {
+        m_emulator = std::make_unique<EmulatorProcess>();
+        start(QStringList{"--devices", "40", "--task-pace", "80"} + more);
+        QVERIFY(m_emulator->command("restore all").startsWith("ok"));
+        m_devices = m_caller.list("/v1/dev/list");
+    }
+    int code(const char *path, const Json &body) { return m_caller.call(path, body).code; }
+    int close(const Json &task, const char *state) {
+        return code("/v1/task/updateState", {{"task_id", task.at("tid")}, {"task_state", state}});
+    }
+    Json newTask(const char *type, std::size_t devices) {
+        const Json body = {{"type", type},
+                           {"devices", Json(m_devices.begin(), m_devices.begin() + long(devices))}};
+        return m_caller.call("/v1/task/init", body).data;
+    }
+    Json runUnder(const Json &task) {
+        Json body = {{"cgis", {"/cgi-bin/admin/getparam.cgi"}}, {"devices", task.at("devices")}};
+        for (Json &device : body["devices"]) {
+            device["tid"] = task.at("tid");
+        }
+        return m_caller.call("/v1/cgi/customx", body).data;
+    }
+    Json newest() { return m_caller.list("/v1/task/list", 300).at(0); }
+    Json ended() {
+        for (int i = 0; i < 400 && newest().at("active"); ++i) {
+            QTest::qWait(10);
+        }
+        return newest();
+    }
+    Json alarms() { return m_caller.call("/v1/alarm/list", {{"start", 0}, {"count", 1000}}).data; }
+    std::size_t withStatus(const char *name, const char *value) {
+        return count(m_caller.list("/v1/dstatus/list"), name, value);
+    }
+    static std::size_t count(const Json &records, const char *name, const Json &value) {
+        const auto fits = [&](const Json &record) { return record.at(name) == value; };
+        return std::size_t(std::count_if(records.begin(), records.end(), fits));
+    }
+
+    std::unique_ptr<EmulatorProcess> m_emulator;
+    ServiceCaller m_caller{0};
+    Json m_devices;
+};
+
+QTEST_GUILESS_MAIN(EmulatorTasksTest)
+#include "tst_emulatortasks.moc"
