@@ -260,7 +260,7 @@ bool FramelessWindow::hasUnfinishedWork() const {
 void FramelessWindow::confirmUnfinished(std::function<void()> goOn) {
     if (!hasUnfinishedWork())
         return goOn();
-    if (m_unfinishedConfirm)
+    if (m_unfinishedConfirm && m_unfinishedConfirm->isVisible())
         return m_unfinishedConfirm->raise();
     m_unfinishedConfirm = new ConfirmDialog(ConfirmDialog::Kind::UnfinishedTask, this);
     m_unfinishedConfirm->setAttribute(Qt::WA_DeleteOnClose);

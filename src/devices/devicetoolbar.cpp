@@ -41,6 +41,9 @@ protected:
         option.text.clear();
         option.icon = {};
         option.features &= ~QStyleOptionToolButton::HasMenu;
+        // A menu that closes elsewhere leaves the button believing that the pointer is still on it.
+        if (!rect().contains(mapFromGlobal(QCursor::pos())))
+            option.state &= ~QStyle::State_MouseOver;
         QStylePainter painter(this);
         painter.drawComplexControl(QStyle::CC_ToolButton, option);
         const QRect iconPlace((width() - pictureSize.width()) / 2, 8, pictureSize.width(),

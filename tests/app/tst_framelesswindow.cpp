@@ -1,5 +1,6 @@
 #include "aboutdialog.h"
 #include "accountsetupdialog.h"
+#include "badgebutton.h"
 #include "clientstore.h"
 #include "devicewindow.h"
 #include "emulatorprocess.h"
@@ -11,12 +12,17 @@
 #include "logindialog.h"
 #include "mainconsoletable.h"
 #include "mainwindow.h"
+#include "notifier.h"
+#include "servicesession.h"
+#include "sidepanel.h"
+#include "taskinfopool.h"
 #include "titlebar.h"
 #include "welcomepage.h"
 
 #include <QComboBox>
 #include <QElapsedTimer>
 #include <QFile>
+#include <QListView>
 #include <QRadioButton>
 #include <QSignalSpy>
 #include <QTimer>
@@ -151,6 +157,65 @@ private slots:
         QTRY_COMPARE_WITH_TIMEOUT(sessions(), 0, patienceMs);
     }
 
+    void requestedTaskIsNotLeftBehindUnasked() {
+        logIn();
+        QVERIFY(!requestTask().isEmpty());
+        CTaskInfoPool::instance().loadTaskStatuses();
+        QTRY_VERIFY_WITH_TIMEOUT(CTaskInfoPool::instance().hasRequestedTask(), patienceMs);
+        const std::pair<std::function<void()>, const char *> leavings[] = {
+            {[this] { QTest::mouseClick(titleBar()->closeButton(), Qt::LeftButton); }, "cancelButton"},
+            {[this] { titleBar()->logOffAction()->trigger(); }, "cancelButton"},
+            {[this] { titleBar()->logOffAction()->trigger(); }, "acceptButton"}};
+        for (const auto &[leave, answer] : leavings) {
+            QVERIFY(m_window->isVisible() && m_window->isLoggedIn());
+            leave();
+            QTRY_VERIFY(QApplication::activeModalWidget());
+            Form::click(QApplication::activeModalWidget(), answer);
+            QTRY_VERIFY(!QApplication::activeModalWidget() || Form::visible<LoginDialog>());
+        }
+        QVERIFY(!m_window->isLoggedIn());
+        QVERIFY(CTaskInfoPool::instance().taskList()->isEmpty());
+    }
+
+    void runningTaskPutsTheIdleLogOffOff() {
+        logIn();
+        QVERIFY(m_service.command("task-pace 800").startsWith("ok"));
+        QVERIFY(m_service.command("task deviceRestart 3").startsWith("ok"));
+        CTaskInfoPool &pool = CTaskInfoPool::instance();
+        pool.loadTaskStatuses();
+        QTRY_VERIFY_WITH_TIMEOUT(pool.hasRunningTask(), patienceMs);
+        m_window->idleWatch()->setPeriod(500ms);
+        m_window->idleWatch()->noteActivity();
+        QTRY_VERIFY(!m_window->idleWatch()->wasActiveSinceLastTick());
+        QVERIFY(m_window->isLoggedIn());
+        QVERIFY(pool.hasRunningTask());
+        // The end of the last task is what the log-off has waited for.
+        QTRY_VERIFY_WITH_TIMEOUT(!m_window->isLoggedIn(), patienceMs);
+    }
+
+    void notificationLeadsToItsPanel() {
+        logIn();
+        auto *side = m_window->findChild<SidePanel *>();
+        QVERIFY(!side->isVisible());
+        emit Notifier::instance().notificationClicked(Notifier::Task);
+        QVERIFY(side->isVisible());
+        QCOMPARE(side->current(), SidePanel::Panel::Tasks);
+        QVERIFY(m_window->findChild<QToolButton *>("taskButton")->isChecked());
+        QTest::mouseClick(m_window->findChild<QToolButton *>("alarmButton"), Qt::LeftButton);
+        QCOMPARE(side->current(), SidePanel::Panel::Alarms);
+        QVERIFY(m_service.command("drop 5").startsWith("ok"));
+        auto *list = side->findChild<QListView *>("alarmList");
+        QTRY_VERIFY_WITH_TIMEOUT(list->model()->rowCount() >= 5, patienceMs);
+        QCOMPARE(m_window->findChild<BadgeButton *>("alarmButton")->badge(), 0);
+        QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
+                          list->visualRect(list->model()->index(0, 0)).center());
+        const auto &selected = m_window->findChild<DeviceWindow *>()->selectedDevices();
+        QCOMPARE(selected.size(), 1u);
+        QVERIFY(list->model()->index(0, 0).data().toString().startsWith("Lost connection to "));
+        QTest::mouseClick(m_window->findChild<QToolButton *>("closeSidePanelButton"), Qt::LeftButton);
+        QVERIFY(!m_window->findChild<QToolButton *>("alarmButton")->isChecked());
+    }
+
     void sessionThatTheServiceEndedIsOver() {
         logIn();
         QCOMPARE(m_service.command("expire-sessions"), QStringLiteral("ok"));
@@ -227,6 +292,19 @@ private slots:
     }
 
 private:
+    /// A task whose work never comes.
+    QString requestTask() {
+        JSON task;
+        NetTask::runAndWait([&] {
+            ServiceSession(CLocalStore::instance().loginInfo()).call([&](CApiClient &client) {
+                JSON devices;
+                client.listDevices(0, 1, devices);
+                return client.newTaskState("deviceRestart", JSON::array({devices.at(0).at("id")}), task);
+            });
+        });
+        return stringMember(task, "tid");
+    }
+
     void openWindow() {
         m_window = std::make_unique<FramelessWindow>();
         m_window->setContent(new MainWindow);

@@ -11,6 +11,8 @@
 #include "refreshdevicedialog.h"
 #include "sessionevents.h"
 #include "sitetree.h"
+#include "taskinfopool.h"
+#include "taskrepeats.h"
 
 #include <QLabel>
 #include <QPushButton>
@@ -215,6 +217,34 @@ private slots:
         QVERIFY(!QApplication::activeModalWidget());
         QTest::mouseClick(table("cameraTable")->viewport(), Qt::LeftButton, {}, QPoint(30, 18));
         QCOMPARE(m_window->selectedDevices().size(), std::size_t(1));
+    }
+
+    void restartRunsAsATaskThatCanBeRepeated() {
+        workOn(20);
+        tell("task-pace 50");
+        QToolButton *restart = m_window->findChild<QToolButton *>("restartButton");
+        QVERIFY(!restart->isEnabled());
+        QTest::mouseClick(table("cameraTable")->viewport(), Qt::LeftButton, {}, QPoint(30, 18));
+        const QString id = m_window->selectedDevices().at(0)->id;
+        restart->click();
+        QTRY_VERIFY(QApplication::activeModalWidget());
+        QTest::keyClick(QApplication::activeModalWidget(), Qt::Key_Return);
+        CTaskInfoPool &pool = CTaskInfoPool::instance();
+        QTRY_COMPARE_WITH_TIMEOUT(pool.taskList()->records().size(), 1u, patienceMs);
+        const QString tid = pool.taskList()->records()[0]->tid;
+        QCOMPARE(pool.taskList()->records()[0]->type, QStringLiteral("deviceRestart"));
+        QTRY_VERIFY_WITH_TIMEOUT(pool.taskList()->find(tid)->isFinal(), patienceMs);
+        QVERIFY(TaskRepeats::instance().find(tid));
+        TaskRepeats::instance().find(tid)->again({id});
+        QTRY_COMPARE_WITH_TIMEOUT(pool.taskList()->records().size(), 2u, patienceMs);
+        QCOMPARE(pool.taskList()->records()[0]->devices[0].target->id, id);
+
+        QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
+        tell("fault code=5@/v1/task/init");
+        TaskRepeats::instance().find(tid)->again({id});
+        QTRY_COMPARE_WITH_TIMEOUT(message.size(), 1, patienceMs);
+        QCOMPARE(message[0][0].toString(),
+                 QStringLiteral("Restart Device could not be started: the server refused it."));
     }
 
     void stopForgetsTheSession() {
