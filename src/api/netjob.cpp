@@ -6,8 +6,8 @@
 
 namespace NetJob {
 
-NetTask *createRunner(const char *purpose) {
-    auto *runner = new (std::nothrow) NetTask;
+NetTask *createRunner(const char *purpose, NetTask::Turn turn) {
+    auto *runner = new (std::nothrow) NetTask(turn);
     if (!runner) {
         qWarning("Fail to create NetTask while %s", purpose);
         return nullptr;

@@ -31,7 +31,7 @@ using Ended = std::function<void(JobEnd)>;
 using StillWanted = std::function<bool()>;
 
 /// A runner that deletes itself when it has finished, or null: then a line with the purpose is logged.
-NetTask *createRunner(const char *purpose);
+NetTask *createRunner(const char *purpose, NetTask::Turn turn = NetTask::Turn::Wait);
 
 /// Starts the job and calls finished in the receiver's thread when the runner has ended. False, with nothing
 /// started, when the runner is null or still busy.

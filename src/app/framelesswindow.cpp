@@ -253,16 +253,21 @@ void FramelessWindow::onLogOff() {
 }
 
 bool FramelessWindow::hasUnfinishedWork() const {
-    return m_loggedIn && CTaskInfoPool::instance().hasRequestedTask();
+    return m_loggedIn && (CTaskInfoPool::instance().hasRequestedTask() ||
+                          (m_content && m_content->deviceWindow()->hasPendingEdits()));
 }
 
-/// Goes on at once, or when the user has agreed to leave a task behind that was requested and has not begun.
+/// Goes on at once, or when the user has agreed to leave behind what a log-off would lose: a task that was
+/// requested and has not begun, or changes of sites.
 void FramelessWindow::confirmUnfinished(std::function<void()> goOn) {
     if (!hasUnfinishedWork())
         return goOn();
     if (m_unfinishedConfirm && m_unfinishedConfirm->isVisible())
         return m_unfinishedConfirm->raise();
-    m_unfinishedConfirm = new ConfirmDialog(ConfirmDialog::Kind::UnfinishedTask, this);
+    m_unfinishedConfirm =
+        new ConfirmDialog(CTaskInfoPool::instance().hasRequestedTask() ? ConfirmDialog::Kind::UnfinishedTask
+                                                                       : ConfirmDialog::Kind::UnsavedSites,
+                          this);
     m_unfinishedConfirm->setAttribute(Qt::WA_DeleteOnClose);
     connect(m_unfinishedConfirm, &QDialog::accepted, this, std::move(goOn));
     m_unfinishedConfirm->open();

@@ -9,6 +9,7 @@
 #include "processsetup.h"
 #include "requestdeadline.h"
 #include "singleinstance.h"
+#include "storewriter.h"
 #include "theme.h"
 
 #include <QApplication>
@@ -80,6 +81,7 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         application.setStyleSheet(Theme::styleSheet());
         status = runWindows(application, shown);
         RequestDeadline::cutAll();
+        StoreWriter::flush();
         // A name look-up cannot be interrupted; nothing is being written while one hangs.
         if (!NetTask::waitForAll(runnersEndMs))
             std::_Exit(status);

@@ -4,6 +4,7 @@
 #include <QLabel>
 #include <QLocale>
 #include <QStyle>
+#include <QToolButton>
 
 #include <algorithm>
 
@@ -31,45 +32,62 @@ void setRole(QLabel *label, const QString &role) {
 } // namespace
 
 DeviceFooter::DeviceFooter(QWidget *parent)
-    : QFrame(parent),
-      m_selection(quietLabel("selectionLabel")),
-      m_statuses(quietLabel("statusSummaryLabel")),
-      m_age(quietLabel("dataAgeLabel")) {
+    : QFrame(parent), m_selection(quietLabel("selectionLabel")), m_age(quietLabel("dataAgeLabel")) {
     setObjectName(QStringLiteral("deviceFooter"));
     setFixedHeight(34);
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(16);
+    layout->setSpacing(4);
     layout->addWidget(m_selection);
-    layout->addWidget(m_statuses);
+    addChip(DeviceStatusGroup::Authorized, "authorizedChip");
+    addChip(DeviceStatusGroup::Unreachable, "unreachableChip");
+    addChip(DeviceStatusGroup::Attention, "attentionChip");
     layout->addStretch();
     layout->addWidget(m_age);
     m_everySecond.setInterval(1000);
     connect(&m_everySecond, &QTimer::timeout, this, &DeviceFooter::showAge);
 }
 
-void DeviceFooter::setSelection(int selected, int shown) {
-    const QLocale locale;
-    m_selection->setText(tr("%1 of %n device(s) selected", nullptr, shown).arg(locale.toString(selected)));
+void DeviceFooter::addChip(DeviceStatusGroup group, const char *name) {
+    auto *chip = new QToolButton(this);
+    chip->setObjectName(QLatin1String(name));
+    chip->setProperty("role", QStringLiteral("filter"));
+    chip->setCheckable(true);
+    chip->setFocusPolicy(Qt::TabFocus);
+    chip->setToolTip(tr("Show only these"));
+    layout()->addWidget(chip);
+    m_chips[static_cast<std::size_t>(group)] = chip;
+    connect(chip, &QToolButton::clicked, this, [this, chip, group](bool pressed) {
+        for (QToolButton *each : m_chips)
+            each->setChecked(each == chip && pressed);
+        emit statusFilterChanged(pressed ? std::optional(group) : std::nullopt);
+    });
 }
 
-void DeviceFooter::setStatuses(const DeviceInventory &inventory, const std::vector<int> &shown) {
-    int authorized = 0;
-    int unreachable = 0;
-    int attention = 0;
-    for (const int device : shown) {
-        const DeviceStatusCode status = inventory.status(device);
-        if (status == DeviceStatusCode::Authorized || status == DeviceStatusCode::Maintaining)
-            ++authorized;
-        else if (status == DeviceStatusCode::Unreachable)
-            ++unreachable;
-        else
-            ++attention;
-    }
+void DeviceFooter::clearStatusFilter() {
+    for (QToolButton *chip : m_chips)
+        chip->setChecked(false);
+    emit statusFilterChanged(std::nullopt);
+}
+
+void DeviceFooter::setSelection(int selected, int shown, int all) {
     const QLocale locale;
-    m_statuses->setText(
-        tr("%1 authorized   %2 unreachable   %3 need attention")
-            .arg(locale.toString(authorized), locale.toString(unreachable), locale.toString(attention)));
+    if (shown == all)
+        m_selection->setText(
+            tr("%1 of %n device(s) selected", nullptr, shown).arg(locale.toString(selected)));
+    else
+        m_selection->setText(tr("%1 of %2 shown selected, %n device(s) in all", nullptr, all)
+                                 .arg(locale.toString(selected), locale.toString(shown)));
+}
+
+void DeviceFooter::setStatuses(const DeviceInventory &inventory, const std::vector<int> &devices) {
+    std::array<int, deviceStatusGroupCount> counts{};
+    for (const int device : devices)
+        ++counts[static_cast<std::size_t>(DeviceStatus::groupOf(inventory.status(device)))];
+    const std::array<QString, deviceStatusGroupCount> texts{tr("%1 authorized"), tr("%1 unreachable"),
+                                                            tr("%1 need attention")};
+    for (std::size_t i = 0; i < m_chips.size(); ++i)
+        m_chips[i]->setText(texts[i].arg(QLocale().toString(counts[i])));
 }
 
 void DeviceFooter::markUpdated() {
@@ -81,8 +99,10 @@ void DeviceFooter::markUpdated() {
 void DeviceFooter::clear() {
     m_everySecond.stop();
     m_updated.invalidate();
-    for (QLabel *label : {m_selection, m_statuses, m_age})
+    for (QLabel *label : {m_selection, m_age})
         label->clear();
+    for (QToolButton *chip : m_chips)
+        chip->setChecked(false);
 }
 
 void DeviceFooter::showAge() {

@@ -15,19 +15,6 @@ struct Sortable {
     const QString *text;
 };
 
-std::vector<int> passing(const DeviceInventory &inventory, const DeviceFilter &filter) {
-    std::vector<int> indexes;
-    const bool all = filter.siteId == Sites::overviewId;
-    const int size = inventory.snapshot()->size();
-    indexes.reserve(static_cast<std::size_t>(size));
-    for (int i = 0; i < size; ++i) {
-        const DeviceRecord &record = inventory.record(i);
-        if (record.deviceClass == filter.deviceClass && (all || record.siteIds.contains(filter.siteId)))
-            indexes.push_back(i);
-    }
-    return indexes;
-}
-
 Sortable sortable(const DeviceInventory &inventory, int index, DeviceColumn column) {
     const DeviceRecord &record = inventory.record(index);
     if (column == DeviceColumn::Status)
@@ -49,9 +36,26 @@ bool comesFirst(const Sortable &a, const Sortable &b, bool ascending) {
 
 } // namespace
 
+std::vector<int> matching(const DeviceInventory &inventory, const DeviceFilter &filter) {
+    std::vector<int> indexes;
+    const bool all = filter.siteId == Sites::overviewId;
+    const int size = inventory.snapshot()->size();
+    indexes.reserve(static_cast<std::size_t>(size));
+    for (int i = 0; i < size; ++i) {
+        const DeviceRecord &record = inventory.record(i);
+        if (record.deviceClass == filter.deviceClass && (all || record.siteIds.contains(filter.siteId)) &&
+            filter.search.matches(record))
+            indexes.push_back(i);
+    }
+    return indexes;
+}
+
 std::vector<int> arrange(const DeviceInventory &inventory, const DeviceFilter &filter,
                          const DeviceSort &sort) {
-    std::vector<int> indexes = passing(inventory, filter);
+    std::vector<int> indexes = matching(inventory, filter);
+    if (filter.status)
+        std::erase_if(indexes,
+                      [&](int i) { return DeviceStatus::groupOf(inventory.status(i)) != *filter.status; });
     if (sort.column < 0 || sort.column >= deviceColumnCount)
         return indexes;
     std::vector<Sortable> rows;

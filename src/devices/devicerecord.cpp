@@ -219,6 +219,7 @@ DeviceRecordPtr parse(const JSON &value) {
         return nullptr;
     record->deviceClass = classOf(stringMember(value, "d_svrtype"));
     record->siteIds = siteIdsOf(value);
+    record->networkType = stringMember(value, "d_nettype");
     readColumns(value, *record);
     record->json = dumpJson(value);
     return record;

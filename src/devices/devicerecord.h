@@ -42,6 +42,7 @@ struct DeviceRecord {
     QString id;
     DeviceClass deviceClass = DeviceClass::Others;
     QStringList siteIds;
+    QString networkType; ///< empty where the record has none
     /// What the columns show, "--" for what the record lacks. The status column's text stands elsewhere.
     std::array<QString, deviceColumnCount> texts;
     /// What the columns are sorted by before their texts: numbers, addresses, versions, times, or the first

@@ -37,6 +37,18 @@ std::array<QIcon, looks.size()> loadIcons() {
 
 } // namespace
 
+DeviceStatusGroup groupOf(DeviceStatusCode code) {
+    switch (code) {
+    case DeviceStatusCode::Authorized:
+    case DeviceStatusCode::Maintaining:
+        return DeviceStatusGroup::Authorized;
+    case DeviceStatusCode::Unreachable:
+        return DeviceStatusGroup::Unreachable;
+    default:
+        return DeviceStatusGroup::Attention;
+    }
+}
+
 DeviceStatusCode codeOf(std::string_view connect, std::string_view auth, std::string_view action) {
     if (connect == "Unreachable")
         return DeviceStatusCode::Unreachable;

@@ -17,7 +17,13 @@ enum class DeviceStatusCode : quint8 {
     AccountBlocked = 7
 };
 
+/// What the states of devices come down to for somebody who looks after them.
+enum class DeviceStatusGroup : quint8 { Authorized, Unreachable, Attention };
+inline constexpr int deviceStatusGroupCount = 3;
+
 namespace DeviceStatus {
+
+DeviceStatusGroup groupOf(DeviceStatusCode code);
 
 /// Judges "connect_status", "auth_status" and "action_status", compared exactly.
 DeviceStatusCode codeOf(std::string_view connect, std::string_view auth, std::string_view action);

@@ -45,10 +45,12 @@ DeviceTab::DeviceTab(DeviceClass deviceClass, const DeviceInventory *inventory, 
       m_table(new MainConsoleTable(deviceClass, this)),
       m_siteHint(centredLabel(tr("Drag devices from the \"Device Overview\""), "quiet")),
       m_emptyPage(makeEmptyPage()),
+      m_noMatchPage(makeNoMatchPage()),
       m_loadingPage(makeLoadingPage()),
       m_failedPage(makeFailedPage()) {
     m_table->setInventory(inventory);
-    for (QWidget *page : {static_cast<QWidget *>(m_table), m_emptyPage, m_loadingPage, m_failedPage})
+    for (QWidget *page :
+         {static_cast<QWidget *>(m_table), m_emptyPage, m_noMatchPage, m_loadingPage, m_failedPage})
         addWidget(page);
     setCurrentWidget(m_loadingPage);
 }
@@ -59,18 +61,30 @@ void DeviceTab::showContent(Content content, bool isSite) {
         setCurrentWidget(m_loadingPage);
     else if (content == Content::Failed)
         setCurrentWidget(m_failedPage);
+    else if (m_table->rowCount() > 0)
+        setCurrentWidget(m_table);
     else
-        setCurrentWidget(m_table->rowCount() > 0 ? static_cast<QWidget *>(m_table) : m_emptyPage);
+        setCurrentWidget(m_table->unfilteredCount() > 0 ? m_noMatchPage : m_emptyPage);
 }
 
 QWidget *DeviceTab::makeEmptyPage() {
     auto *add = new QPushButton(tr("Add Device"));
     add->setObjectName(QStringLiteral("emptyAddDeviceButton"));
-    add->setEnabled(false);
     connect(add, &QPushButton::clicked, this, &DeviceTab::addDeviceRequested);
     m_siteHint->setObjectName(QStringLiteral("siteHintLabel"));
     return makePage("emptyPage", {picture(QStringLiteral(":/images/empty_devices.svg")),
                                   centredLabel(tr("No Device"), "heading"), m_siteHint, add});
+}
+
+QWidget *DeviceTab::makeNoMatchPage() {
+    auto *clear = new QPushButton(tr("Clear filter"));
+    clear->setObjectName(QStringLiteral("clearFilterButton"));
+    connect(clear, &QPushButton::clicked, this, &DeviceTab::clearFilterRequested);
+    return makePage("noMatchPage",
+                    {picture(QStringLiteral(":/images/empty_search.svg")),
+                     centredLabel(tr("No device matches"), "heading"),
+                     centredLabel(tr("Search and status chips leave no device of this tab."), "quiet"),
+                     clear});
 }
 
 QWidget *DeviceTab::makeLoadingPage() {

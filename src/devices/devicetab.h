@@ -24,20 +24,23 @@ public:
 
     MainConsoleTable *table() const { return m_table; }
 
-    /// Shows the right page for what is known of the devices.
+    /// Shows the right page for what is known of the devices; isSite: a site is shown, not the overview.
     void showContent(Content content, bool isSite);
 
 signals:
     void addDeviceRequested();
+    void clearFilterRequested();
 
 private:
     QWidget *makeEmptyPage();
+    QWidget *makeNoMatchPage();
     QWidget *makeLoadingPage();
     QWidget *makeFailedPage();
 
     MainConsoleTable *m_table;
     QLabel *m_siteHint;
     QWidget *m_emptyPage;
+    QWidget *m_noMatchPage;
     QWidget *m_loadingPage;
     QWidget *m_failedPage;
 };

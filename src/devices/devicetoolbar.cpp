@@ -107,9 +107,18 @@ void addSubstitute(QMenu *menu, QToolButton *button) {
     menu->actions().constLast()->setEnabled(button->isEnabled());
 }
 
-void addEntries(QMenu *menu, std::initializer_list<QString> entries) {
-    for (const QString &entry : entries)
-        menu->addAction(entry)->setEnabled(false);
+struct Entry {
+    const char *name;
+    QString text;
+};
+
+/// Entries are enabled by whoever carries them out, like buttons.
+void addEntries(QMenu *menu, std::initializer_list<Entry> entries) {
+    for (const Entry &entry : entries) {
+        QAction *action = menu->addAction(entry.text);
+        action->setObjectName(QLatin1String(entry.name));
+        action->setEnabled(false);
+    }
 }
 
 } // namespace
@@ -138,20 +147,26 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
     layout->addStretch();
 
     auto *exportMenu = new PopupMenu(this);
-    addEntries(exportMenu, {tr("Export Device List"), tr("Export Debug Info")});
+    addEntries(exportMenu, {{"exportDeviceListAction", tr("Export Device List")},
+                            {"exportDebugInfoAction", tr("Export Debug Info")}});
     button(QStringLiteral("exportButton"))->setMenu(exportMenu);
     auto *uploadMenu = new PopupMenu(this);
-    addEntries(uploadMenu, {tr("Upload Firmware"), tr("Upload Package"), tr("Upload Configuration File")});
+    addEntries(uploadMenu, {{"uploadFirmwareAction", tr("Upload Firmware")},
+                            {"uploadPackageAction", tr("Upload Package")},
+                            {"uploadConfigurationAction", tr("Upload Configuration File")}});
     auto *certificateMenu = new PopupMenu(uploadMenu);
     certificateMenu->setTitle(tr("Upload Certificate"));
-    addEntries(certificateMenu, {tr("HTTPS"), tr("IEEE 802.1x")});
+    addEntries(certificateMenu,
+               {{"uploadHttpsAction", tr("HTTPS")}, {"uploadIeeeAction", tr("IEEE 802.1x")}});
     uploadMenu->addMenu(certificateMenu);
     button(QStringLiteral("uploadButton"))->setMenu(uploadMenu);
     auto *configurationMenu = new PopupMenu(this);
-    addEntries(configurationMenu, {tr("Create Template"), tr("Import Template")});
+    addEntries(configurationMenu, {{"createTemplateAction", tr("Create Template")},
+                                   {"importTemplateAction", tr("Import Template")}});
     button(QStringLiteral("setConfigurationButton"))->setMenu(configurationMenu);
     auto *restoreMenu = new PopupMenu(this);
-    addEntries(restoreMenu, {tr("Restore to Restore Point"), tr("Restore to Factory Default")});
+    addEntries(restoreMenu, {{"restorePointAction", tr("Restore to Restore Point")},
+                             {"factoryDefaultAction", tr("Restore to Factory Default")}});
     button(QStringLiteral("restoreButton"))->setMenu(restoreMenu);
 }
 
@@ -174,6 +189,22 @@ void DeviceToolBar::buildMoreButton() {
     });
     m_more->setMenu(menu);
     layout()->addWidget(m_more);
+}
+
+void DeviceToolBar::addOperations(QMenu *menu) const {
+    for (QToolButton *each : m_buttons) {
+        const QList<QAction *> entries = each->menu() ? each->menu()->actions() : QList<QAction *>();
+        const bool usable =
+            entries.isEmpty() || std::any_of(entries.begin(), entries.end(), [](const QAction *entry) {
+                return entry->isEnabled() && !entry->menu();
+            });
+        if (each->isEnabled() && usable)
+            addSubstitute(menu, each);
+    }
+}
+
+QAction *DeviceToolBar::entry(const QString &objectName) const {
+    return findChild<QAction *>(objectName);
 }
 
 QSize DeviceToolBar::minimumSizeHint() const {

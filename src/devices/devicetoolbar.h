@@ -4,6 +4,8 @@
 
 #include <vector>
 
+class QAction;
+class QMenu;
 class QToolButton;
 
 /// The tool bar of the console: one button an operation, four of them with a menu.
@@ -17,6 +19,11 @@ public:
     explicit DeviceToolBar(QWidget *parent = nullptr);
 
     QToolButton *button(const QString &objectName) const;
+
+    /// Adds the operations that can be begun now to a menu.
+    void addOperations(QMenu *menu) const;
+    /// The entry of a button's menu that carries the name.
+    QAction *entry(const QString &objectName) const;
 
     QSize minimumSizeHint() const override;
 

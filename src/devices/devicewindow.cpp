@@ -1,7 +1,7 @@
 #include "devicewindow.h"
 
 #include "clientstore.h"
-#include "confirmdialog.h"
+#include "consolecorner.h"
 #include "countedtabwidget.h"
 #include "deviceactions.h"
 #include "devicefooter.h"
@@ -9,20 +9,31 @@
 #include "devicemonitor.h"
 #include "devicetab.h"
 #include "devicetoolbar.h"
+#include "filedialogs.h"
 #include "icons.h"
+#include "mainconsolemenu.h"
 #include "mainconsoletable.h"
+#include "messagelog.h"
+#include "popupmenu.h"
 #include "reconnectingdialog.h"
 #include "refreshdevicedialog.h"
 #include "servicerequest.h"
 #include "sitetree.h"
+#include "storewriter.h"
 #include "taskinfopool.h"
 #include "transientmessage.h"
 
+#include <QClipboard>
 #include <QComboBox>
 #include <QDebug>
+#include <QFileInfo>
+#include <QGuiApplication>
 #include <QHBoxLayout>
+#include <QHeaderView>
 #include <QLabel>
+#include <QLineEdit>
 #include <QPushButton>
+#include <QShortcut>
 #include <QSplitter>
 #include <QTimer>
 #include <QToolButton>
@@ -58,8 +69,8 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_siteTree(new SiteTree(m_splitter)),
       m_actions(new DeviceActions(this)),
       m_toolBar(new DeviceToolBar(m_console)),
-      m_remoteCombo(new QComboBox(m_console)),
       m_tabs(new CountedTabWidget(m_console)),
+      m_corner(new ConsoleCorner(m_tabs)),
       m_footer(new DeviceFooter(m_console)),
       m_selectionLogDelay(new QTimer(this)) {
     qDebug("DeviceWindow constructor");
@@ -90,15 +101,9 @@ void DeviceWindow::buildTabs() {
         m_tabs->addTab(tab, tabs[i].first);
         m_deviceTabs.push_back(tab);
     }
-    m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
-    m_remoteCombo->setAccessibleName(tr("Remote connection"));
-    m_remoteCombo->setPlaceholderText(tr("Remote connection"));
-    m_remoteCombo->setMinimumWidth(200);
-    auto *corner = new QWidget;
-    auto *cornerLayout = new QHBoxLayout(corner);
-    cornerLayout->setContentsMargins(0, 0, 0, 4);
-    cornerLayout->addWidget(m_remoteCombo);
-    m_tabs->setCornerWidget(corner);
+    m_tabs->setCornerWidget(m_corner);
+    for (const DeviceTab *tab : m_deviceTabs)
+        tab->table()->keepColumns();
 }
 
 QWidget *DeviceWindow::buildNoticeBar() {
@@ -149,30 +154,80 @@ void DeviceWindow::connectParts() {
             &DeviceWindow::onTaskListUpdated);
     connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
+    connect(m_siteTree, &SiteTree::sitesEdited, this,
+            [this] { m_noticeBar->setVisible(m_siteTree->edits().isDirty()); });
+    connect(m_siteTree, &SiteTree::editsDropped, this, [this](const QStringList &reasons) {
+        emit onShowAnimatedMsgDlg(reasons.join(QLatin1Char('\n')));
+    });
+    connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_siteTree, &SiteTree::devicesDropped, this, &DeviceWindow::onDevicesDropped);
+    connect(m_noticeBar->findChild<QPushButton *>(), &QPushButton::clicked, this, &DeviceWindow::commitSites);
     connect(m_tabs, &CountedTabWidget::currentChanged, this, [this] {
         showStatusCounts();
         onSelectionChanged();
     });
     for (const DeviceTab *tab : m_deviceTabs)
-        connect(tab->table(), &MainConsoleTable::selectedDevicesChanged, this,
-                &DeviceWindow::onSelectionChanged);
+        connectTable(tab);
+    connect(m_corner->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
+    connect(m_corner->columnsButton(), &QToolButton::clicked, this, [this] {
+        const QWidget *button = m_corner->columnsButton();
+        showColumnMenu(button->mapToGlobal(QPoint(0, button->height())));
+    });
+    connect(m_footer, &DeviceFooter::statusFilterChanged, this, &DeviceWindow::applyStatusFilter);
+    connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
+    connect(m_actions, &DeviceActions::devicesDeleted, this, &DeviceWindow::onDevicesDeleted);
     connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(m_selected); });
     connect(this, &DeviceWindow::onShowAnimatedMsgDlg, this, &DeviceWindow::showDefAnimateMsgDlg);
-    connect(m_remoteCombo, &QComboBox::activated, this, [this](int index) {
-        const QString id = m_remoteCombo->itemData(index).toString();
-        m_remoteCombo->setCurrentIndex(-1);
+    QComboBox *servers = m_corner->remoteCombo();
+    connect(servers, &QComboBox::activated, this, [this, servers](int index) {
+        const QString id = servers->itemData(index).toString();
+        servers->setCurrentIndex(-1);
         emit remoteServerChosen(id);
     });
     QToolButton *refresh = m_toolBar->button(QStringLiteral("refreshButton"));
     connect(refresh, &QToolButton::clicked, this, &DeviceWindow::openRefreshDialog);
     connect(m_toolBar->button(QStringLiteral("restartButton")), &QToolButton::clicked, this,
             &DeviceWindow::on_restartButton_clicked);
+    connect(m_toolBar->button(QStringLiteral("deleteButton")), &QToolButton::clicked, this,
+            &DeviceWindow::on_deleteButton_clicked);
+    connect(m_toolBar->entry(QStringLiteral("exportDeviceListAction")), &QAction::triggered, this,
+            &DeviceWindow::exportDeviceList);
+    addShortcuts();
+}
+
+void DeviceWindow::connectTable(const DeviceTab *tab) {
+    const MainConsoleTable *table = tab->table();
+    connect(table, &MainConsoleTable::selectedDevicesChanged, this, &DeviceWindow::onSelectionChanged);
+    connect(table, &MainConsoleTable::deleteRequested, this, &DeviceWindow::on_deleteButton_clicked);
+    connect(table, &MainConsoleTable::rowMenuRequested, this, &DeviceWindow::showRowMenu);
+    connect(table, &MainConsoleTable::columnMenuRequested, this, &DeviceWindow::showColumnMenu);
+    connect(tab, &DeviceTab::clearFilterRequested, this, &DeviceWindow::clearFilter);
+}
+
+void DeviceWindow::addShortcuts() {
+    const auto add = [this](const QKeySequence &keys, QWidget *where, auto slot) {
+        auto *shortcut = new QShortcut(keys, where);
+        shortcut->setContext(Qt::WidgetWithChildrenShortcut);
+        connect(shortcut, &QShortcut::activated, this, slot);
+    };
+    add(QKeySequence::Find, this, [this] {
+        m_corner->search()->setFocus();
+        m_corner->search()->selectAll();
+    });
+    add(Qt::Key_F5, this, [this] { m_toolBar->button(QStringLiteral("refreshButton"))->click(); });
+    for (const DeviceTab *tab : m_deviceTabs)
+        add(QKeySequence::Copy, tab->table(), &DeviceWindow::copySelection);
 }
 
 void DeviceWindow::startWork() {
     loadRemoteServers();
     m_online = false;
     m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(true);
+    for (const char *name : {"exportButton", "addDeviceButton"})
+        m_toolBar->button(QLatin1String(name))->setEnabled(true);
+    m_toolBar->entry(QStringLiteral("exportDeviceListAction"))->setEnabled(true);
     m_siteTree->setFocus();
     reload();
     m_monitor->start();
@@ -180,7 +235,9 @@ void DeviceWindow::startWork() {
 
 void DeviceWindow::stopWork() {
     m_monitor->stop();
-    m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(false);
+    for (const char *name : {"refreshButton", "exportButton", "addDeviceButton"})
+        m_toolBar->button(QLatin1String(name))->setEnabled(false);
+    clearFilter();
     if (m_reconnecting)
         m_reconnecting->close();
     if (m_refreshing)
@@ -190,7 +247,8 @@ void DeviceWindow::stopWork() {
     m_lastReadFailed = false;
     m_online = false;
     m_inventory.replace(std::make_shared<DeviceSnapshot>(), {});
-    m_siteTree->setSites({});
+    m_siteTree->forgetSites();
+    m_noticeBar->hide();
     for (const DeviceTab *tab : m_deviceTabs)
         tab->table()->refill();
     showCounts();
@@ -199,14 +257,14 @@ void DeviceWindow::stopWork() {
 }
 
 void DeviceWindow::loadRemoteServers() {
-    m_remoteCombo->clear();
+    QComboBox *combo = m_corner->remoteCombo();
+    combo->clear();
     JSON servers;
     CClientStore::instance().loadServerList(servers);
     for (const JSON &server : servers)
-        m_remoteCombo->addItem(QString::fromStdString(server.value("svrname", std::string())),
-                               QString::fromStdString(server.value("id", std::string())));
-    m_remoteCombo->setCurrentIndex(-1);
-    m_remoteCombo->setEnabled(m_remoteCombo->count() > 0);
+        combo->addItem(stringMember(server, "svrname"), stringMember(server, "id"));
+    combo->setCurrentIndex(-1);
+    combo->setEnabled(combo->count() > 0);
 }
 
 void DeviceWindow::reload() {
@@ -260,14 +318,112 @@ void DeviceWindow::on_restartButton_clicked() {
     QStringList ids;
     for (const DeviceRecordPtr &device : m_selected)
         ids += device->id;
-    auto *confirm =
-        new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this, static_cast<int>(ids.size()));
-    confirm->setAttribute(Qt::WA_DeleteOnClose);
-    connect(confirm, &QDialog::accepted, this, [this, ids] {
+    ask(ConfirmDialog::Kind::RestartDevices, [this, ids] {
         qDebug("on_restartButton_clicked accepted");
         m_actions->restart(ids);
     });
+}
+
+void DeviceWindow::on_deleteButton_clicked() {
+    if (m_selected.empty())
+        return;
+    // What was selected when the question was asked, whatever a poll does to the selection meanwhile.
+    const QString site = m_siteTree->currentSite();
+    if (site == Sites::overviewId)
+        ask(ConfirmDialog::Kind::DeleteDevices,
+            [this, devices = m_selected] { m_actions->deleteDevices(devices); });
+    else
+        ask(ConfirmDialog::Kind::RemoveFromSite,
+            [this, devices = m_selected, site] { m_actions->removeFromSite(devices, site); });
+}
+
+void DeviceWindow::ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed) {
+    auto *confirm = new ConfirmDialog(kind, this, static_cast<int>(m_selected.size()));
+    confirm->setAttribute(Qt::WA_DeleteOnClose);
+    connect(confirm, &QDialog::accepted, this, agreed);
     confirm->open();
+}
+
+/// The service needs a moment to let devices go; the next poll comes at once after it.
+void DeviceWindow::onDevicesDeleted() {
+    const auto read = [snapshot = m_inventory.snapshot(),
+                       codes = m_inventory.statuses()](ServiceSession &session) {
+        return InventoryReader::readStatus(session, snapshot, codes);
+    };
+    ServiceRequest::post(
+        NetJob::createRunner("reading the states after a removal"), this, read,
+        [this](const std::optional<DeviceStatusUpdate> &update) {
+            if (update)
+                onUpdateDeviceStatus(*update);
+        },
+        [this](JobEnd) { m_monitor->forceRefresh(); }, [] { std::this_thread::sleep_for(refreshDelay); });
+}
+
+void DeviceWindow::exportDeviceList() {
+    const QString folder = CLocalStore::instance().defaultFilePath();
+    const QString name = tr("Device List") + QStringLiteral(".csv");
+    FileDialogs::askSavePath(
+        this, tr("Save as"), folder.isEmpty() ? name : folder + QLatin1Char('/') + name,
+        tr("CSV files (*.csv)"), QStringLiteral("csv"), [this](const QString &path) {
+            StoreWriter::post(
+                [path] { CLocalStore::instance().setDefaultFilePath(QFileInfo(path).absolutePath()); });
+            m_actions->exportList(path, m_inventory.snapshot(), currentTab()->table()->shownDevices());
+        });
+}
+
+QHash<QString, QString> DeviceWindow::siteNames() const {
+    QHash<QString, QString> names;
+    for (const Sites::Site &site : m_siteTree->edits().merged())
+        names.insert(site.id, site.name);
+    return names;
+}
+
+void DeviceWindow::applySearch(const QString &text) {
+    const DeviceSearch search(text, siteNames());
+    for (const DeviceTab *tab : m_deviceTabs)
+        tab->table()->setSearch(search);
+    onFilterChanged();
+}
+
+void DeviceWindow::applyStatusFilter(std::optional<DeviceStatusGroup> status) {
+    for (const DeviceTab *tab : m_deviceTabs)
+        tab->table()->setStatusFilter(status);
+    onFilterChanged();
+}
+
+void DeviceWindow::clearFilter() {
+    m_corner->search()->clear();
+    m_footer->clearStatusFilter();
+}
+
+void DeviceWindow::onFilterChanged() {
+    showCounts();
+    showContent();
+    onSelectionChanged();
+}
+
+void DeviceWindow::showRowMenu(const QPoint &position) {
+    auto *menu = new PopupMenu(this);
+    menu->setAttribute(Qt::WA_DeleteOnClose);
+    const MainConsoleTable *table = currentTab()->table();
+    const QString cell = table->currentIndex().data(Qt::DisplayRole).toString().simplified();
+    menu->addAction(tr("Copy cell"), this, [cell] { QGuiApplication::clipboard()->setText(cell); });
+    menu->addAction(tr("Copy rows"), this, &DeviceWindow::copySelection);
+    menu->addSeparator();
+    m_toolBar->addOperations(menu);
+    menu->popup(position);
+}
+
+void DeviceWindow::showColumnMenu(const QPoint &position) {
+    MainConsoleTable *table = currentTab()->table();
+    auto *menu = new MainConsoleMenu(table->horizontalHeader(), this);
+    menu->setAttribute(Qt::WA_DeleteOnClose);
+    connect(menu, &MainConsoleMenu::resetRequested, table, &MainConsoleTable::resetColumns);
+    menu->popup(position);
+}
+
+void DeviceWindow::copySelection() {
+    QGuiApplication::clipboard()->setText(currentTab()->table()->selectionText());
 }
 
 void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
@@ -299,7 +455,8 @@ void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
         return;
     for (const DeviceTab *tab : m_deviceTabs)
         tab->table()->refreshStatus();
-    showStatusCounts();
+    showCounts();
+    showContent();
 }
 
 void DeviceWindow::onServerAnswered() {
@@ -371,6 +528,59 @@ void DeviceWindow::onRefreshDone() {
     reload();
 }
 
+bool DeviceWindow::hasPendingEdits() const {
+    return m_siteTree->edits().isDirty();
+}
+
+void DeviceWindow::commitSites() {
+    if (m_siteTree->edits().isCommitting() || !hasPendingEdits())
+        return;
+    const LoginInfo login = CLocalStore::instance().loginInfo();
+    qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
+           static_cast<int>(login.port), qUtf8Printable(login.account),
+           MessageLog::secret(login.token).constData());
+    const auto send = [records = m_siteTree->beginCommit()](ServiceSession &session) {
+        const unsigned result =
+            session.call([&](CApiClient &client) { return client.commitSites(records, "all"); });
+        if (result == ApiOk)
+            qDebug("commit site info: %s", dumpJson(records).c_str());
+        else
+            qWarning("HTTP API(commitSites) failed!");
+        return result;
+    };
+    const bool started = ServiceRequest::post(
+        NetJob::createRunner("committing sites"), this, send,
+        [this](unsigned result) {
+            m_siteTree->endCommit(result == ApiOk);
+            if (result != ApiOk)
+                emit onShowAnimatedMsgDlg(
+                    tr("The site changes could not be sent: %1. Press Apply to try again.")
+                        .arg(apiResultText(result)));
+            reload();
+        },
+        [this](JobEnd end) {
+            if (end == JobEnd::Delivered || end == JobEnd::SessionGone)
+                return;
+            m_siteTree->endCommit(false);
+            emit onShowAnimatedMsgDlg(tr("The site changes could not be sent. Press Apply to try again."));
+        });
+    if (!started)
+        m_siteTree->endCommit(false);
+}
+
+void DeviceWindow::onDevicesDropped(const QString &siteId, const QStringList &deviceIds,
+                                    Qt::DropAction action, const QString &sourceSiteId) {
+    std::vector<DeviceRecordPtr> devices;
+    const DeviceSnapshot &snapshot = *m_inventory.snapshot();
+    for (const QString &id : deviceIds) {
+        if (const int place = snapshot.indexOf(id); place >= 0)
+            devices.push_back(snapshot.at(place));
+    }
+    if (devices.empty())
+        return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
+    m_actions->putIntoSite(devices, {siteId, sourceSiteId, action == Qt::MoveAction});
+}
+
 void DeviceWindow::onSiteChanged(const QString &siteId) {
     for (const DeviceTab *tab : m_deviceTabs)
         tab->table()->setSite(siteId);
@@ -403,8 +613,9 @@ void DeviceWindow::onSelectionChanged() {
         m_selected.push_back(m_inventory.snapshot()->at(device));
     qDebug("device selected: %d", static_cast<int>(m_selected.size()));
     m_selectionLogDelay->start();
-    m_toolBar->button(QStringLiteral("restartButton"))->setEnabled(!m_selected.empty());
-    m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount());
+    for (const char *name : {"restartButton", "deleteButton"})
+        m_toolBar->button(QLatin1String(name))->setEnabled(!m_selected.empty());
+    m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount(), table->unfilteredCount());
 }
 
 void DeviceWindow::showCounts() {
@@ -414,7 +625,7 @@ void DeviceWindow::showCounts() {
 }
 
 void DeviceWindow::showStatusCounts() {
-    m_footer->setStatuses(m_inventory, currentTab()->table()->shownDevices());
+    m_footer->setStatuses(m_inventory, currentTab()->table()->matchingDevices());
 }
 
 void DeviceWindow::showContent() {

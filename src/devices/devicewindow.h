@@ -1,5 +1,6 @@
 #pragma once
 
+#include "confirmdialog.h"
 #include "deviceinventory.h"
 #include "inventoryreader.h"
 #include "nettask.h"
@@ -8,8 +9,10 @@
 #include <QPointer>
 #include <QWidget>
 
+#include <functional>
 #include <memory>
 
+class ConsoleCorner;
 class CountedTabWidget;
 class DeviceActions;
 class DeviceFooter;
@@ -17,7 +20,6 @@ class DeviceMonitor;
 class DeviceTab;
 class DeviceToolBar;
 class MainConsoleTable;
-class QComboBox;
 class QFrame;
 class QSplitter;
 class QTimer;
@@ -38,10 +40,15 @@ public:
     /// Ends that and forgets everything that was shown.
     void stopWork();
 
+    /// True while there are changes of sites that were not sent.
+    bool hasPendingEdits() const;
+
     /// The devices that operations work on, in the order of their rows.
     const std::vector<DeviceRecordPtr> &selectedDevices() const { return m_selected; }
 
 public slots:
+    /// Sends the changes of sites.
+    void commitSites();
     /// Reads sites and devices again.
     void reload();
     /// Selects the device with the id, or else the one with the address, and brings it into view.
@@ -63,10 +70,24 @@ private:
     QWidget *buildNoticeBar();
     void buildTabs();
     void connectParts();
+    void connectTable(const DeviceTab *tab);
+    void addShortcuts();
 
     void onTick();
     void onTaskListUpdated();
     void on_restartButton_clicked();
+    void on_deleteButton_clicked();
+    void exportDeviceList();
+    void onDevicesDeleted();
+    void ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed);
+
+    void applySearch(const QString &text);
+    void applyStatusFilter(std::optional<DeviceStatusGroup> status);
+    void clearFilter();
+    void onFilterChanged();
+    void showRowMenu(const QPoint &position);
+    void showColumnMenu(const QPoint &position);
+    void copySelection();
 
     void onReading(const InventoryReader::Reading &reading);
     void onUpdateDeviceStatus(const DeviceStatusUpdate &update);
@@ -74,6 +95,9 @@ private:
     void onServerLost();
     void onSelectionChanged();
     void onSiteChanged(const QString &siteId);
+    void onDevicesDropped(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
+                          const QString &sourceSiteId);
+    QHash<QString, QString> siteNames() const;
 
     void openRefreshDialog();
     void onRefreshDevice();
@@ -96,8 +120,8 @@ private:
     DeviceActions *m_actions;
     DeviceToolBar *m_toolBar;
     QFrame *m_noticeBar = nullptr;
-    QComboBox *m_remoteCombo;
     CountedTabWidget *m_tabs;
+    ConsoleCorner *m_corner;
     std::vector<DeviceTab *> m_deviceTabs;
     DeviceFooter *m_footer;
     QTimer *m_selectionLogDelay;

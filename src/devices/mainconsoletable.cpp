@@ -1,11 +1,18 @@
 #include "mainconsoletable.h"
 
+#include "icons.h"
+#include "localstore.h"
 #include "sitelist.h"
+#include "sitemembership.h"
 #include "sortableiptablewidgetitem.h"
+#include "storewriter.h"
 #include "theme.h"
 
+#include <QDrag>
 #include <QElapsedTimer>
 #include <QHeaderView>
+#include <QKeyEvent>
+#include <QMimeData>
 #include <QScrollBar>
 #include <QSignalBlocker>
 #include <QTimerEvent>
@@ -17,6 +24,7 @@ namespace {
 /// How long the user-interface thread may make items at a time.
 constexpr int fillBudgetMs = 6;
 constexpr int rowsBetweenClockLooks = 64;
+constexpr int saveDelayMs = 1000;
 constexpr int widthSample = 200;
 constexpr int widestColumn = 260;
 constexpr int cellMargins = 20;
@@ -62,7 +70,7 @@ struct MainConsoleTable::Place {
 };
 
 MainConsoleTable::MainConsoleTable(DeviceClass deviceClass, QWidget *parent)
-    : CustomTable(parent), m_filter{deviceClass, Sites::overviewId} {
+    : CustomTable(parent), m_filter{deviceClass, Sites::overviewId, {}, {}} {
     setColumnCount(deviceColumnCount);
     QStringList titles;
     for (int column = 0; column < deviceColumnCount; ++column)
@@ -71,6 +79,16 @@ MainConsoleTable::MainConsoleTable(DeviceClass deviceClass, QWidget *parent)
     horizontalHeader()->setSortIndicatorShown(false);
     horizontalHeader()->setSectionsMovable(true);
     connect(horizontalHeader(), &QHeaderView::sectionClicked, this, &MainConsoleTable::sortBy);
+    setDragEnabled(true);
+    setContextMenuPolicy(Qt::CustomContextMenu);
+    connect(this, &QWidget::customContextMenuRequested, this, [this](const QPoint &position) {
+        if (rowAt(position.y()) >= 0)
+            emit rowMenuRequested(viewport()->mapToGlobal(position));
+    });
+    horizontalHeader()->setContextMenuPolicy(Qt::CustomContextMenu);
+    connect(horizontalHeader(), &QWidget::customContextMenuRequested, this, [this](const QPoint &position) {
+        emit columnMenuRequested(horizontalHeader()->mapToGlobal(position));
+    });
     connect(this, &QTableWidget::itemSelectionChanged, this, &MainConsoleTable::selectedDevicesChanged);
 }
 
@@ -84,6 +102,29 @@ void MainConsoleTable::setSite(const QString &siteId) {
         return;
     m_filter.siteId = siteId;
     refill();
+}
+
+void MainConsoleTable::setSearch(const DeviceSearch &search) {
+    m_filter.search = search;
+    refill();
+}
+
+void MainConsoleTable::setStatusFilter(std::optional<DeviceStatusGroup> status) {
+    if (status == m_filter.status)
+        return;
+    m_filter.status = status;
+    refill();
+}
+
+std::vector<int> MainConsoleTable::matchingDevices() const {
+    return m_filter.status && m_inventory ? DeviceOrder::matching(*m_inventory, m_filter) : m_order;
+}
+
+int MainConsoleTable::unfilteredCount() const {
+    if (!m_inventory || !isFiltered())
+        return static_cast<int>(m_order.size());
+    return static_cast<int>(
+        DeviceOrder::matching(*m_inventory, {m_filter.deviceClass, m_filter.siteId, {}, {}}).size());
 }
 
 void MainConsoleTable::refill() {
@@ -106,7 +147,7 @@ void MainConsoleTable::refill() {
 }
 
 void MainConsoleTable::refreshStatus() {
-    if (m_sort.column == static_cast<int>(DeviceColumn::Status))
+    if (m_sort.column == static_cast<int>(DeviceColumn::Status) || m_filter.status)
         refill();
     else
         viewport()->update();
@@ -267,7 +308,46 @@ void MainConsoleTable::fillItems(int budgetMs) {
         m_fillTimer.stop();
 }
 
+void MainConsoleTable::keepColumns() {
+    QHeaderView *header = horizontalHeader();
+    const QByteArray kept = QByteArray::fromBase64(CLocalStore::instance().layout(objectName()).toLatin1());
+    if (!kept.isEmpty() && header->restoreState(kept)) {
+        m_columnsFitted = true;
+        if (header->isSortIndicatorShown())
+            m_sort = {header->sortIndicatorSection(), header->sortIndicatorOrder()};
+        refill();
+    }
+    const auto later = [this] { m_saveTimer.start(saveDelayMs, this); };
+    connect(header, &QHeaderView::sectionMoved, this, later);
+    connect(header, &QHeaderView::sectionResized, this, later);
+    connect(header, &QHeaderView::sortIndicatorChanged, this, later);
+}
+
+void MainConsoleTable::saveColumns() const {
+    StoreWriter::post([name = objectName(), state = horizontalHeader()->saveState().toBase64()] {
+        CLocalStore::instance().setLayout(name, QString::fromLatin1(state));
+    });
+}
+
+void MainConsoleTable::resetColumns() {
+    QHeaderView *header = horizontalHeader();
+    for (int column = 0; column < deviceColumnCount; ++column) {
+        header->setSectionHidden(column, false);
+        header->moveSection(header->visualIndex(column), column);
+    }
+    header->setSortIndicator(0, Qt::AscendingOrder);
+    header->setSortIndicatorShown(false);
+    m_sort = {};
+    m_columnsFitted = false;
+    refill();
+}
+
 void MainConsoleTable::timerEvent(QTimerEvent *event) {
+    if (event->timerId() == m_saveTimer.timerId()) {
+        m_saveTimer.stop();
+        saveColumns();
+        return;
+    }
     if (event->timerId() != m_fillTimer.timerId()) {
         CustomTable::timerEvent(event);
         return;
@@ -277,6 +357,51 @@ void MainConsoleTable::timerEvent(QTimerEvent *event) {
     fillItems(fillBudgetMs);
     if (seen)
         viewport()->update();
+}
+
+void MainConsoleTable::keyPressEvent(QKeyEvent *event) {
+    if (event->key() == Qt::Key_Delete)
+        emit deleteRequested();
+    else
+        CustomTable::keyPressEvent(event);
+}
+
+void MainConsoleTable::startDrag(Qt::DropActions) {
+    QStringList ids;
+    for (const int device : selectedDevices())
+        ids += m_shown->at(device)->id;
+    if (ids.isEmpty())
+        return;
+    auto *drag = new QDrag(this);
+    auto *dragged = new QMimeData;
+    dragged->setData(SiteMembership::mimeType, SiteMembership::encode({m_filter.siteId, ids}));
+    drag->setMimeData(dragged);
+    const QPixmap hand =
+        Icons::pixmap(QStringLiteral(":/images/icon_closed_hand_cursor.svg"), {24, 24}, devicePixelRatioF());
+    drag->setDragCursor(hand, Qt::CopyAction);
+    drag->setDragCursor(hand, Qt::MoveAction);
+    drag->exec(Qt::CopyAction | Qt::MoveAction, Qt::CopyAction);
+}
+
+QStringList MainConsoleTable::visibleTexts(int row) const {
+    QStringList texts;
+    const QHeaderView *header = horizontalHeader();
+    for (int visual = 0; visual < header->count(); ++visual) {
+        const int column = header->logicalIndex(visual);
+        if (header->isSectionHidden(column))
+            continue;
+        const QString text = row < 0 ? horizontalHeaderItem(column)->text()
+                                     : cellData(row, column, Qt::DisplayRole).toString();
+        texts += text.simplified();
+    }
+    return texts;
+}
+
+QString MainConsoleTable::selectionText() const {
+    QStringList lines{visibleTexts(-1).join(QLatin1Char('\t'))};
+    for (const int row : selectedRows())
+        lines += visibleTexts(row).join(QLatin1Char('\t'));
+    return lines.join(QLatin1Char('\n'));
 }
 
 QVariant MainConsoleTable::cellData(int row, int column, int role) const {
@@ -308,7 +433,7 @@ bool MainConsoleTable::selectDevice(int place) {
     return true;
 }
 
-std::vector<int> MainConsoleTable::selectedDevices() const {
+std::vector<int> MainConsoleTable::selectedRows() const {
     std::vector<int> rows;
     for (const QItemSelectionRange &range : selectionModel()->selection()) {
         for (int row = range.top(); row <= range.bottom(); ++row)
@@ -316,6 +441,11 @@ std::vector<int> MainConsoleTable::selectedDevices() const {
     }
     std::sort(rows.begin(), rows.end());
     rows.erase(std::unique(rows.begin(), rows.end()), rows.end());
+    return rows;
+}
+
+std::vector<int> MainConsoleTable::selectedDevices() const {
+    const std::vector<int> rows = selectedRows();
     std::vector<int> devices;
     devices.reserve(rows.size());
     for (const int row : rows) {

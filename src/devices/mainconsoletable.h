@@ -25,12 +25,21 @@ public:
     /// Shows the devices of a site, or all for the overview's id.
     void setSite(const QString &siteId);
 
+    /// Shows what the search finds, and of that the devices in a group of states; nothing for all states.
+    void setSearch(const DeviceSearch &search);
+    void setStatusFilter(std::optional<DeviceStatusGroup> status);
+    bool isFiltered() const { return !m_filter.search.isEmpty() || m_filter.status; }
+
     /// To be called after the inventory's devices have changed.
     void refill();
     /// To be called after states have changed: paints again, and sorts again when the states decide the
     /// order.
     void refreshStatus();
 
+    /// The devices that the site and the search leave, whatever their state; places in the inventory.
+    std::vector<int> matchingDevices() const;
+    /// How many devices of the table's class the site has.
+    int unfilteredCount() const;
     /// The devices of all rows, as places in the inventory, in the order of the rows.
     const std::vector<int> &shownDevices() const { return m_order; }
     /// The devices of the selected rows, as places in the inventory, in the order of the rows.
@@ -39,15 +48,28 @@ public:
     /// Selects a device alone and brings it into view. False when the table does not show it.
     bool selectDevice(int place);
 
+    /// The selected rows as text: tabs between the visible columns, whose titles come first.
+    QString selectionText() const;
+
+    /// Makes columns as they were kept under the table's object name, and keeps changes from now on.
+    void keepColumns();
+    void resetColumns();
+
     /// What an item of the table answers.
     QVariant cellData(int row, int column, int role) const;
 
 signals:
     /// Other devices are selected than before.
     void selectedDevicesChanged();
+    void deleteRequested();
+    /// A menu was asked for, of the selected rows or of the columns; global position.
+    void rowMenuRequested(const QPoint &position);
+    void columnMenuRequested(const QPoint &position);
 
 protected:
     void timerEvent(QTimerEvent *event) override;
+    void keyPressEvent(QKeyEvent *event) override;
+    void startDrag(Qt::DropActions actions) override;
 
 private:
     struct Place; // what has to survive a new order
@@ -61,6 +83,9 @@ private:
     void sortBy(int column);
     void fillItems(int budgetMs);
     void fitColumns();
+    void saveColumns() const;
+    QStringList visibleTexts(int row) const;
+    std::vector<int> selectedRows() const;
 
     const DeviceInventory *m_inventory = nullptr;
     DeviceSnapshotPtr m_shown; ///< the reading whose places m_order holds
@@ -69,5 +94,6 @@ private:
     std::vector<int> m_order;
     int m_filledRows = 0;
     QBasicTimer m_fillTimer;
+    QBasicTimer m_saveTimer;
     bool m_columnsFitted = false;
 };

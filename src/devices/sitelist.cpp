@@ -17,7 +17,8 @@ List readRecords(const JSON &records) {
         if (id.isEmpty() || id == rootId || id == overviewId || seen.contains(id))
             continue;
         seen.insert(id);
-        sites.push_back({id, stringMember(record, "parentid"), stringMember(record, "sitename")});
+        sites.push_back({id, stringMember(record, "parentid"), stringMember(record, "sitename"),
+                         QByteArray::fromStdString(dumpJson(record))});
     }
     return sites;
 }
@@ -49,9 +50,10 @@ void appendBelow(const QString &root, const QMultiHash<QString, Site> &byParent,
 } // namespace
 
 List parse(const JSON &records) {
-    if (!records.is_array())
-        return {};
-    List sites = readRecords(records);
+    return records.is_array() ? arranged(readRecords(records)) : List();
+}
+
+List arranged(List sites) {
     QSet<QString> known{rootId};
     for (const Site &site : sites)
         known.insert(site.id);

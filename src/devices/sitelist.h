@@ -2,6 +2,7 @@
 
 #include "json.h"
 
+#include <QByteArray>
 #include <QString>
 
 #include <vector>
@@ -17,6 +18,9 @@ struct Site {
     QString id;
     QString parentId; ///< rootId for a top-level site
     QString name;
+    /// The service's record as JSON text, with the members that this client does not know; empty for a site
+    /// that the service has not seen.
+    QByteArray json = {};
 
     bool operator==(const Site &) const = default;
 };
@@ -26,5 +30,8 @@ using List = std::vector<Site>;
 /// Reads site records, ordered so that parents come first. A record without an id or with one seen before is
 /// left out; a site whose parent is unknown, or that is its own ancestor, becomes a top-level one.
 List parse(const JSON &records);
+
+/// Orders and heals sites in the same way. Brothers keep their order; ids must be unique.
+List arranged(List sites);
 
 } // namespace Sites

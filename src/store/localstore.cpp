@@ -7,6 +7,7 @@
 #include <QDebug>
 
 namespace {
+const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
@@ -74,6 +75,14 @@ void CLocalStore::renewAccess(const QByteArray &rawToken, quint64 generation) {
 QByteArray CLocalStore::access() const {
     const std::lock_guard lock(m_mutex);
     return m_access;
+}
+
+QString CLocalStore::layout(const QString &name) const {
+    return m_store.query(kLayoutPrefix + name);
+}
+
+bool CLocalStore::setLayout(const QString &name, const QString &layout) {
+    return m_store.replace(kLayoutPrefix + name, layout);
 }
 
 QString CLocalStore::defaultFilePath() const {

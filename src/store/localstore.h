@@ -38,6 +38,11 @@ public:
     void renewAccess(const QByteArray &rawToken, quint64 generation);
     QByteArray access() const;
 
+    /// How the user has arranged a part of a window, under a name of the part's own; empty where nothing is
+    /// kept.
+    QString layout(const QString &name) const;
+    bool setLayout(const QString &name, const QString &layout);
+
     QString defaultFilePath() const;
     bool setDefaultFilePath(const QString &folder);
 

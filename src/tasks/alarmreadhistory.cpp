@@ -1,6 +1,7 @@
 #include "alarmreadhistory.h"
 
 #include "clientstore.h"
+#include "storewriter.h"
 
 #include <nlohmann/json.hpp>
 
@@ -38,12 +39,8 @@ void write(const QString &service, const QSet<QString> &read, bool olderRead) {
 
 } // namespace
 
-AlarmReadHistory::AlarmReadHistory() {
-    m_writer.setMaxThreadCount(1);
-}
-
 void AlarmReadHistory::open(const QString &service) {
-    m_writer.waitForDone();
+    StoreWriter::flush();
     m_service = service;
     m_read.clear();
     m_olderRead = false;
@@ -87,6 +84,6 @@ int AlarmReadHistory::unreadCount(const AlarmList &alarms, int total) const {
 }
 
 void AlarmReadHistory::save() {
-    m_writer.start(
+    StoreWriter::post(
         [service = m_service, read = m_read, olderRead = m_olderRead] { write(service, read, olderRead); });
 }

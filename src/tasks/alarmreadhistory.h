@@ -3,14 +3,11 @@
 #include "alarmrecord.h"
 
 #include <QSet>
-#include <QThreadPool>
 
-/// Which alarms of the present service the user has seen, kept from run to run. User-interface thread; the
-/// store is written on a thread of its own.
+/// Which alarms of the present service the user has seen, kept from run to run.
+/// User-interface thread.
 class AlarmReadHistory {
 public:
-    AlarmReadHistory();
-
     /// Turns to a service, known by its address and port, and reads what is kept for it.
     void open(const QString &service);
 
@@ -28,7 +25,6 @@ public:
 private:
     void save();
 
-    QThreadPool m_writer; ///< one thread, so that the latest state is written last
     QString m_service;
     QSet<QString> m_read;
     bool m_olderRead = false; ///< those too that are older than the list reaches

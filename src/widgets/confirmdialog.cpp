@@ -22,6 +22,12 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
                 ConfirmDialog::tr("A task was requested and has not begun yet. It may fail when the session "
                                   "ends now. Are you sure you want to go on?"),
                 ConfirmDialog::tr("End session")};
+    case ConfirmDialog::Kind::UnsavedSites:
+        return {
+            ConfirmDialog::tr("Site Changes"),
+            ConfirmDialog::tr("There are unsaved/unapplied changes of sites, which are lost when the session "
+                              "ends now. Are you sure you want to go on?"),
+            ConfirmDialog::tr("End session")};
     case ConfirmDialog::Kind::CancelTask:
         return {ConfirmDialog::tr("Cancel Task"),
                 ConfirmDialog::tr("Are you sure you want to cancel %n task(s)? Devices that are done already "
@@ -40,11 +46,27 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
             ConfirmDialog::tr("Are you sure you want to delete %n alarm(s)? This action cannot be undone.",
                               nullptr, count),
             ConfirmDialog::tr("Delete")};
+    case ConfirmDialog::Kind::DeleteDevices:
+        return {ConfirmDialog::tr("Delete Device(s) from Device Overview"),
+                ConfirmDialog::tr("Are you sure you want to delete the selected device(s) from the system "
+                                  "permanently? This action cannot be undone."),
+                ConfirmDialog::tr("Delete")};
+    case ConfirmDialog::Kind::RemoveFromSite:
+        return {ConfirmDialog::tr("Delete Device(s) from Site"),
+                ConfirmDialog::tr(
+                    "Are you sure you want to delete the copy of selected device(s) from this site? "
+                    "This action will not affect the list of Device Overview."),
+                ConfirmDialog::tr("Delete")};
     case ConfirmDialog::Kind::RestartDevices:
         return {
             ConfirmDialog::tr("Restart Device"),
             ConfirmDialog::tr("Are you sure you want to restart device? This operation may take some time."),
             ConfirmDialog::tr("Restart")};
+    case ConfirmDialog::Kind::DeleteSite:
+        return {ConfirmDialog::tr("Delete Site"),
+                ConfirmDialog::tr("Are you sure you want to delete the site? This action will also delete the "
+                                  "sub-site(s) and the copy of selected device(s) of each site and sub-site."),
+                ConfirmDialog::tr("Delete")};
     }
     return {};
 }

@@ -1,11 +1,14 @@
 #include "customtable.h"
 
+#include "plaintext.h"
 #include "theme.h"
 
 #include <QHeaderView>
+#include <QHelpEvent>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QStyledItemDelegate>
+#include <QToolTip>
 
 #include <limits>
 #include <vector>
@@ -13,6 +16,7 @@
 namespace {
 
 constexpr int cellPadding = 8;
+constexpr int iconSpace = 12;
 constexpr qsizetype longestShownText = 300;
 
 /// Paints a cell by hand: the style sheet's own way costs several times as much for each one.
@@ -29,7 +33,7 @@ public:
             const QRect place(rest.left(), rest.center().y() - size.height() / 2, size.width(),
                               size.height());
             icon.paint(painter, place);
-            rest.setLeft(rest.left() + 12);
+            rest.setLeft(rest.left() + iconSpace);
         }
         const QString text = index.data(Qt::DisplayRole).toString();
         painter->setFont(option.font);
@@ -112,7 +116,22 @@ bool CustomTable::viewportEvent(QEvent *event) {
         setHoveredRow(rowAt(static_cast<QMouseEvent *>(event)->position().toPoint().y()));
     else if (event->type() == QEvent::Leave)
         setHoveredRow(-1);
+    else if (event->type() == QEvent::ToolTip)
+        return showClippedText(static_cast<QHelpEvent *>(event));
     return QTableWidget::viewportEvent(event);
+}
+
+/// Tells the whole text of a cell that shows a part of it.
+bool CustomTable::showClippedText(QHelpEvent *event) {
+    const QModelIndex index = indexAt(event->pos());
+    const QString text = index.data(Qt::DisplayRole).toString();
+    const bool hasIcon = !index.data(Qt::DecorationRole).value<QIcon>().isNull();
+    const int room = visualRect(index).width() - 2 * cellPadding - (hasIcon ? iconSpace : 0);
+    if (index.isValid() && fontMetrics().horizontalAdvance(text) > room)
+        QToolTip::showText(event->globalPos(), PlainText::toolTip(text), viewport());
+    else
+        QToolTip::hideText();
+    return true;
 }
 
 void CustomTable::setHoveredRow(int row) {

@@ -2,6 +2,8 @@
 
 #include <QTableWidget>
 
+class QHelpEvent;
+
 /// The common look of the console's tables: whole rows selected, fixed row heights, a hovered row, no grid.
 class CustomTable : public QTableWidget {
     Q_OBJECT
@@ -19,6 +21,7 @@ protected:
     void focusOutEvent(QFocusEvent *event) override;
 
 private:
+    bool showClippedText(QHelpEvent *event);
     void setHoveredRow(int row);
     void updateRow(int row);
 

@@ -5,16 +5,24 @@
 #include "isolatedroot.h"
 #include "localstore.h"
 #include "logcapture.h"
+#include "mainconsolemenu.h"
 #include "mainconsoletable.h"
 #include "nettask.h"
 #include "reconnectingdialog.h"
 #include "refreshdevicedialog.h"
 #include "sessionevents.h"
 #include "sitetree.h"
+#include "storewriter.h"
 #include "taskinfopool.h"
 #include "taskrepeats.h"
 
+#include <QAction>
+#include <QCheckBox>
+#include <QClipboard>
+#include <QFileDialog>
+#include <QHeaderView>
 #include <QLabel>
+#include <QLineEdit>
 #include <QPushButton>
 #include <QSignalSpy>
 #include <QStackedWidget>
@@ -247,6 +255,94 @@ private slots:
                  QStringLiteral("Restart Device could not be started: the server refused it."));
     }
 
+    void searchAndChipsFilterTheTables() {
+        workOn(20);
+        auto *search = m_window->findChild<QLineEdit *>("deviceSearchEdit");
+        MainConsoleTable *cameras = table("cameraTable");
+        const int all = cameras->rowCount();
+        const QString ip = cameras->item(2, 3)->text();
+        m_window->setFocus();
+        QTest::keySequence(m_window.get(), QKeySequence::Find);
+        QVERIFY(search->hasFocus());
+        QTest::keyClicks(search, ip + "/32");
+        QCOMPARE(cameras->rowCount(), 1);
+        QCOMPARE(cameras->item(0, 3)->text(), ip);
+        QVERIFY(m_window->findChild<QLabel *>("selectionLabel")->text().contains(QString::number(all)));
+        QTest::keyClicks(search, " nothing");
+        QCOMPARE(shownPage(), QStringLiteral("noMatchPage"));
+        QTest::mouseClick(visibleButton("clearFilterButton"), Qt::LeftButton);
+        QCOMPARE(cameras->rowCount(), all);
+
+        tell("drop 1");
+        auto *chip = m_window->findChild<QToolButton *>("unreachableChip");
+        const int away = chip->text().section(' ', 0, 0).toInt();
+        QTest::mouseClick(chip, Qt::LeftButton);
+        QTRY_COMPARE_WITH_TIMEOUT(cameras->rowCount() + table("nvrTable")->rowCount() +
+                                      table("othersTable")->rowCount(),
+                                  away + 1, patienceMs);
+        QTest::mouseClick(chip, Qt::LeftButton);
+        QCOMPARE(cameras->rowCount(), all);
+    }
+
+    void deletedDevicesAreGoneFromTheService() {
+        workOn(20);
+        MainConsoleTable *cameras = table("cameraTable");
+        QTest::mouseClick(cameras->viewport(), Qt::LeftButton, {}, QPoint(30, 18));
+        QTest::mouseClick(cameras->viewport(), Qt::LeftButton, Qt::ShiftModifier, QPoint(30, 3 * 36 - 10));
+        QCOMPARE(m_window->selectedDevices().size(), 3u);
+        QTest::keySequence(cameras, QKeySequence::Copy);
+        const QString copied = QGuiApplication::clipboard()->text();
+        QCOMPARE(copied.count('\n'), 3);
+        QVERIFY(copied.startsWith("Status\tModel\t"));
+
+        QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
+        tell("fault code=5@/v1/dev/commit,times=1");
+        for (const int rows : {20, 17}) {
+            QTest::keyClick(cameras, Qt::Key_Delete);
+            QTRY_VERIFY(QApplication::activeModalWidget());
+            QCOMPARE(QApplication::activeModalWidget()->windowTitle(),
+                     QStringLiteral("Delete Device(s) from Device Overview"));
+            message.clear();
+            QTest::keyClick(QApplication::activeModalWidget(), Qt::Key_Return);
+            QTRY_VERIFY_WITH_TIMEOUT(!message.isEmpty(), patienceMs);
+            QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), rows, patienceMs);
+        }
+        QCOMPARE(message[0][0].toString(), QStringLiteral("3 device(s) deleted."));
+    }
+
+    void exportWritesTheShownRows() {
+        workOn(20);
+        MainConsoleTable *cameras = table("cameraTable");
+        emit cameras->horizontalHeader()->sectionClicked(3);
+        m_window->findChild<QAction *>("exportDeviceListAction")->trigger();
+        auto *dialog = m_window->findChild<QFileDialog *>("saveFileDialog");
+        QVERIFY(dialog);
+        QCOMPARE(dialog->windowTitle(), QStringLiteral("Save as"));
+        dialog->selectFile(m_root.filePath("list"));
+        QMetaObject::invokeMethod(dialog, "accept");
+        const auto lines = [this] { return QString::fromUtf8(m_root.read("list.csv")).split('\n'); };
+        QTRY_COMPARE(lines().size(), cameras->rowCount() + 2);
+        QCOMPARE(lines()[1].section(',', 2, 2), cameras->item(0, 3)->text());
+        QTRY_COMPARE(CLocalStore::instance().defaultFilePath(), m_root.path());
+    }
+
+    void columnsAreKept() {
+        workOn(20);
+        const auto hidden = [this] { return table("cameraTable")->isColumnHidden(2); };
+        QTest::mouseClick(m_window->findChild<QToolButton *>("columnsButton"), Qt::LeftButton);
+        auto *menu = m_window->findChild<MainConsoleMenu *>();
+        QVERIFY(menu->isVisible());
+        QTest::mouseClick(menu->findChild<QCheckBox *>("columnCheckBox2"), Qt::LeftButton, {}, QPoint(8, 8));
+        QVERIFY(hidden());
+        menu->close();
+        QTest::qWait(1200);
+        StoreWriter::flush();
+        DeviceWindow another;
+        QVERIFY(another.findChild<MainConsoleTable *>("cameraTable")->isColumnHidden(2));
+        table("cameraTable")->resetColumns();
+        QVERIFY(!hidden());
+    }
+
     void stopForgetsTheSession() {
         workOn(20);
         tell("fault late=1000@/v1/dev/list,times=1");
@@ -321,6 +417,13 @@ private:
                                 arguments));
     }
 
+    QPushButton *visibleButton(const char *name) const {
+        for (auto *button : m_window->findChildren<QPushButton *>(name)) {
+            if (button->isVisible())
+                return button;
+        }
+        return nullptr;
+    }
     int rowsOfAllTables() const {
         int rows = 0;
         for (const MainConsoleTable *table : m_window->findChildren<MainConsoleTable *>())

@@ -51,7 +51,11 @@ private slots:
                               {{"siteid", 5}},
                               {{"siteid", ""}},
                               {{"siteid", "a"}, {"parentid", {1}}, {"sitename", false}}};
-        QCOMPARE(Sites::parse(records), (Sites::List{{"a", Sites::rootId, ""}}));
+        const Sites::List sites = Sites::parse(records);
+        QCOMPARE(sites.size(), 1u);
+        QCOMPARE(sites[0].id, QString("a"));
+        QCOMPARE(sites[0].parentId, Sites::rootId);
+        QCOMPARE(sites[0].name, QString());
         QVERIFY(Sites::parse({{"siteid", "a"}}).empty());
     }
 

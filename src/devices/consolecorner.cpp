@@ -1,0 +1,54 @@
+#include "consolecorner.h"
+
+#include "icons.h"
+
+#include <QComboBox>
+#include <QHBoxLayout>
+#include <QLineEdit>
+#include <QToolButton>
+
+#include <algorithm>
+
+namespace {
+constexpr QSize pictureSize{16, 16};
+constexpr int spaceForTabs = 290;
+constexpr int narrowest = 250;
+constexpr int widest = 560;
+} // namespace
+
+ConsoleCorner::ConsoleCorner(QWidget *parent)
+    : QWidget(parent),
+      m_search(new QLineEdit(this)),
+      m_remoteCombo(new QComboBox(this)),
+      m_columns(new QToolButton(this)) {
+    m_search->setObjectName(QStringLiteral("deviceSearchEdit"));
+    m_search->setAccessibleName(tr("Search devices"));
+    m_search->setPlaceholderText(tr("Search devices"));
+    m_search->setToolTip(
+        tr("Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range "
+           "(10.4.0.10-20); a MAC address"));
+    m_search->setClearButtonEnabled(true);
+    m_search->setMinimumWidth(80);
+    m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
+    m_remoteCombo->setAccessibleName(tr("Remote connection"));
+    m_remoteCombo->setPlaceholderText(tr("Remote connection"));
+    m_remoteCombo->setMinimumWidth(80);
+    m_columns->setObjectName(QStringLiteral("columnsButton"));
+    m_columns->setAccessibleName(tr("Columns"));
+    m_columns->setToolTip(tr("Columns"));
+    m_columns->setIcon(Icons::icon(QStringLiteral(":/images/icon_general_columns_line.svg"), pictureSize));
+    m_columns->setProperty("role", QStringLiteral("panel"));
+    m_columns->setFixedSize(32, 32);
+    m_columns->setFocusPolicy(Qt::TabFocus);
+    auto *layout = new QHBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 4);
+    layout->setSpacing(6);
+    layout->addWidget(m_search, 3);
+    layout->addWidget(m_remoteCombo, 2);
+    layout->addWidget(m_columns);
+}
+
+QSize ConsoleCorner::sizeHint() const {
+    const int room = parentWidget() ? parentWidget()->width() - spaceForTabs : widest;
+    return {std::clamp(room, narrowest, widest), QWidget::sizeHint().height()};
+}

@@ -1,0 +1,27 @@
+#pragma once
+
+#include <QWidget>
+
+class QComboBox;
+class QLineEdit;
+class QToolButton;
+
+/// What stands beside the tabs of the console: the search, the choice of another server, the columns.
+class ConsoleCorner : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit ConsoleCorner(QWidget *parent = nullptr);
+
+    QLineEdit *search() const { return m_search; }
+    QComboBox *remoteCombo() const { return m_remoteCombo; }
+    QToolButton *columnsButton() const { return m_columns; }
+
+    /// As wide as the tabs leave room for, within bounds.
+    QSize sizeHint() const override;
+
+private:
+    QLineEdit *m_search;
+    QComboBox *m_remoteCombo;
+    QToolButton *m_columns;
+};
