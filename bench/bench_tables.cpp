@@ -1,8 +1,10 @@
 // A device table against a plain table widget filled item by item, and against a view on a bare array model.
 //   bench_tables [DEVICES…]
 
+#include "deviceexport.h"
 #include "deviceinventory.h"
 #include "mainconsoletable.h"
+#include "sitetree.h"
 #include "theme.h"
 
 #include <QAbstractTableModel>
@@ -65,7 +67,7 @@ std::vector<DeviceRecordPtr> makeRecords(int count) {
                                                 {"d_dtime", "2026/11/21 10:00:00"},
                                                 {"d_powerfreq", 50},
                                                 {"d_audio", "mute"},
-                                                {"siteid", {"DO000000000000"}}}));
+                                                {"siteid", {"DO000000000000", i % 3 == 0 ? "SR1" : "SR2"}}}));
     }
     return records;
 }
@@ -206,6 +208,58 @@ void row(const char *what, int devices, double ours, const char *reference, doub
                 theirs, ours / theirs, limit);
 }
 
+/// What a user does with a full table, each step until it is painted.
+void measureUse(const std::vector<DeviceRecordPtr> &records) {
+    DeviceInventory inventory;
+    MainConsoleTable table(DeviceClass::Camera);
+    prepare(table);
+    table.setInventory(&inventory);
+    const auto snapshot = std::make_shared<const DeviceSnapshot>(records);
+    inventory.replace(snapshot, {});
+    table.refill();
+    double turn = 0;
+    finishFill(table, turn);
+    const auto step = [&](const char *what, const char *limit, const std::function<void()> &work) {
+        const double time = milliseconds([&] {
+            work();
+            table.viewport()->repaint();
+        });
+        std::printf("%-22s %7d  %9.2f ms   %s\n", what, snapshot->size(), time, limit);
+    };
+    for (const char *text : {"g", "gate-4", "gate-49 10.0.0.0/8", "1A07"})
+        step(qPrintable(QStringLiteral("search \"%1\"").arg(text)), "at most 50 ms", [&] {
+            table.setSearch(DeviceSearch(QString::fromLatin1(text), {{"SR1", "Hall"}}));
+        });
+    step("clear search", "at most 50 ms", [&] { table.setSearch({}); });
+    step("site switch", "at most 100 ms", [&] { table.setSite(QStringLiteral("SR1")); });
+    step("site switch back", "at most 100 ms", [&] { table.setSite(Sites::overviewId); });
+    step("select all", "at most 50 ms", [&] { table.selectAll(); });
+    QByteArray lines;
+    const double exported =
+        milliseconds([&] { lines = DeviceExport::text(*snapshot, table.shownDevices()); });
+    std::printf("%-22s %7d  %9.2f ms   at most 1000 ms, on a runner\n", "export", snapshot->size(), exported);
+}
+
+void measureSites() {
+    JSON records = JSON::array();
+    for (int i = 0; i < 2000; ++i)
+        records.push_back({{"siteid", "SR" + std::to_string(i)},
+                           {"parentid", i % 5 == 0 ? "SR000000000000" : "SR" + std::to_string(i - 1)},
+                           {"sitename", "Site " + std::to_string(i)}});
+    SiteTree tree;
+    tree.resize(250, 700);
+    tree.show();
+    QApplication::processEvents();
+    Sites::List sites;
+    const double parsed = milliseconds([&] { sites = Sites::parse(records); });
+    const double shown = milliseconds([&] {
+        tree.setSites(sites);
+        tree.viewport()->repaint();
+    });
+    std::printf("%-22s %7zu  %9.2f ms   at most 200 ms (read on a runner in %.2f ms)\n", "sites",
+                sites.size(), shown, parsed);
+}
+
 void measure(int devices) {
     const std::vector<DeviceRecordPtr> records = makeRecords(devices);
     const double plainFill = median([&] { return fillPlainWidget(records); });
@@ -229,6 +283,7 @@ void measure(int devices) {
         middle(bare, &Times::poll), "at most 3, and 16 ms");
     std::printf("%-22s %7d  %9.2f ms   of the event loop while filling\n", "longest turn", devices,
                 middle(ours, &Times::longestTurn));
+    measureUse(records);
 }
 
 } // namespace
@@ -243,4 +298,5 @@ int main(int argc, char *argv[]) {
         sizes = {QStringLiteral("1000"), QStringLiteral("10000"), QStringLiteral("50000")};
     for (const QString &size : sizes)
         measure(size.toInt());
+    measureSites();
 }

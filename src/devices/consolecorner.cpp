@@ -12,7 +12,7 @@
 namespace {
 constexpr QSize pictureSize{16, 16};
 constexpr int spaceForTabs = 290;
-constexpr int narrowest = 250;
+constexpr int narrowest = 320;
 constexpr int widest = 560;
 } // namespace
 
@@ -28,11 +28,11 @@ ConsoleCorner::ConsoleCorner(QWidget *parent)
         tr("Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range "
            "(10.4.0.10-20); a MAC address"));
     m_search->setClearButtonEnabled(true);
-    m_search->setMinimumWidth(80);
+    m_search->setMinimumWidth(110);
     m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
     m_remoteCombo->setAccessibleName(tr("Remote connection"));
     m_remoteCombo->setPlaceholderText(tr("Remote connection"));
-    m_remoteCombo->setMinimumWidth(80);
+    m_remoteCombo->setMinimumWidth(158);
     m_columns->setObjectName(QStringLiteral("columnsButton"));
     m_columns->setAccessibleName(tr("Columns"));
     m_columns->setToolTip(tr("Columns"));

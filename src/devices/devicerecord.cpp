@@ -221,6 +221,11 @@ DeviceRecordPtr parse(const JSON &value) {
     record->siteIds = siteIdsOf(value);
     record->networkType = stringMember(value, "d_nettype");
     readColumns(value, *record);
+    for (const DeviceColumn column :
+         {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {
+        if (record->text(column) != unknownText)
+            record->searchText += record->text(column).toCaseFolded().toStdString() + '\n';
+    }
     record->json = dumpJson(value);
     return record;
 }

@@ -48,6 +48,8 @@ struct DeviceRecord {
     /// What the columns are sorted by before their texts: numbers, addresses, versions, times, or the first
     /// letters of a text.
     std::array<quint64, deviceColumnCount> sortKeys{};
+    /// Host name, address, model and firmware without case, in UTF-8: what a search looks through.
+    std::string searchText;
     /// The whole record as JSON text, with the members that this client does not know.
     std::string json;
 

@@ -35,7 +35,7 @@ bool macContains(quint64 key, const QByteArray &digits) {
 DeviceSearch::DeviceSearch(const QString &text, const QHash<QString, QString> &siteNames) {
     for (const QString &part : text.split(QLatin1Char(' '), Qt::SkipEmptyParts)) {
         Word word;
-        word.text = part;
+        word.text = part.toCaseFolded().toStdString();
         if (!readRange(part, word)) {
             word.macDigits = macDigitsOf(part);
             for (auto site = siteNames.begin(); site != siteNames.end(); ++site) {
@@ -80,11 +80,8 @@ bool DeviceSearch::matches(const Word &word, const DeviceRecord &device) {
     const quint64 ip = device.sortKey(DeviceColumn::Ip);
     if (word.firstIp <= word.lastIp)
         return ip >= word.firstIp && ip <= word.lastIp;
-    for (const DeviceColumn column :
-         {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {
-        if (device.text(column).contains(word.text, Qt::CaseInsensitive))
-            return true;
-    }
+    if (device.searchText.find(word.text) != std::string::npos)
+        return true;
     const quint64 mac = device.sortKey(DeviceColumn::Mac);
     if (!word.macDigits.isEmpty() && mac != DeviceRecord::unknownKey && macContains(mac, word.macDigits))
         return true;

@@ -23,7 +23,7 @@ public:
 
 private:
     struct Word {
-        QString text;
+        std::string text;     ///< without case
         QByteArray macDigits; ///< empty for a word that is no part of a MAC
         QSet<QString> sites;  ///< whose names contain the word
         quint64 firstIp = 1;

@@ -404,17 +404,21 @@ PopupMenu *SiteTree::menuOf(const QTreeWidgetItem *item) {
     auto *menu = new PopupMenu(this);
     menu->setObjectName(QStringLiteral("siteMenu"));
     menu->setAttribute(Qt::WA_DeleteOnClose);
-    // The rows may be built anew while the menu is open, so it keeps the id.
-    const QString id = siteIdOf(item);
-    QAction *add =
-        menu->addAction(menuIcon(mayAdd ? "icon_general_plus_line" : "icon_general_plus_line_disabled"),
-                        tr("Add Site"), this, [this, id] { addSite(id); });
-    add->setEnabled(mayAdd);
-    menu->addAction(menuIcon("icon_general_edit_line"), tr("Edit Site"), this, [this, id] { editSite(id); });
-    QAction *remove = menu->addAction(
-        menuIcon(mayDelete ? "icon_general_delete_line_red" : "icon_general_delete_line_red_disabled"),
-        tr("Delete Site"), this, [this, id] { askToDelete(id); });
-    remove->setEnabled(mayDelete);
+    const auto addEntry = [this, menu, id = siteIdOf(item)](const char *icon, const QString &text,
+                                                            bool enabled,
+                                                            void (SiteTree::*work)(const QString &)) {
+        QAction *entry = menu->addAction(menuIcon(icon), text);
+        entry->setEnabled(enabled);
+        // By id, since the rows may be built anew while the menu is open; and when the menu is gone, since an
+        // editor that opens under it loses the focus, and closes, as the menu does.
+        connect(
+            entry, &QAction::triggered, this, [this, id, work] { (this->*work)(id); }, Qt::QueuedConnection);
+    };
+    addEntry(mayAdd ? "icon_general_plus_line" : "icon_general_plus_line_disabled", tr("Add Site"), mayAdd,
+             &SiteTree::addSite);
+    addEntry("icon_general_edit_line", tr("Edit Site"), true, &SiteTree::editSite);
+    addEntry(mayDelete ? "icon_general_delete_line_red" : "icon_general_delete_line_red_disabled",
+             tr("Delete Site"), mayDelete, &SiteTree::askToDelete);
     return menu;
 }
 

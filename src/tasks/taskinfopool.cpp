@@ -117,6 +117,9 @@ void CTaskInfoPool::readTasks(ServiceSession &session) {
     }
     if (unreadable > 0)
         qWarning("%d task records have no id and were left out", unreadable);
+    // Nothing but garbage is no list, and certainly no empty one.
+    if (unreadable > 0 && records.empty())
+        return tell(&CTaskInfoPool::taskListFailed);
     const auto tasks = std::make_shared<const TaskList>(std::move(records));
     if (!takeTasks(session, tasks))
         return;

@@ -87,9 +87,12 @@ private slots:
         m_service->setTaskAnswer("no list");
         load();
         QTRY_COMPARE(failed.count(), 1);
-        m_service->refuse("/v1/task/list", 3);
+        m_service->setTasks({{{"tid", 7}}, nullptr});
         load();
         QTRY_COMPARE(failed.count(), 2);
+        m_service->refuse("/v1/task/list", 3);
+        load();
+        QTRY_COMPARE(failed.count(), 3);
         QCOMPARE(m_pool.taskList()->records().size(), 2u);
     }
 
