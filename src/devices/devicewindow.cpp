@@ -6,33 +6,28 @@
 #include "deviceactions.h"
 #include "devicefooter.h"
 #include "devicelog.h"
+#include "devicemenus.h"
 #include "devicemonitor.h"
 #include "devicetab.h"
 #include "devicetoolbar.h"
 #include "filedialogs.h"
-#include "icons.h"
-#include "mainconsolemenu.h"
 #include "mainconsoletable.h"
-#include "messagelog.h"
-#include "popupmenu.h"
+#include "noticebar.h"
 #include "reconnectingdialog.h"
 #include "refreshdevicedialog.h"
 #include "servicerequest.h"
+#include "sitecommit.h"
 #include "sitetree.h"
 #include "storewriter.h"
 #include "taskinfopool.h"
 #include "transientmessage.h"
 
-#include <QClipboard>
 #include <QComboBox>
 #include <QDebug>
 #include <QFileInfo>
-#include <QGuiApplication>
 #include <QHBoxLayout>
 #include <QHeaderView>
-#include <QLabel>
 #include <QLineEdit>
-#include <QPushButton>
 #include <QShortcut>
 #include <QSplitter>
 #include <QTimer>
@@ -67,8 +62,10 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_splitter(new QSplitter(this)),
       m_console(new QWidget(m_splitter)),
       m_siteTree(new SiteTree(m_splitter)),
+      m_siteCommit(new SiteCommit(m_siteTree, this)),
       m_actions(new DeviceActions(this)),
       m_toolBar(new DeviceToolBar(m_console)),
+      m_noticeBar(new NoticeBar(m_console)),
       m_tabs(new CountedTabWidget(m_console)),
       m_corner(new ConsoleCorner(m_tabs)),
       m_footer(new DeviceFooter(m_console)),
@@ -106,30 +103,12 @@ void DeviceWindow::buildTabs() {
         tab->table()->keepColumns();
 }
 
-QWidget *DeviceWindow::buildNoticeBar() {
-    m_noticeBar = new QFrame(m_console);
-    m_noticeBar->setObjectName(QStringLiteral("noticeBar"));
-    auto *icon = new QLabel;
-    icon->setPixmap(Icons::pixmap(QStringLiteral(":images/icon_general_tip_solid_blue.svg"), {16, 16}, 2.0));
-    auto *text = new QLabel(tr("Site changes detected. Update changes to the server promptly by clicking"));
-    auto *apply = new QPushButton(tr("Apply"));
-    apply->setObjectName(QStringLiteral("noticeApplyButton"));
-    auto *layout = new QHBoxLayout(m_noticeBar);
-    layout->setContentsMargins(12, 6, 12, 6);
-    layout->addWidget(icon);
-    layout->addWidget(text);
-    layout->addWidget(apply);
-    layout->addStretch();
-    m_noticeBar->hide();
-    return m_noticeBar;
-}
-
 void DeviceWindow::buildLayout() {
     auto *consoleLayout = new QVBoxLayout(m_console);
     consoleLayout->setContentsMargins(14, 10, 14, 0);
     consoleLayout->setSpacing(8);
     consoleLayout->addWidget(m_toolBar);
-    consoleLayout->addWidget(buildNoticeBar());
+    consoleLayout->addWidget(m_noticeBar);
     consoleLayout->addWidget(m_tabs, 1);
     consoleLayout->addWidget(m_footer);
 
@@ -162,7 +141,9 @@ void DeviceWindow::connectParts() {
     connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::devicesDropped, this, &DeviceWindow::onDevicesDropped);
-    connect(m_noticeBar->findChild<QPushButton *>(), &QPushButton::clicked, this, &DeviceWindow::commitSites);
+    connect(m_noticeBar, &NoticeBar::msgButtonClicked, this, &DeviceWindow::commitSites);
+    connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
     connect(m_tabs, &CountedTabWidget::currentChanged, this, [this] {
         showStatusCounts();
         onSelectionChanged();
@@ -172,7 +153,7 @@ void DeviceWindow::connectParts() {
     connect(m_corner->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
     connect(m_corner->columnsButton(), &QToolButton::clicked, this, [this] {
         const QWidget *button = m_corner->columnsButton();
-        showColumnMenu(button->mapToGlobal(QPoint(0, button->height())));
+        DeviceMenus::showColumnMenu(currentTab()->table(), button->mapToGlobal(QPoint(0, button->height())));
     });
     connect(m_footer, &DeviceFooter::statusFilterChanged, this, &DeviceWindow::applyStatusFilter);
     connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
@@ -198,27 +179,27 @@ void DeviceWindow::connectParts() {
 }
 
 void DeviceWindow::connectTable(const DeviceTab *tab) {
-    const MainConsoleTable *table = tab->table();
+    MainConsoleTable *table = tab->table();
     connect(table, &MainConsoleTable::selectedDevicesChanged, this, &DeviceWindow::onSelectionChanged);
     connect(table, &MainConsoleTable::deleteRequested, this, &DeviceWindow::on_deleteButton_clicked);
-    connect(table, &MainConsoleTable::rowMenuRequested, this, &DeviceWindow::showRowMenu);
-    connect(table, &MainConsoleTable::columnMenuRequested, this, &DeviceWindow::showColumnMenu);
+    connect(table, &MainConsoleTable::rowMenuRequested, this,
+            [this, table](const QPoint &position) { DeviceMenus::showRowMenu(m_toolBar, table, position); });
+    connect(table, &MainConsoleTable::columnMenuRequested, this,
+            [table](const QPoint &position) { DeviceMenus::showColumnMenu(table, position); });
     connect(tab, &DeviceTab::clearFilterRequested, this, &DeviceWindow::clearFilter);
 }
 
 void DeviceWindow::addShortcuts() {
-    const auto add = [this](const QKeySequence &keys, QWidget *where, auto slot) {
-        auto *shortcut = new QShortcut(keys, where);
+    const auto add = [this](const QKeySequence &keys, auto slot) {
+        auto *shortcut = new QShortcut(keys, this);
         shortcut->setContext(Qt::WidgetWithChildrenShortcut);
         connect(shortcut, &QShortcut::activated, this, slot);
     };
-    add(QKeySequence::Find, this, [this] {
+    add(QKeySequence::Find, [this] {
         m_corner->search()->setFocus();
         m_corner->search()->selectAll();
     });
-    add(Qt::Key_F5, this, [this] { m_toolBar->button(QStringLiteral("refreshButton"))->click(); });
-    for (const DeviceTab *tab : m_deviceTabs)
-        add(QKeySequence::Copy, tab->table(), &DeviceWindow::copySelection);
+    add(Qt::Key_F5, [this] { m_toolBar->button(QStringLiteral("refreshButton"))->click(); });
 }
 
 void DeviceWindow::startWork() {
@@ -402,30 +383,6 @@ void DeviceWindow::onFilterChanged() {
     onSelectionChanged();
 }
 
-void DeviceWindow::showRowMenu(const QPoint &position) {
-    auto *menu = new PopupMenu(this);
-    menu->setAttribute(Qt::WA_DeleteOnClose);
-    const MainConsoleTable *table = currentTab()->table();
-    const QString cell = table->currentIndex().data(Qt::DisplayRole).toString().simplified();
-    menu->addAction(tr("Copy cell"), this, [cell] { QGuiApplication::clipboard()->setText(cell); });
-    menu->addAction(tr("Copy rows"), this, &DeviceWindow::copySelection);
-    menu->addSeparator();
-    m_toolBar->addOperations(menu);
-    menu->popup(position);
-}
-
-void DeviceWindow::showColumnMenu(const QPoint &position) {
-    MainConsoleTable *table = currentTab()->table();
-    auto *menu = new MainConsoleMenu(table->horizontalHeader(), this);
-    menu->setAttribute(Qt::WA_DeleteOnClose);
-    connect(menu, &MainConsoleMenu::resetRequested, table, &MainConsoleTable::resetColumns);
-    menu->popup(position);
-}
-
-void DeviceWindow::copySelection() {
-    QGuiApplication::clipboard()->setText(currentTab()->table()->selectionText());
-}
-
 void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     qDebug("update site info");
     qDebug("update device info");
@@ -533,39 +490,7 @@ bool DeviceWindow::hasPendingEdits() const {
 }
 
 void DeviceWindow::commitSites() {
-    if (m_siteTree->edits().isCommitting() || !hasPendingEdits())
-        return;
-    const LoginInfo login = CLocalStore::instance().loginInfo();
-    qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
-           static_cast<int>(login.port), qUtf8Printable(login.account),
-           MessageLog::secret(login.token).constData());
-    const auto send = [records = m_siteTree->beginCommit()](ServiceSession &session) {
-        const unsigned result =
-            session.call([&](CApiClient &client) { return client.commitSites(records, "all"); });
-        if (result == ApiOk)
-            qDebug("commit site info: %s", dumpJson(records).c_str());
-        else
-            qWarning("HTTP API(commitSites) failed!");
-        return result;
-    };
-    const bool started = ServiceRequest::post(
-        NetJob::createRunner("committing sites"), this, send,
-        [this](unsigned result) {
-            m_siteTree->endCommit(result == ApiOk);
-            if (result != ApiOk)
-                emit onShowAnimatedMsgDlg(
-                    tr("The site changes could not be sent: %1. Press Apply to try again.")
-                        .arg(apiResultText(result)));
-            reload();
-        },
-        [this](JobEnd end) {
-            if (end == JobEnd::Delivered || end == JobEnd::SessionGone)
-                return;
-            m_siteTree->endCommit(false);
-            emit onShowAnimatedMsgDlg(tr("The site changes could not be sent. Press Apply to try again."));
-        });
-    if (!started)
-        m_siteTree->endCommit(false);
+    m_siteCommit->send();
 }
 
 void DeviceWindow::onDevicesDropped(const QString &siteId, const QStringList &deviceIds,

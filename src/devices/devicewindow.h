@@ -20,11 +20,12 @@ class DeviceMonitor;
 class DeviceTab;
 class DeviceToolBar;
 class MainConsoleTable;
-class QFrame;
+class NoticeBar;
 class QSplitter;
 class QTimer;
 class ReconnectingDialog;
 class RefreshDeviceDialog;
+class SiteCommit;
 class SiteTree;
 
 /// The device console: the site tree, the tool bar, the three device tables and what keeps them current.
@@ -67,7 +68,6 @@ signals:
 
 private:
     void buildLayout();
-    QWidget *buildNoticeBar();
     void buildTabs();
     void connectParts();
     void connectTable(const DeviceTab *tab);
@@ -85,9 +85,6 @@ private:
     void applyStatusFilter(std::optional<DeviceStatusGroup> status);
     void clearFilter();
     void onFilterChanged();
-    void showRowMenu(const QPoint &position);
-    void showColumnMenu(const QPoint &position);
-    void copySelection();
 
     void onReading(const InventoryReader::Reading &reading);
     void onUpdateDeviceStatus(const DeviceStatusUpdate &update);
@@ -117,9 +114,10 @@ private:
     QSplitter *m_splitter;
     QWidget *m_console; ///< right of the tree
     SiteTree *m_siteTree;
+    SiteCommit *m_siteCommit;
     DeviceActions *m_actions;
     DeviceToolBar *m_toolBar;
-    QFrame *m_noticeBar = nullptr;
+    NoticeBar *m_noticeBar;
     CountedTabWidget *m_tabs;
     ConsoleCorner *m_corner;
     std::vector<DeviceTab *> m_deviceTabs;

@@ -8,8 +8,10 @@
 #include "storewriter.h"
 #include "theme.h"
 
+#include <QClipboard>
 #include <QDrag>
 #include <QElapsedTimer>
+#include <QGuiApplication>
 #include <QHeaderView>
 #include <QKeyEvent>
 #include <QMimeData>
@@ -362,6 +364,8 @@ void MainConsoleTable::timerEvent(QTimerEvent *event) {
 void MainConsoleTable::keyPressEvent(QKeyEvent *event) {
     if (event->key() == Qt::Key_Delete)
         emit deleteRequested();
+    else if (event->matches(QKeySequence::Copy))
+        copySelection();
     else
         CustomTable::keyPressEvent(event);
 }
@@ -395,6 +399,10 @@ QStringList MainConsoleTable::visibleTexts(int row) const {
         texts += text.simplified();
     }
     return texts;
+}
+
+void MainConsoleTable::copySelection() const {
+    QGuiApplication::clipboard()->setText(selectionText());
 }
 
 QString MainConsoleTable::selectionText() const {

@@ -50,6 +50,7 @@ public:
 
     /// The selected rows as text: tabs between the visible columns, whose titles come first.
     QString selectionText() const;
+    void copySelection() const;
 
     /// Makes columns as they were kept under the table's object name, and keeps changes from now on.
     void keepColumns();
