@@ -263,7 +263,13 @@ void DeviceWindow::reload() {
     m_answersSinceReading = 0;
     m_sinceReading.start();
     m_reloading = ServiceRequest::post(
-        m_netTask.get(), this, read, [this](const InventoryReader::Reading &reading) { onReading(reading); },
+        m_netTask.get(), this, read,
+        [this, commits = m_siteTree->edits().commitCount()](InventoryReader::Reading reading) {
+            // Sites that were read before a commit are older than the tree.
+            if (commits != m_siteTree->edits().commitCount())
+                reading.sites.reset();
+            onReading(reading);
+        },
         [this](JobEnd end) {
             m_reloading = false;
             m_readingMs = m_sinceReading.restart();

@@ -12,22 +12,6 @@ namespace InventoryReader {
 namespace {
 
 constexpr int pageSize = 500;
-std::optional<Sites::List> readSites(ServiceSession &session) {
-    JSON all = JSON::array();
-    const unsigned result = PageReader::readAll(session, &CApiClient::listSites, pageSize, [&](JSON &page) {
-        for (JSON &site : page)
-            all.push_back(std::move(site));
-    });
-    if (result != ApiOk) {
-        qDebug("HTTP API(listSites) failed!");
-        return std::nullopt;
-    }
-    if (all.empty())
-        qDebug("no site found!");
-    qDebug("site list size: %d, dump: %s", static_cast<int>(all.size()), dumpJson(all).c_str());
-    return Sites::parse(all);
-}
-
 /// The record as it was, when it says the same: then nothing has to be read, kept or painted anew.
 DeviceRecordPtr recordOf(const JSON &value, const DeviceSnapshot &previous) {
     const int index = previous.indexOf(DeviceRecords::identityOf(value));
@@ -114,6 +98,22 @@ std::vector<DeviceStatusCode> carriedOver(const DeviceSnapshot &snapshot, const 
 }
 
 } // namespace
+
+std::optional<Sites::List> readSites(ServiceSession &session) {
+    JSON all = JSON::array();
+    const unsigned result = PageReader::readAll(session, &CApiClient::listSites, pageSize, [&](JSON &page) {
+        for (JSON &site : page)
+            all.push_back(std::move(site));
+    });
+    if (result != ApiOk) {
+        qDebug("HTTP API(listSites) failed!");
+        return std::nullopt;
+    }
+    if (all.empty())
+        qDebug("no site found!");
+    qDebug("site list size: %d, dump: %s", static_cast<int>(all.size()), dumpJson(all).c_str());
+    return Sites::parse(all);
+}
 
 Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
                 std::vector<DeviceStatusCode> previousCodes) {

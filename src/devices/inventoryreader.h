@@ -17,6 +17,9 @@ struct Reading {
     std::vector<DeviceStatusCode> codes; ///< one a device, in their order
 };
 
+/// Reads the sites alone. Nothing when they could not be read.
+std::optional<Sites::List> readSites(ServiceSession &session);
+
 /// Reads all three. Records that are as before are taken over from the previous reading; when all are, the
 /// very same snapshot comes back.
 Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,

@@ -1,5 +1,6 @@
 #include "sitecommit.h"
 
+#include "inventoryreader.h"
 #include "messagelog.h"
 #include "servicerequest.h"
 #include "sitetree.h"
@@ -10,18 +11,30 @@
 
 namespace {
 
-unsigned commit(ServiceSession &session, const JSON &sites) {
+struct Answer {
+    unsigned result = ApiOk;
+    Sites::List reading; ///< what the service had right before
+};
+
+/// The commit says of every site what it shall be, so what other clients have changed meanwhile is read first
+/// and kept.
+Answer commit(ServiceSession &session, SiteEdits edits) {
     const LoginInfo &login = session.login();
     qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
            static_cast<int>(login.port), qUtf8Printable(login.account),
            MessageLog::secret(login.token).constData());
+    const std::optional<Sites::List> reading = InventoryReader::readSites(session);
+    if (!reading)
+        return {ApiTransportError, {}};
+    edits.takeReading(*reading);
+    const JSON sites = edits.commitRecords();
     const unsigned result =
         session.call([&](CApiClient &client) { return client.commitSites(sites, "all"); });
     if (result == ApiOk)
         qDebug("commit site info: %s", dumpJson(sites).c_str());
     else
         qWarning("HTTP API(commitSites) failed!");
-    return result;
+    return {result, *reading};
 }
 
 } // namespace
@@ -31,18 +44,27 @@ SiteCommit::SiteCommit(SiteTree *tree, QObject *parent) : QObject(parent), m_tre
 void SiteCommit::send() {
     if (m_tree->edits().isCommitting() || !m_tree->edits().isDirty())
         return;
+    const SiteEdits edits = m_tree->edits();
+    m_tree->beginCommit();
+    const auto giveUp = [this] {
+        m_tree->endCommit(false);
+        emit failed(tr("The site changes could not be sent. Press Apply to try again."));
+    };
     const bool started = ServiceRequest::post(
         NetJob::createRunner("committing sites"), this,
-        [sites = m_tree->beginCommit()](ServiceSession &session) { return commit(session, sites); },
-        [this](unsigned result) { onAnswer(result); },
-        [this](JobEnd end) {
-            if (end != JobEnd::Delivered)
-                m_tree->endCommit(false);
+        [edits](ServiceSession &session) { return commit(session, edits); },
+        [this](const Answer &answer) {
+            if (answer.result == ApiOk)
+                m_tree->setSites(answer.reading);
+            onAnswer(answer.result);
+        },
+        [giveUp](JobEnd end) {
+            // With its session the tree has forgotten the commit.
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                emit failed(tr("The site changes could not be sent. Press Apply to try again."));
+                giveUp();
         });
     if (!started)
-        m_tree->endCommit(false);
+        giveUp();
 }
 
 void SiteCommit::onAnswer(unsigned result) {

@@ -8,8 +8,10 @@
 #include "mainconsolemenu.h"
 #include "mainconsoletable.h"
 #include "nettask.h"
+#include "noticebar.h"
 #include "reconnectingdialog.h"
 #include "refreshdevicedialog.h"
+#include "servicesession.h"
 #include "sessionevents.h"
 #include "sitetree.h"
 #include "storewriter.h"
@@ -30,6 +32,8 @@
 #include <QTest>
 #include <QToolButton>
 #include <QTreeWidgetItemIterator>
+
+#include <nlohmann/json.hpp>
 
 #include <algorithm>
 
@@ -326,6 +330,41 @@ private slots:
         QTRY_COMPARE(CLocalStore::instance().defaultFilePath(), m_root.path());
     }
 
+    void siteChangesAreSentWhenApplied() {
+        workOn(20);
+        auto *tree = m_window->findChild<SiteTree *>();
+        auto *notice = m_window->findChild<NoticeBar *>();
+        QTest::mouseClick(tree->findChild<QToolButton *>("addTopSiteButton"), Qt::LeftButton);
+        auto *editor = tree->findChild<QLineEdit *>();
+        QVERIFY(editor);
+        QTest::keyClicks(editor, "Annex");
+        QTest::keyClick(editor, Qt::Key_Return);
+        QVERIFY(notice->isVisible());
+        QVERIFY(m_window->hasPendingEdits());
+        onService([](CApiClient &client) {
+            std::string id;
+            return client.addSite("Of another client", nullptr, id);
+        });
+
+        QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
+        tell("fault code=3@/v1/site/commit,times=1");
+        auto *apply = notice->findChild<QPushButton *>("noticeApplyButton");
+        // Not by the mouse: the first refresh may be in front of the window by now.
+        apply->click();
+        apply->click();
+        QTRY_COMPARE_WITH_TIMEOUT(message.size(), 1, patienceMs);
+        QVERIFY2(notice->isVisible(), "a refused change is still there");
+        apply->click();
+        QTRY_VERIFY_WITH_TIMEOUT(!notice->isVisible(), patienceMs);
+        JSON sites;
+        onService([&](CApiClient &client) { return client.listSites(0, 500, sites); });
+        const std::string all = dumpJson(sites);
+        QVERIFY(all.find("Annex") != std::string::npos);
+        QVERIFY(all.find("Of another client") != std::string::npos);
+        QVERIFY(QTest::qWaitFor(
+            [&] { return tree->findItems("Of another client", Qt::MatchExactly).size() == 1; }, patienceMs));
+    }
+
     void columnsAreKept() {
         workOn(20);
         const auto hidden = [this] { return table("cameraTable")->isColumnHidden(2); };
@@ -388,6 +427,11 @@ private slots:
     }
 
 private:
+    static void onService(const std::function<unsigned(CApiClient &)> &call) {
+        unsigned result = ApiException;
+        NetTask::runAndWait([&] { result = ServiceSession(CLocalStore::instance().loginInfo()).call(call); });
+        QCOMPARE(result, unsigned(ApiOk));
+    }
     void tell(const QString &command) {
         const QString answer = m_service.command(command);
         QVERIFY2(answer.startsWith("ok"), qPrintable(answer));
