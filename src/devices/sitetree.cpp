@@ -5,7 +5,7 @@
 #include "icons.h"
 #include "plaintext.h"
 #include "popupmenu.h"
-#include "theme.h"
+#include "sitedelegate.h"
 
 #include <QContextMenuEvent>
 #include <QDateTime>
@@ -15,10 +15,8 @@
 #include <QLineEdit>
 #include <QLocale>
 #include <QMimeData>
-#include <QPainter>
 #include <QScrollBar>
 #include <QSignalBlocker>
-#include <QStyledItemDelegate>
 #include <QToolButton>
 #include <QTreeWidgetItemIterator>
 
@@ -28,9 +26,6 @@
 
 namespace {
 
-constexpr int rowPadding = 14;
-constexpr int captionHeight = 34;
-constexpr int siteHeight = 32;
 constexpr QSize pictureSize{14, 14};
 constexpr QSize menuIconSize{16, 16};
 constexpr int addButtonDistance = 8;
@@ -38,100 +33,6 @@ constexpr int longestPlainName = 24;
 constexpr int expandDelayMs = 700;
 /// What the tree drags: the id of a site.
 constexpr auto siteMimeType = "application/x-nvldm-site";
-
-/// Paints captions, the mark of the selected row, and the count at a row's end; hands edited names over.
-class SiteDelegate : public QStyledItemDelegate {
-public:
-    using Edited = std::function<void(const QString &siteId, const QString &name)>;
-
-    SiteDelegate(QTreeWidget *tree, Edited edited)
-        : QStyledItemDelegate(tree), m_tree(tree), m_edited(std::move(edited)) {}
-
-    // The one column is as wide as the tree, so no text needs to be measured.
-    QSize sizeHint(const QStyleOptionViewItem &, const QModelIndex &index) const override {
-        return {1, isCaption(index) ? captionHeight : siteHeight};
-    }
-
-    QWidget *createEditor(QWidget *parent, const QStyleOptionViewItem &, const QModelIndex &) const override {
-        auto *editor = new QLineEdit(parent);
-        editor->setObjectName(QStringLiteral("siteNameEditor"));
-        editor->setAccessibleName(SiteTree::tr("Site name"));
-        return editor;
-    }
-
-    void updateEditorGeometry(QWidget *editor, const QStyleOptionViewItem &option,
-                              const QModelIndex &) const override {
-        QRect place = option.rect.adjusted(pictureSize.width() + 4, 0, 0, 0);
-        place.setRight(m_tree->viewport()->width() - 6);
-        editor->setGeometry(place);
-    }
-
-    void setModelData(QWidget *editor, QAbstractItemModel *, const QModelIndex &index) const override {
-        m_edited(index.data(SiteTree::siteIdRole).toString(), static_cast<QLineEdit *>(editor)->text());
-    }
-
-    void paint(QPainter *painter, const QStyleOptionViewItem &option,
-               const QModelIndex &index) const override {
-        if (isCaption(index)) {
-            paintCaption(painter, option, index);
-            return;
-        }
-        const QRect row(0, option.rect.top(), m_tree->viewport()->width(), option.rect.height());
-        paintRowState(painter, option, row);
-        QRect rest = option.rect.adjusted(2, 0, -rowPadding, 0);
-        const QString count = index.data(SiteTree::countRole).toString();
-        painter->setFont(countFont(option.font));
-        painter->setPen(Theme::textQuiet);
-        painter->drawText(rest, Qt::AlignRight | Qt::AlignVCenter, count);
-        rest.setRight(rest.right() - QFontMetrics(painter->font()).horizontalAdvance(count) - 8);
-        const QIcon icon = index.data(Qt::DecorationRole).value<QIcon>();
-        icon.paint(painter,
-                   QRect(QPoint(rest.left(), rest.center().y() - pictureSize.height() / 2 + 1), pictureSize));
-        rest.setLeft(rest.left() + pictureSize.width() + 8);
-        painter->setFont(option.font);
-        painter->setPen(option.state & QStyle::State_Selected ? Theme::text : Theme::textStrong);
-        QString name = index.data(Qt::DisplayRole).toString().left(200).simplified();
-        if (name.isEmpty())
-            name = SiteTree::tr("(no name)");
-        painter->drawText(rest, Qt::AlignVCenter | Qt::TextSingleLine,
-                          option.fontMetrics.elidedText(name, Qt::ElideRight, rest.width()));
-    }
-
-private:
-    static bool isCaption(const QModelIndex &index) { return index.data(SiteTree::siteIdRole).isNull(); }
-
-    static QFont countFont(QFont font) {
-        font.setPixelSize(11);
-        return font;
-    }
-
-    void paintCaption(QPainter *painter, const QStyleOptionViewItem &option, const QModelIndex &index) const {
-        QFont font = option.font;
-        font.setPixelSize(11);
-        font.setLetterSpacing(QFont::AbsoluteSpacing, 0.6);
-        painter->setFont(font);
-        painter->setPen(Theme::textQuiet);
-        const QRect place(16, option.rect.top() + 8, m_tree->viewport()->width() - 16,
-                          option.rect.height() - 8);
-        painter->drawText(place, Qt::AlignVCenter, index.data(Qt::DisplayRole).toString());
-    }
-
-    void paintRowState(QPainter *painter, const QStyleOptionViewItem &option, const QRect &row) const {
-        if (option.state & QStyle::State_Selected) {
-            painter->fillRect(row, QColor(0x29, 0x86, 0xFF, 51));
-            painter->fillRect(QRect(row.left(), row.top(), 2, row.height()), Theme::accent);
-            if (option.state & QStyle::State_HasFocus && m_tree->hasFocus()) {
-                painter->setPen(Theme::accent);
-                painter->drawRect(row.adjusted(0, 0, -1, -1));
-            }
-        } else if (option.state & QStyle::State_MouseOver) {
-            painter->fillRect(row, QColor(255, 255, 255, 13));
-        }
-    }
-
-    QTreeWidget *m_tree;
-    Edited m_edited;
-};
 
 bool showSame(const Sites::List &a, const Sites::List &b) {
     return std::equal(a.begin(), a.end(), b.begin(), b.end(), [](const Sites::Site &x, const Sites::Site &y) {
