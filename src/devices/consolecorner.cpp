@@ -12,7 +12,7 @@
 namespace {
 constexpr QSize pictureSize{16, 16};
 constexpr int spaceForTabs = 290;
-constexpr int narrowest = 320;
+constexpr int narrowest = 334;
 constexpr int widest = 560;
 } // namespace
 
@@ -32,7 +32,7 @@ ConsoleCorner::ConsoleCorner(QWidget *parent)
     m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
     m_remoteCombo->setAccessibleName(tr("Remote connection"));
     m_remoteCombo->setPlaceholderText(tr("Remote connection"));
-    m_remoteCombo->setMinimumWidth(158);
+    m_remoteCombo->setMinimumWidth(172);
     m_columns->setObjectName(QStringLiteral("columnsButton"));
     m_columns->setAccessibleName(tr("Columns"));
     m_columns->setToolTip(tr("Columns"));

@@ -74,9 +74,9 @@ void DeviceFooter::setSelection(int selected, int shown, int all) {
     const QLocale locale;
     if (shown == all)
         m_selection->setText(
-            tr("%1 of %n device(s) selected", nullptr, shown).arg(locale.toString(selected)));
+            tr("%1 of %Ln device(s) selected", nullptr, shown).arg(locale.toString(selected)));
     else
-        m_selection->setText(tr("%1 of %2 shown selected, %n device(s) in all", nullptr, all)
+        m_selection->setText(tr("%1 of %2 shown selected, %Ln device(s) in all", nullptr, all)
                                  .arg(locale.toString(selected), locale.toString(shown)));
 }
 

@@ -42,15 +42,12 @@ AlarmPanel::AlarmPanel(QWidget *parent)
     m_delete->setShortcutContext(Qt::WidgetShortcut);
     m_stale->setObjectName(QStringLiteral("alarmStaleLabel"));
     m_stale->setProperty("role", QStringLiteral("warning"));
-    m_stale->setContentsMargins(12, 0, 12, 6);
-    m_stale->setWordWrap(true);
     m_stale->hide();
     buildList();
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
     layout->addWidget(buildHeader());
-    layout->addWidget(m_stale);
     layout->addWidget(m_page, 1);
     connectParts();
     showPage();
@@ -70,6 +67,7 @@ QWidget *AlarmPanel::buildHeader() {
     m_deleteAll = new QToolButton(header);
     m_deleteAll->setObjectName(QStringLiteral("deleteAllAlarmsButton"));
     m_deleteAll->setText(tr("Delete all"));
+    layout->addWidget(m_stale, 1);
     layout->addStretch();
     for (QToolButton *button : {remove, m_deleteAll}) {
         button->setProperty("role", QStringLiteral("panel"));
@@ -134,8 +132,8 @@ void AlarmPanel::onAlarmListUpdated() {
 
 void AlarmPanel::onAlarmListFailed() {
     if (m_stale->isHidden())
-        m_stale->setText(tr("The alarms could not be read since %1.")
-                             .arg(QTime::currentTime().toString(QStringLiteral("hh:mm:ss"))));
+        m_stale->setText(
+            tr("Not read since %1").arg(QTime::currentTime().toString(QStringLiteral("hh:mm:ss"))));
     m_stale->show();
     showPage();
 }

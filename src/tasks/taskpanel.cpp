@@ -22,8 +22,8 @@
 #include <QLineEdit>
 #include <QPointer>
 #include <QScrollBar>
+#include <QStyle>
 #include <QThreadPool>
-#include <QTime>
 #include <QToolButton>
 #include <QTreeView>
 #include <QVBoxLayout>
@@ -94,7 +94,6 @@ TaskPanel::TaskPanel(QWidget *parent)
       m_page(new PanelPage(this)),
       m_tree(new QTreeView(m_page)),
       m_search(new QLineEdit(this)),
-      m_stale(new QLabel(this)),
       m_hint(new QLabel(this)) {
     setObjectName(QStringLiteral("taskPanel"));
     m_copy = addAction("copyTaskAction", tr("Copy"), &TaskPanel::copySelected);
@@ -105,17 +104,11 @@ TaskPanel::TaskPanel(QWidget *parent)
     m_remove = addAction("removeTaskAction", tr("Remove"), &TaskPanel::removeSelected);
     m_remove->setShortcut(QKeySequence::Delete);
     m_remove->setShortcutContext(Qt::WidgetShortcut);
-    m_stale->setObjectName(QStringLiteral("taskStaleLabel"));
-    m_stale->setProperty("role", QStringLiteral("warning"));
-    m_stale->setContentsMargins(12, 0, 12, 6);
-    m_stale->setWordWrap(true);
-    m_stale->hide();
     buildTree();
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
     layout->addWidget(buildFilterRow());
-    layout->addWidget(m_stale);
     layout->addWidget(m_page, 1);
     layout->addWidget(buildActionBar());
     connectParts();
@@ -246,7 +239,7 @@ void TaskPanel::connectParts() {
 }
 
 void TaskPanel::onTaskListUpdated() {
-    m_stale->hide();
+    m_staleSince = {};
     const TaskListPtr tasks = CTaskInfoPool::instance().taskList();
     for (const TaskAnnouncer::Announcement &each : m_announcer.follow(*tasks))
         Notifier::instance().ShowMessage(each.text, Notifier::Task, each.tid);
@@ -256,17 +249,16 @@ void TaskPanel::onTaskListUpdated() {
 
 void TaskPanel::onTaskListFailed() {
     // The time of the first failure is the age of what is shown.
-    if (m_stale->isHidden())
-        m_stale->setText(tr("The tasks could not be read since %1.")
-                             .arg(QTime::currentTime().toString(QStringLiteral("hh:mm:ss"))));
-    m_stale->show();
+    if (m_staleSince.isNull())
+        m_staleSince = QTime::currentTime();
+    showActions();
     showPage();
 }
 
 void TaskPanel::onCleared() {
     m_announcer.reset();
     TaskRepeats::instance().clear();
-    m_stale->hide();
+    m_staleSince = {};
     m_model->setTasks({});
     showPage();
     showActions();
@@ -308,8 +300,8 @@ void TaskPanel::showPage() {
     if (m_model->rowCount() > 0)
         m_page->showView();
     else if (!pool.isTaskListLoaded())
-        m_page->showText(m_stale->isHidden() ? tr("Loading tasks...")
-                                             : tr("The task list could not be read."));
+        m_page->showText(m_staleSince.isNull() ? tr("Loading tasks...")
+                                               : tr("The task list could not be read."));
     else if (pool.taskList()->isEmpty())
         m_page->showText(tr("No tasks.\nWhat is done to devices shows here."));
     else
@@ -348,14 +340,26 @@ void TaskPanel::showActions() {
     m_removeFinished->setEnabled(idle && std::any_of(all.begin(), all.end(), [](const TaskRecordPtr &task) {
                                      return isFinal(*task);
                                  }));
-    if (failures && !repeatable)
-        m_hint->setText(
-            tr("This client cannot retry the task: it was started elsewhere or before the last log-in, "
-               "so its settings are not known here."));
+    if (!m_staleSince.isNull())
+        showHint(tr("The tasks could not be read since %1.")
+                     .arg(m_staleSince.toString(QStringLiteral("hh:mm:ss"))),
+                 "warning");
+    else if (failures && !repeatable)
+        showHint(tr("This client cannot retry the task: it was started elsewhere or before the last log-in, "
+                    "so its settings are not known here."));
     else if (asksAgain)
-        m_hint->setText(tr("Retrying asks for the password or key again."));
+        showHint(tr("Retrying asks for the password or key again."));
     else
-        m_hint->setText(tasks.size() == 1 ? TaskTexts::origin(*tasks.front()) : QString());
+        showHint(tasks.size() == 1 ? TaskTexts::origin(*tasks.front()) : QString());
+}
+
+void TaskPanel::showHint(const QString &text, const char *role) {
+    m_hint->setText(text);
+    if (m_hint->property("role").toString() == QLatin1String(role))
+        return;
+    m_hint->setProperty("role", QLatin1String(role));
+    m_hint->style()->unpolish(m_hint);
+    m_hint->style()->polish(m_hint);
 }
 
 void TaskPanel::copySelected() {

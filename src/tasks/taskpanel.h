@@ -3,6 +3,7 @@
 #include "taskannouncer.h"
 #include "taskfilter.h"
 
+#include <QTime>
 #include <QWidget>
 
 class ListActions;
@@ -39,6 +40,7 @@ private:
     void showTasks(const std::vector<TaskRecordPtr> &tasks);
     void showPage();
     void showActions();
+    void showHint(const QString &text, const char *role = "quiet");
 
     void copySelected();
     void cancelSelected();
@@ -53,7 +55,6 @@ private:
     PanelPage *m_page;
     QTreeView *m_tree;
     QLineEdit *m_search;
-    QLabel *m_stale;
     QLabel *m_hint;
     QToolButton *m_removeFinished = nullptr;
     QAction *m_copy = nullptr;
@@ -62,5 +63,6 @@ private:
     QAction *m_remove = nullptr;
     TaskFilter m_filter;
     TaskAnnouncer m_announcer;
+    QTime m_staleSince; ///< when the list could not be read any more; null while it can
     bool m_searching = false;
 };
