@@ -8,8 +8,8 @@
 /// Runs one blocking job on a thread of its own, one job of the whole process at a time.
 ///
 /// Set up with a job and started, from the user-interface thread; a long-lived runner takes the next job when
-/// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that. A runner beside
-/// the turn does neither: it is for the polls, which nobody's click should wait for.
+/// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that. A runner
+/// beside the turn does neither: it is for the polls, which nobody's click should wait for.
 class NetTask : public QThread {
     Q_OBJECT
 

@@ -6,7 +6,8 @@
 
 #include <memory>
 
-/// Tasks, and below each a line that sums it up and its devices, which are put in order when they are looked at.
+/// Tasks, and below each a line that sums it up and its devices, which are put in order when they are looked
+/// at.
 ///
 /// Bringing a new list in changes only the rows that differ, so that selection, open rows and scroll position
 /// of the views stay.

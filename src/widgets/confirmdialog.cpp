@@ -63,10 +63,11 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
             ConfirmDialog::tr("Are you sure you want to restart device? This operation may take some time."),
             ConfirmDialog::tr("Restart")};
     case ConfirmDialog::Kind::DeleteSite:
-        return {ConfirmDialog::tr("Delete Site"),
-                ConfirmDialog::tr("Are you sure you want to delete the site? This action will also delete the "
-                                  "sub-site(s) and the copy of selected device(s) of each site and sub-site."),
-                ConfirmDialog::tr("Delete")};
+        return {
+            ConfirmDialog::tr("Delete Site"),
+            ConfirmDialog::tr("Are you sure you want to delete the site? This action will also delete the "
+                              "sub-site(s) and the copy of selected device(s) of each site and sub-site."),
+            ConfirmDialog::tr("Delete")};
     }
     return {};
 }
