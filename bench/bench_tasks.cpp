@@ -83,6 +83,8 @@ bool poll(LongestTurn &turns, const char *what) {
         QObject::connect(&pool, &CTaskInfoPool::taskListUpdated, [&] { good = ended = true; });
     const auto failed = QObject::connect(&pool, &CTaskInfoPool::taskListFailed, [&] { ended = true; });
     QApplication::processEvents();
+    // A poll is not begun while the last one's thread is still ending.
+    NetTask::waitForAll(10000);
     turns.take();
     const double time = milliseconds([&] {
         pool.loadTaskStatuses();
