@@ -1,5 +1,6 @@
 #include "devicewindow.h"
 
+#include "adddevicedialog.h"
 #include "clientstore.h"
 #include "consolecorner.h"
 #include "countedtabwidget.h"
@@ -169,6 +170,8 @@ void DeviceWindow::connectParts() {
     });
     QToolButton *refresh = m_toolBar->button(QStringLiteral("refreshButton"));
     connect(refresh, &QToolButton::clicked, this, &DeviceWindow::openRefreshDialog);
+    connect(m_toolBar->button(QStringLiteral("addDeviceButton")), &QToolButton::clicked, this,
+            &DeviceWindow::openAddDialog);
     connect(m_toolBar->button(QStringLiteral("restartButton")), &QToolButton::clicked, this,
             &DeviceWindow::on_restartButton_clicked);
     connect(m_toolBar->button(QStringLiteral("deleteButton")), &QToolButton::clicked, this,
@@ -186,6 +189,7 @@ void DeviceWindow::connectTable(const DeviceTab *tab) {
             [this, table](const QPoint &position) { DeviceMenus::showRowMenu(m_toolBar, table, position); });
     connect(table, &MainConsoleTable::columnMenuRequested, this,
             [table](const QPoint &position) { DeviceMenus::showColumnMenu(table, position); });
+    connect(tab, &DeviceTab::addDeviceRequested, this, &DeviceWindow::openAddDialog);
     connect(tab, &DeviceTab::clearFilterRequested, this, &DeviceWindow::clearFilter);
 }
 
@@ -299,6 +303,12 @@ void DeviceWindow::onTaskListUpdated() {
     const bool running = CTaskInfoPool::instance().hasRunningTask();
     if (std::exchange(m_tasksRunning, running) && !running)
         emit allTasksDone();
+}
+
+void DeviceWindow::openAddDialog() {
+    auto *dialog = new AddDeviceDialog(m_inventory.snapshot(), this);
+    connect(dialog, &AddDeviceDialog::devicesAdded, this, &DeviceWindow::reload);
+    dialog->open();
 }
 
 void DeviceWindow::on_restartButton_clicked() {

@@ -75,6 +75,7 @@ private:
 
     void onTick();
     void onTaskListUpdated();
+    void openAddDialog();
     void on_restartButton_clicked();
     void on_deleteButton_clicked();
     void exportDeviceList();

@@ -1,0 +1,384 @@
+#include "adddevicedialog.h"
+
+#include "adddevicemanualdialog.h"
+#include "csvdevices.h"
+#include "devicecommit.h"
+#include "discoveredmodel.h"
+#include "filedialogs.h"
+#include "icons.h"
+#include "pagereader.h"
+#include "sitelist.h"
+#include "storewriter.h"
+#include "transientmessage.h"
+#include "ui_adddevicedialog.h"
+
+#include <QAction>
+#include <QDebug>
+#include <QFileDialog>
+#include <QThreadPool>
+
+#include <nlohmann/json.hpp>
+
+#include <unordered_set>
+
+struct AddDeviceDialog::Addition {
+    unsigned result = ApiOk;
+    unsigned check = ApiOk; ///< of reading the list back
+    std::vector<DeviceRecordPtr> missing;
+};
+
+namespace {
+
+constexpr int pageSize = 500;
+
+std::string macOf(const JSON &record) {
+    return DeviceRecords::identityOf({{"d_mac", std::string(textMember(record, "d_mac"))}}).toStdString();
+}
+
+/// The record as it came; what is managed at all is in the overview.
+JSON recordToAdd(const DeviceRecord &device) {
+    JSON record = parseJson(device.json);
+    if (device.siteIds.contains(Sites::overviewId))
+        return record;
+    JSON sites = JSON::array({Sites::overviewId.toStdString()});
+    for (const QString &id : device.siteIds)
+        sites.push_back(id.toStdString());
+    record["siteid"] = std::move(sites);
+    return record;
+}
+
+QByteArray listText(const std::vector<DeviceRecordPtr> &devices) {
+    QByteArray text = "[";
+    for (const DeviceRecordPtr &device : devices)
+        text.append(text.size() > 1 ? "," : "").append(device->json.c_str());
+    return text + ']';
+}
+
+void logSelected(const std::vector<DeviceRecordPtr> &devices) {
+    QThreadPool::globalInstance()->start([devices] {
+        int row = 0;
+        for (const DeviceRecordPtr &device : devices)
+            qDebug("add selected row device: %d, json string: %s", row++, device->json.c_str());
+    });
+}
+
+void logImported(const std::vector<DeviceRecordPtr> &imported, const std::vector<DeviceRecordPtr> &listed) {
+    QThreadPool::globalInstance()->start([imported, listed] {
+        qDebug("Found csv devices(%d): %s", static_cast<int>(imported.size()),
+               listText(imported).constData());
+        qDebug("current devices(%d): %s", static_cast<int>(listed.size()), listText(listed).constData());
+    });
+}
+
+QString folderOfFiles() {
+    return CLocalStore::instance().defaultFilePath();
+}
+
+void askOpenPath(QWidget *parent, const QString &title, const std::function<void(const QString &)> &chosen) {
+    auto *dialog = new QFileDialog(parent, title, folderOfFiles(), QStringLiteral("csv File(*.csv)"));
+    dialog->setObjectName(QStringLiteral("openFileDialog"));
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->setFileMode(QFileDialog::ExistingFile);
+    QObject::connect(dialog, &QFileDialog::fileSelected, parent, chosen);
+    dialog->open();
+}
+
+} // namespace
+
+AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *parent)
+    : FramelessDialog(parent),
+      m_ui(formIn<Ui::AddDeviceDialog>(content())),
+      m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
+      m_model(new DiscoveredModel(*managed, this)),
+      m_discovery(new DeviceDiscovery(this)) {
+    setObjectName(QStringLiteral("AddDeviceDialog"));
+    setWindowTitle(tr("Add Device"));
+    m_askOpenPath = [this](const auto &chosen) { askOpenPath(this, tr("Open File"), chosen); };
+    m_askSavePath = [this](const auto &chosen) {
+        const QString name = tr("Devices") + QStringLiteral(".csv");
+        const QString folder = folderOfFiles();
+        FileDialogs::askSavePath(this, tr("Save as"), folder.isEmpty() ? name : folder + u'/' + name,
+                                 QStringLiteral("csv File(*.csv)"), QStringLiteral("csv"), chosen);
+    };
+    m_ui->discoveredTable->setModel(m_model);
+    m_ui->searchEdit->addAction(
+        Icons::icon(QStringLiteral(":/images/icon_general_search_line.svg"), {16, 16}),
+        QLineEdit::LeadingPosition);
+    // What comes and goes must not move what stands beside it.
+    QSizePolicy policy = m_ui->spinner->sizePolicy();
+    policy.setRetainSizeWhenHidden(true);
+    m_ui->spinner->setSizePolicy(policy);
+    connectParts();
+    updateSelection();
+    updateState();
+}
+
+AddDeviceDialog::~AddDeviceDialog() = default;
+
+void AddDeviceDialog::connectParts() {
+    connect(m_model, &DiscoveredModel::changed, this, [this] {
+        updateSelection();
+        updateState();
+    });
+    connect(m_discovery, &DeviceDiscovery::found, this, &AddDeviceDialog::onFound);
+    connect(m_discovery, &DeviceDiscovery::progressed, this, &AddDeviceDialog::updateState);
+    connect(m_discovery, &DeviceDiscovery::failed, this, [this](const QString &reason) {
+        m_failure = reason;
+        m_warning.setText(tr("The search failed: %1.").arg(reason));
+        updateState();
+    });
+    connect(m_ui->searchEdit, &QLineEdit::textChanged, m_model, &DiscoveredModel::setSearch);
+    connect(m_ui->selectAllCheckBox, &QCheckBox::clicked, this,
+            [this] { m_model->setShownChecked(m_model->shownState() != Qt::Checked); });
+    connect(m_ui->refreshButton, &QPushButton::clicked, this, &AddDeviceDialog::deviceAutoDiscovery);
+    connect(m_ui->addManuallyButton, &QPushButton::clicked, this, &AddDeviceDialog::openManualDialog);
+    connect(m_ui->importCsvButton, &QPushButton::clicked, this,
+            [this] { m_askOpenPath([this](const QString &path) { importCsv(path); }); });
+    connect(m_ui->templateButton, &QToolButton::clicked, this,
+            [this] { m_askSavePath([this](const QString &path) { saveTemplate(path); }); });
+    connect(m_ui->addButton, &QPushButton::clicked, this, &AddDeviceDialog::on_addButton_clicked);
+    connect(m_ui->cancelButton, &QPushButton::clicked, this, &QDialog::reject);
+    connect(this, &QDialog::finished, this, [this] {
+        if (!m_adding)
+            deleteLater();
+    });
+}
+
+void AddDeviceDialog::showEvent(QShowEvent *event) {
+    FramelessDialog::showEvent(event);
+    if (!m_searched)
+        deviceAutoDiscovery();
+}
+
+void AddDeviceDialog::deviceAutoDiscovery() {
+    m_searched = true;
+    m_warning.setText({});
+    m_failure.clear();
+    m_knownFound = 0;
+    m_model->clear();
+    m_discovery->start({});
+}
+
+void AddDeviceDialog::openManualDialog() {
+    auto *dialog = new AddDeviceManualDialog(this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    connect(dialog, &AddDeviceManualDialog::discoveryRequested, this,
+            &AddDeviceDialog::onDeviceManualDiscovery);
+    dialog->open();
+}
+
+void AddDeviceDialog::onDeviceManualDiscovery(DeviceDiscovery::Method method, const QString &from,
+                                              const QString &to) {
+    qDebug("onDeviceManualDiscovery: method: %d, ip from: %s to %s", static_cast<int>(method),
+           qUtf8Printable(from), qUtf8Printable(to));
+    m_warning.setText({});
+    m_failure.clear();
+    m_discovery->start({method, from, to});
+}
+
+void AddDeviceDialog::onFound(const DeviceDiscovery::Search &search,
+                              const std::vector<DeviceRecordPtr> &devices) {
+    const bool isManual = search.method != DeviceDiscovery::Method::Network;
+    const int added = m_model->add(devices, isManual ? DeviceSource::Manual : DeviceSource::Network);
+    m_knownFound = static_cast<int>(devices.size()) - added;
+    updateState();
+    if (!isManual || added > 0)
+        return;
+    if (!devices.empty())
+        m_warning.setText(tr("The device(s) found there are managed or listed already."));
+    else if (search.method == DeviceDiscovery::Method::Address)
+        m_warning.setText(tr("No device was found at %1.").arg(search.from));
+    else
+        m_warning.setText(tr("No device was found from %1 to %2.").arg(search.from, search.to));
+}
+
+/// Runs a job on a file beside the turn of the requests.
+template <typename Work, typename Done>
+void AddDeviceDialog::runOnFile(const QString &path, Work work, Done done) {
+    StoreWriter::post([path] { CLocalStore::instance().setDefaultFilePath(QFileInfo(path).absolutePath()); });
+    m_warning.setText({});
+    m_onFile = true;
+    const auto ended = [this](JobEnd end) {
+        m_onFile = false;
+        updateState();
+        if (end != JobEnd::Delivered)
+            m_warning.setText(tr("Nothing was done with the file: %1.").arg(DeviceDiscovery::reasonOf(end)));
+    };
+    auto *runner = NetJob::createRunner("working on a device file", NetTask::Turn::Beside);
+    if (!NetJob::post(runner, this, work, done, ended))
+        ended(JobEnd::NotRun);
+    updateState();
+}
+
+void AddDeviceDialog::importCsv(const QString &path) {
+    runOnFile(
+        path, [path] { return CsvDevices::readFile(path); },
+        [this, path](const CsvDevices::Reading &reading) { onCsvRead(QFileInfo(path).fileName(), reading); });
+}
+
+void AddDeviceDialog::saveTemplate(const QString &path) {
+    runOnFile(
+        path, [path] { return CsvDevices::writeTemplate(path); },
+        [this](const QString &error) {
+            if (error.isEmpty())
+                tell(tr("The template was written."));
+            else
+                m_warning.setText(tr("The template could not be written: %1.").arg(error));
+        });
+}
+
+void AddDeviceDialog::onCsvRead(const QString &name, const CsvDevices::Reading &reading) {
+    if (!reading.error.isEmpty())
+        return m_warning.setText(tr("The file \"%1\" could not be read: %2.").arg(name, reading.error));
+    logImported(reading.devices, m_model->devices());
+    const int added = m_model->add(reading.devices, DeviceSource::File);
+    const int known = static_cast<int>(reading.devices.size()) - added;
+    if (added > 0)
+        tell(tr("%n device(s) added to the list.", nullptr, added));
+    if (reading.devices.empty() && reading.refused.empty())
+        m_warning.setText(tr("There is no device in the file \"%1\".").arg(name));
+    else if (known > 0)
+        m_warning.setText(tr("%n device(s) of the file are managed or listed already.", nullptr, known));
+    if (reading.refused.empty())
+        return;
+    std::vector<InvalidDeviceDialog::Entry> entries;
+    for (const CsvDevices::RefusedRow &row : reading.refused)
+        entries.push_back({tr("Line %1").arg(row.line), row.reason});
+    const int refused = static_cast<int>(entries.size());
+    listInvalid(tr("%n row(s) of the file \"%1\" could not be read.", nullptr, refused).arg(name), entries);
+}
+
+void AddDeviceDialog::on_addButton_clicked() {
+    const std::vector<DeviceRecordPtr> devices = m_model->checkedDevices();
+    if (devices.empty() || m_adding)
+        return;
+    logSelected(devices);
+    m_warning.setText({});
+    m_adding = true;
+    DeviceDiscovery::request(
+        this, "adding devices", [devices](ServiceSession &session) { return addTo(session, devices); },
+        [this, count = static_cast<int>(devices.size())](const Addition &addition) {
+            onAdded(addition, count);
+        },
+        [this](const QString &reason) { onAddFailed(reason); });
+    updateState();
+}
+
+/// Sends the devices and looks which of them the service has after that.
+AddDeviceDialog::Addition AddDeviceDialog::addTo(ServiceSession &session,
+                                                 const std::vector<DeviceRecordPtr> &devices) {
+    JSON records = JSON::array();
+    for (const DeviceRecordPtr &device : devices)
+        records.push_back(recordToAdd(*device));
+    Addition addition;
+    addition.result = DeviceCommit::send(session, records);
+    if (addition.result != ApiOk)
+        return addition;
+    std::unordered_set<std::string> present;
+    addition.check = PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
+        for (const JSON &record : page)
+            present.insert(macOf(record));
+    });
+    for (std::size_t i = 0; addition.check == ApiOk && i < devices.size(); ++i) {
+        if (!present.contains(macOf(records[i])))
+            addition.missing.push_back(devices[i]);
+    }
+    return addition;
+}
+
+void AddDeviceDialog::onAdded(const Addition &addition, int count) {
+    if (addition.result != ApiOk)
+        return onAddFailed(apiResultText(addition.result));
+    m_adding = false;
+    accept();
+    const int missing = static_cast<int>(addition.missing.size());
+    if (addition.check != ApiOk)
+        tell(tr("%n device(s) sent; whether the server lists them could not be checked: %1.", nullptr, count)
+                 .arg(apiResultText(addition.check)));
+    else if (missing < count)
+        tell(tr("%n device(s) added.", nullptr, count - missing));
+    std::vector<InvalidDeviceDialog::Entry> entries;
+    for (const DeviceRecordPtr &device : addition.missing)
+        entries.push_back({tr("%1, %2").arg(device->text(DeviceColumn::Ip), device->text(DeviceColumn::Mac)),
+                           tr("The server does not list the device after it was sent.")});
+    if (missing > 0)
+        listInvalid(tr("%n device(s) could not be added.", nullptr, missing), entries);
+    emit devicesAdded();
+}
+
+void AddDeviceDialog::onAddFailed(const QString &reason) {
+    m_adding = false;
+    const QString message = tr("The devices could not be added: %1.").arg(reason);
+    m_warning.setText(message);
+    updateState();
+    if (isVisible())
+        return;
+    tell(message);
+    deleteLater();
+}
+
+void AddDeviceDialog::tell(const QString &message) {
+    if (QWidget *over = isVisible() ? this : parentWidget())
+        TransientMessage::show(over, message);
+}
+
+void AddDeviceDialog::listInvalid(const QString &message,
+                                  const std::vector<InvalidDeviceDialog::Entry> &entries) {
+    auto *dialog = new InvalidDeviceDialog(message, entries, isVisible() ? this : parentWidget());
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->open();
+}
+
+void AddDeviceDialog::updateSelection() {
+    m_ui->countLabel->setText(
+        tr("%1 of %2 devices selected").arg(m_model->checkedCount()).arg(m_model->deviceCount()));
+    m_ui->selectAllCheckBox->setCheckState(m_model->shownState());
+}
+
+void AddDeviceDialog::updateState() {
+    const QString wait = waitText();
+    m_ui->spinner->setVisible(!wait.isEmpty());
+    m_ui->waitLabel->setText(wait);
+    for (QWidget *button : std::initializer_list<QWidget *>{m_ui->refreshButton, m_ui->addManuallyButton,
+                                                            m_ui->importCsvButton, m_ui->templateButton})
+        button->setEnabled(!m_adding && !m_onFile);
+    m_ui->addButton->setEnabled(!m_adding && !m_onFile && m_model->checkedCount() > 0);
+    m_ui->cancelButton->setText(m_adding ? tr("Close") : tr("Cancel"));
+    const bool hasRows = m_model->rowCount() > 0;
+    m_ui->selectAllCheckBox->setEnabled(hasRows && !m_adding);
+    m_ui->discoveredTable->setEnabled(!m_adding);
+    updateEmptyPage();
+    m_ui->contentStack->setCurrentWidget(hasRows ? m_ui->tablePage : m_ui->emptyPage);
+}
+
+QString AddDeviceDialog::waitText() const {
+    if (m_adding)
+        return tr("Adding...");
+    if (m_onFile)
+        return tr("Working on the file...");
+    if (!m_discovery->isSearching())
+        return {};
+    const int passed = m_discovery->passedSeconds();
+    if (passed == DeviceDiscovery::scanSeconds)
+        return tr("Reading what was found...");
+    return tr("Searching... %1 of %2 seconds").arg(passed).arg(DeviceDiscovery::scanSeconds);
+}
+
+void AddDeviceDialog::updateEmptyPage() {
+    if (m_model->deviceCount() > 0) {
+        m_ui->emptyTitleLabel->setText(tr("No device matches"));
+        m_ui->emptyHintLabel->setText(tr("The search leaves none of the devices."));
+    } else if (m_discovery->isSearching()) {
+        m_ui->emptyTitleLabel->setText(tr("Searching for devices..."));
+        m_ui->emptyHintLabel->setText(tr("The server looks for devices on its network."));
+    } else if (!m_failure.isEmpty()) {
+        m_ui->emptyTitleLabel->setText(tr("The search failed"));
+        m_ui->emptyHintLabel->setText(tr("Press Refresh to try again."));
+    } else {
+        m_ui->emptyTitleLabel->setText(tr("No new device found"));
+        m_ui->emptyHintLabel->setText(
+            m_knownFound > 0 ? tr("%n device(s) answered, which are managed already.", nullptr, m_knownFound)
+                             : tr("Devices that the server does not reach by itself can be added manually or "
+                                  "from a file."));
+    }
+}

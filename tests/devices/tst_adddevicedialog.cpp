@@ -1,0 +1,276 @@
+#include "adddevicedialog.h"
+#include "adddevicemanualdialog.h"
+#include "apiclient.h"
+#include "devicemaker.h"
+#include "discoveredmodel.h"
+#include "discoveredtable.h"
+#include "emulatorprocess.h"
+#include "invaliddevicedialog.h"
+#include "iplineedit.h"
+#include "isolatedroot.h"
+#include "localstore.h"
+#include "logcapture.h"
+#include "nettask.h"
+#include "servicesession.h"
+#include "storewriter.h"
+
+#include <QCheckBox>
+#include <QClipboard>
+#include <QLabel>
+#include <QPointer>
+#include <QPushButton>
+#include <QSignalSpy>
+#include <QTabWidget>
+#include <QTableWidget>
+#include <QTest>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+const char *account = "admin@norvell.example";
+const char *password = "Passw0rd!";
+/// A search takes five seconds.
+constexpr int patienceMs = 12000;
+
+} // namespace
+
+class TestAddDeviceDialog : public QObject {
+    Q_OBJECT
+
+private slots:
+    void cleanup() {
+        delete m_dialog;
+        CLocalStore::instance().clearLoginInfo();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        m_service.kill();
+    }
+
+    void addressesAreTypedAndPasted() {
+        IPLineEdit edit;
+        QSignalSpy validity(&edit, &IPLineEdit::validityChanged);
+        QTest::keyClicks(&edit, "10.a0.2569");
+        QCOMPARE(edit.text(), QStringLiteral("10.0.25"));
+        QVERIFY(edit.address().isEmpty());
+        QVERIFY(!edit.isValid());
+        edit.clear();
+        QGuiApplication::clipboard()->setText(" 10. 0.25.01\t");
+        edit.paste();
+        QCOMPARE(edit.address(), QStringLiteral("10.0.25.1"));
+        QCOMPARE(validity.size(), 1);
+        edit.setText("10.0.25.");
+        QCOMPARE(validity.size(), 2);
+        QVERIFY(!validity[1][0].toBool());
+    }
+
+    void rangesAreJudged_data() {
+        QTest::addColumn<QString>("from");
+        QTest::addColumn<QString>("to");
+        QTest::addColumn<QString>("size");
+        QTest::addColumn<QString>("warning"); // a part of it; empty where the range is taken
+        const auto range = [](const char *from, const char *to, const char *size, const char *warning) {
+            QTest::addRow("%s-%s", from, to) << from << to << size << warning;
+        };
+        range("10.0.0.1", "10.0.0.1", "1 address", "");
+        range("10.0.0.1", "10.0.0.254", "254 addresses", "");
+        range("10.0.0.0", "10.0.255.255", "65,536 addresses", "");
+        range("10.0.0.0", "10.1.0.0", "65,537 addresses", "65,536 are the most");
+        range("0.0.0.0", "255.255.255.255", "4,294,967,296 addresses", "65,536 are the most");
+        range("10.0.0.2", "10.0.0.1", "", "ends before it begins");
+        range("10.0.0.2", "", "", "The field can't be empty.");
+        range("10.0.0.2", "10.0.0", "", "four numbers");
+    }
+    void rangesAreJudged() {
+        QFETCH(QString, from);
+        QFETCH(QString, to);
+        QFETCH(QString, warning);
+        AddDeviceManualDialog dialog;
+        dialog.show();
+        QSignalSpy requests(&dialog, &AddDeviceManualDialog::discoveryRequested);
+        dialog.findChild<QTabWidget *>("manualTabs")->setCurrentIndex(1);
+        QTest::keyClicks(dialog.findChild<QLineEdit *>("fromEdit"), from);
+        QTest::keyClicks(dialog.findChild<QLineEdit *>("toEdit"), to);
+        QTEST(dialog.findChild<QLabel *>("rangeLabel")->text(), "size");
+        QTest::mouseClick(dialog.findChild<QPushButton *>("addButton"), Qt::LeftButton);
+        const QString told = dialog.findChild<QLabel *>("msgWarningLabel")->text();
+        QVERIFY2(warning.isEmpty() ? told.isEmpty() : told.contains(warning), qPrintable(told));
+        QCOMPARE(requests.size(), warning.isEmpty() ? 1 : 0);
+        QCOMPARE(dialog.isVisible(), !warning.isEmpty());
+    }
+
+    void listKnowsDevicesByTheirMac() {
+        const auto devices = [](const std::vector<std::pair<int, const char *>> &list) {
+            std::vector<DeviceRecordPtr> records;
+            for (const auto &[last, mac] : list)
+                records.push_back(DeviceRecords::parse(
+                    {{"d_mac", mac}, {"d_ip", "10.0.0." + std::to_string(last)}, {"d_model", "<b>N</b>"}}));
+            return records;
+        };
+        DiscoveredModel model(
+            *DeviceMaker::snapshot({DeviceMaker::record(1, {{"d_mac", "AA:BB:CC:DD:EE:01"}})}));
+        QCOMPARE(model.add(devices({{100, "aabbccddee01"}, {100, "aa-bb-cc-dd-ee-02"}, {20, "AABBCCDDEE03"}}),
+                           DeviceSource::Network),
+                 2);
+        QCOMPARE(model.add(devices({{9, "AA:BB:CC:DD:EE:02"}, {9, "aabb.ccdd.ee04"}}), DeviceSource::File),
+                 1);
+        const auto addresses = [&model] {
+            QStringList texts;
+            for (int row = 0; row < model.rowCount(); ++row)
+                texts += model.index(row, DiscoveredModel::IpColumn).data().toString();
+            return texts;
+        };
+        QCOMPARE(addresses(), (QStringList{"10.0.0.9", "10.0.0.20", "10.0.0.100"}));
+        const QPersistentModelIndex kept = model.index(0, 0);
+        QVERIFY(model.setData(kept, Qt::Checked, Qt::CheckStateRole));
+        model.sort(DiscoveredModel::IpColumn, Qt::DescendingOrder);
+        QCOMPARE(kept.row(), 2);
+        model.setSearch("10.0.0.100");
+        QCOMPARE(model.shownState(), Qt::Unchecked);
+        model.setShownChecked(true);
+        QCOMPARE(model.shownState(), Qt::Checked);
+        model.setSearch({});
+        QCOMPARE(model.shownState(), Qt::PartiallyChecked);
+        QCOMPARE(model.checkedDevices().size(), 2u);
+    }
+
+    void foundDevicesAreAdded() {
+        workOn({});
+        const LogCapture log;
+        QSignalSpy added(m_dialog, &AddDeviceDialog::devicesAdded);
+        button("refreshButton")->click();
+        QVERIFY(text("waitLabel").startsWith("Searching... 0 of 5"));
+        QTRY_VERIFY_WITH_TIMEOUT(text("waitLabel").startsWith("Searching... 3 of 5"), patienceMs);
+        QTRY_COMPARE_WITH_TIMEOUT(table()->model()->rowCount(), 40, patienceMs);
+        // Opened and refreshed: two searches with a reading each, and no device twice.
+        QTRY_COMPARE_WITH_TIMEOUT(log.count("Found jNewDevices(45): ["), 2, patienceMs);
+        QTRY_VERIFY(text("waitLabel").isEmpty());
+        QCOMPARE(table()->model()->rowCount(), 40);
+        QCOMPARE(text("countLabel"), QStringLiteral("0 of 40 devices selected"));
+        QVERIFY(!button("addButton")->isEnabled());
+
+        auto *search = m_dialog->findChild<QLineEdit *>("searchEdit");
+        QTest::keyClicks(search, "10.99.0.10-12");
+        QCOMPARE(table()->model()->rowCount(), 3);
+        m_dialog->findChild<QCheckBox *>("selectAllCheckBox")->click();
+        QTest::mouseClick(table()->viewport(), Qt::LeftButton, {}, QPoint(16, 36 + 18));
+        QCOMPARE(text("countLabel"), QStringLiteral("2 of 40 devices selected"));
+        QTest::keyClick(table(), Qt::Key_Space);
+        QCOMPARE(text("countLabel"), QStringLiteral("3 of 40 devices selected"));
+        search->setText("nothing");
+        QCOMPARE(text("emptyTitleLabel"), QStringLiteral("No device matches"));
+
+        QVERIFY(m_service.command("fault code=3@/v1/dev/commit,times=1").startsWith("ok"));
+        button("addButton")->click();
+        QCOMPARE(text("waitLabel"), QStringLiteral("Adding..."));
+        QVERIFY(!button("addButton")->isEnabled() && !button("refreshButton")->isEnabled());
+        QTRY_COMPARE_WITH_TIMEOUT(text("msgWarningLabel"),
+                                  QStringLiteral("The devices could not be added: the server refused it."),
+                                  patienceMs);
+        QCOMPARE(text("countLabel"), QStringLiteral("3 of 40 devices selected"));
+        QVERIFY(added.isEmpty());
+
+        button("addButton")->click();
+        QTRY_COMPARE_WITH_TIMEOUT(added.size(), 1, patienceMs);
+        QTRY_VERIFY(!m_dialog);
+        QCOMPARE(managed().size(), 23u);
+    }
+
+    void addressIsSearchedOnceNetworkIsDone() {
+        workOn({"--fault", "code=3@/v1/dev/scan,times=1"});
+        QTRY_VERIFY_WITH_TIMEOUT(text("msgWarningLabel").contains("the server refused it"), patienceMs);
+        QCOMPARE(text("emptyTitleLabel"), QStringLiteral("The search failed"));
+        QTRY_VERIFY(text("waitLabel").isEmpty());
+        const LogCapture log;
+        m_dialog->onDeviceManualDiscovery(DeviceDiscovery::Method::Address, "10.99.0.200", {});
+        button("addManuallyButton")->click();
+        auto *manual = m_dialog->findChild<AddDeviceManualDialog *>();
+        QTest::keyClicks(manual->findChild<QLineEdit *>("addressEdit"), "10.99.0.11");
+        QTest::mouseClick(manual->findChild<QPushButton *>("addButton"), Qt::LeftButton);
+        QCOMPARE(log.count("manual add from ip: 10.99.0.11, port: 0"), 1);
+        QTRY_COMPARE_WITH_TIMEOUT(text("msgWarningLabel"),
+                                  QStringLiteral("No device was found at 10.99.0.200."), patienceMs);
+        QVERIFY2(!text("waitLabel").isEmpty(), "the second search waited for the first one");
+        QTRY_COMPARE_WITH_TIMEOUT(table()->model()->rowCount(), 1, patienceMs);
+        QCOMPARE(table()->model()->index(0, DiscoveredModel::IpColumn).data().toString(),
+                 QStringLiteral("10.99.0.11"));
+    }
+
+    void fileIsImportedAndClosingLosesNothing_data() {
+        QTest::addColumn<QStringList>("arguments");
+        QTest::addColumn<int>("taken");
+        QTest::newRow("taken") << QStringList() << 2;
+        QTest::newRow("accepted, not taken") << QStringList{"--fault", "code=0@/v1/dev/commit"} << 0;
+    }
+    void fileIsImportedAndClosingLosesNothing() {
+        QFETCH(QStringList, arguments);
+        QFETCH(int, taken);
+        workOn(arguments);
+        QVERIFY(m_root.write("cams.csv", "Model,IP,MAC,HTTP Port,HTTPS Port\n"
+                                         "N-1,10.0.0.1,02:00:00:00:00:01,80,443\n"
+                                         "N-2,10.0.0.2,bad,80,443\n"
+                                         "N-3,10.0.0.3,02:00:00:00:00:03,80,443\n"));
+        m_dialog->setAskOpenPath([this](const auto &chosen) { chosen(m_root.filePath("cams.csv")); });
+        button("importCsvButton")->click();
+        QTRY_COMPARE(table()->model()->rowCount(), 2);
+        auto *invalid = m_dialog->findChild<InvalidDeviceDialog *>();
+        QVERIFY(invalid && invalid->isVisible());
+        QVERIFY(invalid->findChild<QLabel *>("messageLabel")->text().contains("cams.csv"));
+        auto *list = invalid->findChild<QTableWidget *>("invalidTable");
+        QCOMPARE(list->item(0, 0)->text(), QStringLiteral("Line 3"));
+        QCOMPARE(list->item(0, 1)->text(), QStringLiteral("\"bad\" is no MAC address."));
+        invalid->accept();
+        StoreWriter::flush();
+        QCOMPARE(CLocalStore::instance().defaultFilePath(), m_root.path());
+
+        QSignalSpy added(m_dialog, &AddDeviceDialog::devicesAdded);
+        m_dialog->findChild<QCheckBox *>("selectAllCheckBox")->click();
+        button("addButton")->click();
+        m_dialog->reject();
+        QVERIFY(!m_dialog->isVisible());
+        QTRY_COMPARE_WITH_TIMEOUT(added.size(), 1, patienceMs);
+        QTRY_VERIFY(!m_dialog);
+        QCOMPARE(int(managed().size()), 20 + taken);
+        const auto *missing = qobject_cast<InvalidDeviceDialog *>(QApplication::activeModalWidget());
+        QCOMPARE(missing != nullptr, taken == 0);
+        if (missing)
+            QCOMPARE(missing->findChild<QTableWidget *>("invalidTable")->item(1, 0)->text(),
+                     QStringLiteral("10.0.0.3, 02:00:00:00:00:03"));
+        delete missing;
+    }
+
+private:
+    void workOn(const QStringList &arguments) {
+        QVERIFY(m_service.start(QStringList{"--fresh", "--devices", "20", "--account",
+                                            QString::fromLatin1(account) + u':' + password} +
+                                arguments));
+        unsigned result = ApiException;
+        NetTask::runAndWait(
+            [&] { result = CApiClient("127.0.0.1", m_service.port()).loginServer(account, password); });
+        QCOMPARE(result, unsigned(ApiOk));
+        CLocalStore &store = CLocalStore::instance();
+        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access());
+        const JSON devices = managed();
+        m_dialog = new AddDeviceDialog(DeviceMaker::snapshot({devices.begin(), devices.end()}));
+        m_dialog->open();
+        QVERIFY(QTest::qWaitForWindowExposed(m_dialog));
+    }
+    static JSON managed() {
+        JSON devices;
+        NetTask::runAndWait([&] {
+            ServiceSession(CLocalStore::instance().loginInfo()).call([&](CApiClient &client) {
+                return client.listDevices(0, 500, devices);
+            });
+        });
+        return devices;
+    }
+    QPushButton *button(const char *name) const { return m_dialog->findChild<QPushButton *>(name); }
+    QString text(const char *name) const { return m_dialog->findChild<QLabel *>(name)->text(); }
+    DiscoveredTable *table() const { return m_dialog->findChild<DiscoveredTable *>("discoveredTable"); }
+
+    IsolatedRoot m_root;
+    EmulatorProcess m_service{m_root.path()};
+    QPointer<AddDeviceDialog> m_dialog;
+};
+
+QTEST_MAIN(TestAddDeviceDialog)
+#include "tst_adddevicedialog.moc"
