@@ -108,9 +108,13 @@ void DeviceActions::commit(const QString &name, std::function<Change()> change,
         },
         [this, name, succeeded](const Result &result) {
             emit devicesChanged();
-            if (result.code != ApiOk)
+            // Only a refusal says for sure that nothing was done; an answer that is lost says nothing.
+            if (result.code == ApiServerError)
                 return emit failed(
                     tr("%1 failed: %2. Nothing was changed.").arg(name, apiResultText(result.code)));
+            if (result.code != ApiOk)
+                return emit failed(tr("%1 may have failed: %2. Look at the list before you try again.")
+                                       .arg(name, apiResultText(result.code)));
             emit done(result.message);
             if (succeeded)
                 succeeded();

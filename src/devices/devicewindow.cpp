@@ -230,6 +230,7 @@ void DeviceWindow::stopWork() {
     m_reloadWanted = false;
     m_everRead = false;
     m_lastReadFailed = false;
+    m_tasksRunning = false;
     m_online = false;
     m_inventory.replace(std::make_shared<DeviceSnapshot>(), {});
     m_siteTree->forgetSites();
