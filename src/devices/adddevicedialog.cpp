@@ -100,7 +100,7 @@ AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *pare
         FileDialogs::askSavePath(this, tr("Save as"), folder.isEmpty() ? name : folder + u'/' + name,
                                  QStringLiteral("csv File(*.csv)"), QStringLiteral("csv"), chosen);
     };
-    m_ui->discoveredTable->setModel(m_model);
+    m_ui->discoveredTable->showList(m_model, {150, 170, 140, 170, 110}, DiscoveredModel::IpColumn);
     m_ui->searchEdit->addAction(
         Icons::icon(QStringLiteral(":/images/icon_general_search_line.svg"), {16, 16}),
         QLineEdit::LeadingPosition);
@@ -331,7 +331,7 @@ void AddDeviceDialog::listInvalid(const QString &message,
 
 void AddDeviceDialog::updateSelection() {
     m_ui->countLabel->setText(
-        tr("%1 of %2 devices selected").arg(m_model->checkedCount()).arg(m_model->deviceCount()));
+        tr("%1 of %2 devices selected").arg(m_model->checkedCount()).arg(m_model->itemCount()));
     m_ui->selectAllCheckBox->setCheckState(m_model->shownState());
 }
 
@@ -365,7 +365,7 @@ QString AddDeviceDialog::waitText() const {
 }
 
 void AddDeviceDialog::updateEmptyPage() {
-    if (m_model->deviceCount() > 0) {
+    if (m_model->itemCount() > 0) {
         m_ui->emptyTitleLabel->setText(tr("No device matches"));
         m_ui->emptyHintLabel->setText(tr("The search leaves none of the devices."));
     } else if (m_discovery->isSearching()) {

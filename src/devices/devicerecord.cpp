@@ -250,4 +250,17 @@ QString columnTitle(DeviceColumn column) {
     return QCoreApplication::translate(context, titles[static_cast<std::size_t>(column)]);
 }
 
+int compare(const DeviceRecord &left, const DeviceRecord &right, DeviceColumn column, bool ascending) {
+    const auto order = [ascending](bool smaller) { return smaller == ascending ? -1 : 1; };
+    const quint64 leftKey = left.sortKey(column);
+    const quint64 rightKey = right.sortKey(column);
+    if (leftKey != rightKey) {
+        if (leftKey == DeviceRecord::unknownKey || rightKey == DeviceRecord::unknownKey)
+            return rightKey == DeviceRecord::unknownKey ? -1 : 1;
+        return order(leftKey < rightKey);
+    }
+    const int texts = left.text(column).compare(right.text(column), Qt::CaseInsensitive);
+    return texts == 0 ? 0 : order(texts < 0);
+}
+
 } // namespace DeviceRecords

@@ -71,6 +71,10 @@ QString identityOf(const JSON &value);
 /// The header text of a column.
 QString columnTitle(DeviceColumn column);
 
+/// Less than 0 where the left record comes before the right one in an order by the column. What is unknown
+/// comes last either way.
+int compare(const DeviceRecord &left, const DeviceRecord &right, DeviceColumn column, bool ascending);
+
 /// A dotted IPv4 address as a number for sorting, unknownKey for any other text.
 quint64 ipSortKey(QStringView text);
 

@@ -6,8 +6,6 @@
 #include <QDebug>
 #include <QThreadPool>
 
-#include <algorithm>
-
 namespace {
 
 constexpr DeviceColumn deviceColumns[DiscoveredModel::columnTotal] = {
@@ -48,18 +46,17 @@ void log(std::vector<Taken> devices) {
 
 } // namespace
 
-DiscoveredModel::DiscoveredModel(const DeviceSnapshot &managed, QObject *parent)
-    : QAbstractTableModel(parent) {
+DiscoveredModel::DiscoveredModel(const DeviceSnapshot &managed, QObject *parent) : CheckListModel(parent) {
     m_managed.reserve(managed.size());
     for (int i = 0; i < managed.size(); ++i)
         m_managed.insert(macOf(*managed.at(i)));
+    sort(IpColumn, Qt::AscendingOrder);
 }
 
 void DiscoveredModel::clear() {
     m_devices.clear();
     m_listed.clear();
-    m_checkedCount = 0;
-    arrange();
+    setItemCount(0, false);
 }
 
 int DiscoveredModel::add(const std::vector<DeviceRecordPtr> &devices, DeviceSource source) {
@@ -84,13 +81,8 @@ int DiscoveredModel::add(const std::vector<DeviceRecordPtr> &devices, DeviceSour
         qWarning("%d devices have no MAC address and are not listed", nameless);
     log(std::move(taken));
     if (m_devices.size() > before)
-        arrange();
+        setItemCount(static_cast<int>(m_devices.size()), false);
     return static_cast<int>(m_devices.size() - before);
-}
-
-void DiscoveredModel::setSearch(const QString &text) {
-    m_search = text;
-    arrange();
 }
 
 std::vector<DeviceRecordPtr> DiscoveredModel::devices() const {
@@ -102,47 +94,27 @@ std::vector<DeviceRecordPtr> DiscoveredModel::devices() const {
 
 std::vector<DeviceRecordPtr> DiscoveredModel::checkedDevices() const {
     std::vector<DeviceRecordPtr> checked;
-    for (const Entry &each : m_devices) {
-        if (each.checked)
-            checked.push_back(each.record);
+    for (int item = 0; item < itemCount(); ++item) {
+        if (isChecked(item))
+            checked.push_back(entry(item).record);
     }
     return checked;
-}
-
-void DiscoveredModel::check(Entry &entry, bool checked) {
-    if (std::exchange(entry.checked, checked) != checked)
-        m_checkedCount += checked ? 1 : -1;
-}
-
-void DiscoveredModel::setShownChecked(bool checked) {
-    if (m_order.empty())
-        return;
-    for (const std::size_t place : m_order)
-        check(m_devices[place], checked);
-    emit dataChanged(index(0, 0), index(rowCount() - 1, 0), {Qt::CheckStateRole});
-    emit changed();
-}
-
-Qt::CheckState DiscoveredModel::shownState() const {
-    const auto checked = std::count_if(m_order.begin(), m_order.end(),
-                                       [this](std::size_t place) { return m_devices[place].checked; });
-    if (checked == 0)
-        return Qt::Unchecked;
-    return static_cast<std::size_t>(checked) == m_order.size() ? Qt::Checked : Qt::PartiallyChecked;
-}
-
-int DiscoveredModel::rowCount(const QModelIndex &parent) const {
-    return parent.isValid() ? 0 : static_cast<int>(m_order.size());
 }
 
 int DiscoveredModel::columnCount(const QModelIndex &parent) const {
     return parent.isValid() ? 0 : columnTotal;
 }
 
-QString DiscoveredModel::text(const Entry &entry, int column) const {
+QVariant DiscoveredModel::headerData(int section, Qt::Orientation orientation, int role) const {
+    if (orientation != Qt::Horizontal || role != Qt::DisplayRole || section < 0 || section >= columnTotal)
+        return {};
+    return DeviceRecords::columnTitle(deviceColumns[section]);
+}
+
+QString DiscoveredModel::text(int item, int column) const {
     if (column != StatusColumn)
-        return entry.record->text(deviceColumns[column]);
-    switch (entry.source) {
+        return entry(item).record->text(deviceColumns[column]);
+    switch (entry(item).source) {
     case DeviceSource::Network:
         return tr("Discovered");
     case DeviceSource::Manual:
@@ -153,85 +125,21 @@ QString DiscoveredModel::text(const Entry &entry, int column) const {
     return {};
 }
 
-QVariant DiscoveredModel::data(const QModelIndex &index, int role) const {
-    if (!checkIndex(index, CheckIndexOption::IndexIsValid))
-        return {};
-    if (role == Qt::DisplayRole)
-        return text(entry(index.row()), index.column());
-    if (role == Qt::CheckStateRole && index.column() == StatusColumn)
-        return entry(index.row()).checked ? Qt::Checked : Qt::Unchecked;
-    return {};
-}
-
-bool DiscoveredModel::setData(const QModelIndex &index, const QVariant &value, int role) {
-    if (role != Qt::CheckStateRole || index.column() != StatusColumn)
-        return false;
-    check(entry(index.row()), value.toInt() == Qt::Checked);
-    emit dataChanged(index, index, {role});
-    emit changed();
-    return true;
-}
-
-QVariant DiscoveredModel::headerData(int section, Qt::Orientation orientation, int role) const {
-    if (orientation != Qt::Horizontal || role != Qt::DisplayRole || section < 0 || section >= columnTotal)
-        return {};
-    return DeviceRecords::columnTitle(deviceColumns[section]);
-}
-
-Qt::ItemFlags DiscoveredModel::flags(const QModelIndex &index) const {
-    const Qt::ItemFlags checkable =
-        index.column() == StatusColumn ? Qt::ItemIsUserCheckable : Qt::NoItemFlags;
-    return QAbstractTableModel::flags(index) | checkable;
-}
-
-void DiscoveredModel::sort(int column, Qt::SortOrder order) {
-    if (column < 0 || column >= columnTotal)
-        return;
-    m_sortColumn = column;
-    m_sortOrder = order;
-    emit layoutAboutToBeChanged();
-    const std::vector<std::size_t> before = m_order;
-    sortOrder();
-    std::vector<int> rows(m_devices.size());
-    for (std::size_t row = 0; row < m_order.size(); ++row)
-        rows[m_order[row]] = static_cast<int>(row);
-    for (const QModelIndex &old : persistentIndexList())
-        changePersistentIndex(old, index(rows[before[static_cast<std::size_t>(old.row())]], old.column()));
-    emit layoutChanged();
-}
-
-void DiscoveredModel::arrange() {
-    const DeviceSearch search(m_search, {});
-    beginResetModel();
-    m_order.clear();
-    for (std::size_t place = 0; place < m_devices.size(); ++place) {
-        if (search.matches(*m_devices[place].record))
-            m_order.push_back(place);
+std::vector<int> DiscoveredModel::find(const QString &search) const {
+    const DeviceSearch words(search, {});
+    std::vector<int> found;
+    for (int item = 0; item < static_cast<int>(m_devices.size()); ++item) {
+        if (words.matches(*entry(item).record))
+            found.push_back(item);
     }
-    sortOrder();
-    endResetModel();
-    emit changed();
+    return found;
 }
 
-/// What is unknown comes last either way; equal ones keep the order in which they were found.
-void DiscoveredModel::sortOrder() {
-    const DeviceColumn column = deviceColumns[m_sortColumn];
-    const auto key = [&](const Entry &each) {
-        return m_sortColumn == StatusColumn ? static_cast<quint64>(each.source)
-                                            : each.record->sortKey(column);
-    };
-    const bool ascending = m_sortOrder == Qt::AscendingOrder;
-    std::sort(m_order.begin(), m_order.end(), [&](std::size_t left, std::size_t right) {
-        const Entry &a = m_devices[left];
-        const Entry &b = m_devices[right];
-        if (const quint64 keyA = key(a), keyB = key(b); keyA != keyB) {
-            if (keyA == DeviceRecord::unknownKey || keyB == DeviceRecord::unknownKey)
-                return keyB == DeviceRecord::unknownKey;
-            return (keyA < keyB) == ascending;
-        }
-        const int texts = m_sortColumn == StatusColumn
-                              ? 0
-                              : a.record->text(column).compare(b.record->text(column), Qt::CaseInsensitive);
-        return texts != 0 ? (texts < 0) == ascending : left < right;
-    });
+int DiscoveredModel::compare(int left, int right, int column, bool ascending) const {
+    const Entry &a = entry(left);
+    const Entry &b = entry(right);
+    if (column != StatusColumn)
+        return DeviceRecords::compare(*a.record, *b.record, deviceColumns[column], ascending);
+    const int difference = static_cast<int>(a.source) - static_cast<int>(b.source);
+    return ascending ? difference : -difference;
 }

@@ -3,7 +3,7 @@
 #include "apiclient.h"
 #include "devicemaker.h"
 #include "discoveredmodel.h"
-#include "discoveredtable.h"
+#include "checktable.h"
 #include "emulatorprocess.h"
 #include "invaliddevicedialog.h"
 #include "iplineedit.h"
@@ -265,7 +265,7 @@ private:
     }
     QPushButton *button(const char *name) const { return m_dialog->findChild<QPushButton *>(name); }
     QString text(const char *name) const { return m_dialog->findChild<QLabel *>(name)->text(); }
-    DiscoveredTable *table() const { return m_dialog->findChild<DiscoveredTable *>("discoveredTable"); }
+    CheckTable *table() const { return m_dialog->findChild<CheckTable *>("discoveredTable"); }
 
     IsolatedRoot m_root;
     EmulatorProcess m_service{m_root.path()};

@@ -1,6 +1,6 @@
-#include "discoveredtable.h"
+#include "checktable.h"
 
-#include "discoveredmodel.h"
+#include "checklistmodel.h"
 #include "icons.h"
 #include "rowpainter.h"
 #include "theme.h"
@@ -14,7 +14,7 @@ namespace {
 
 constexpr int padding = 8;
 constexpr int markSize = 16;
-constexpr int columnWidths[DiscoveredModel::columnTotal] = {150, 170, 140, 170, 110, 110};
+constexpr int markColumn = 0;
 
 class RowDelegate : public QStyledItemDelegate {
 public:
@@ -27,7 +27,7 @@ public:
         option.state.setFlag(QStyle::State_HasFocus, false);
         RowPainter::paintBackground(painter, option);
         QRect place = option.rect.adjusted(padding, 0, -padding, 0);
-        if (index.column() == DiscoveredModel::StatusColumn) {
+        if (index.column() == markColumn) {
             paintMark(painter, place, isChecked(index));
             place.setLeft(place.left() + markSize + 2 * padding);
         }
@@ -39,14 +39,13 @@ public:
 protected:
     bool editorEvent(QEvent *event, QAbstractItemModel *model, const QStyleOptionViewItem &,
                      const QModelIndex &index) override {
-        const bool isClick = event->type() == QEvent::MouseButtonRelease &&
-                             index.column() == DiscoveredModel::StatusColumn &&
+        const bool isClick = event->type() == QEvent::MouseButtonRelease && index.column() == markColumn &&
                              static_cast<QMouseEvent *>(event)->button() == Qt::LeftButton;
         const bool isSpace =
             event->type() == QEvent::KeyPress && static_cast<QKeyEvent *>(event)->key() == Qt::Key_Space;
         if (!isClick && !isSpace)
             return false;
-        const QModelIndex mark = index.siblingAtColumn(DiscoveredModel::StatusColumn);
+        const QModelIndex mark = index.siblingAtColumn(markColumn);
         return model->setData(mark, isChecked(mark) ? Qt::Unchecked : Qt::Checked, Qt::CheckStateRole);
     }
 
@@ -71,7 +70,7 @@ private:
 
 } // namespace
 
-DiscoveredTable::DiscoveredTable(QWidget *parent) : QTableView(parent) {
+CheckTable::CheckTable(QWidget *parent) : QTableView(parent) {
     setItemDelegate(new RowDelegate(this));
     setSelectionBehavior(QAbstractItemView::SelectRows);
     setSelectionMode(QAbstractItemView::SingleSelection);
@@ -89,10 +88,13 @@ DiscoveredTable::DiscoveredTable(QWidget *parent) : QTableView(parent) {
     horizontalHeader()->setFixedHeight(34);
 }
 
-void DiscoveredTable::setModel(QAbstractItemModel *model) {
-    QTableView::setModel(model);
-    for (int column = 0; column < DiscoveredModel::columnTotal; ++column)
-        setColumnWidth(column, columnWidths[column]);
-    horizontalHeader()->setSortIndicator(DiscoveredModel::IpColumn, Qt::AscendingOrder);
+void CheckTable::showList(CheckListModel *model, std::initializer_list<int> widths, int sortColumn) {
+    setModel(model);
+    int column = 0;
+    for (const int width : widths)
+        setColumnWidth(column++, width);
+    for (; column < model->columnCount(); ++column)
+        horizontalHeader()->setSectionResizeMode(column, QHeaderView::Stretch);
+    horizontalHeader()->setSortIndicator(sortColumn, Qt::AscendingOrder);
     setSortingEnabled(true);
 }
