@@ -13,6 +13,7 @@
 #include <iostream>
 #include <limits>
 #include <stdexcept>
+#include <string_view>
 
 namespace {
 
@@ -88,6 +89,11 @@ bool CApiClient::setAccount(const char *szAccount) {
     return true;
 }
 
+bool CApiClient::isStage(const char *szStage) {
+    const std::string_view stage = textOrEmpty(szStage);
+    return stage == "all" || stage == "start" || stage == "update" || stage == "end";
+}
+
 bool CApiClient::hasSession() const {
     return !m_strAccess.empty() && !m_strAccount.empty();
 }
@@ -120,6 +126,8 @@ unsigned CApiClient::post(const Call &call, const JSON &body, JSON *output) {
                 call.logTransportError(call, answer.error);
             return ApiTransportError;
         }
+        if (call.logAnswer)
+            call.logAnswer(call, answer);
         return judge(call, answer, output);
     } catch (const std::exception &error) {
         logException(call, error.what());

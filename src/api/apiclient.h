@@ -76,9 +76,18 @@ public:
 
     // Commands on devices
 
+    /// A page of the stored custom commands; nStart counts from 0.
+    virtual unsigned listCgis(int nStart, int nCount, JSON &cgis);
+    /// cgis: array of custom commands, which take the place of the stored ones. szStage: "all", "start",
+    /// "update" or "end".
+    virtual unsigned commitCgis(const JSON &cgis, const char *szStage);
+    /// The same as runCustomCgisEx without the devices' answers.
+    virtual unsigned runCustomCgis(const JSON &cgis, const JSON &devices);
     /// Lets devices run commands. cgis: array of commands, each a path of a device. devices: array of ids, or
     /// of objects with "id" and "tid" to run under a task, which is answered at once. answers: one a device.
     virtual unsigned runCustomCgisEx(const JSON &cgis, const JSON &devices, JSON &answers);
+    /// Sends the body, which names its "devices", to a path of the service.
+    virtual unsigned runGeneralCgis(const char *szPath, const JSON &body);
 
     // Tasks, alarms, log
 
@@ -101,6 +110,16 @@ public:
     /// Has debug information collected. szStorePath: where, on the service's machine.
     virtual unsigned exportDebugInfo(const char *szStorePath, const JSON &devices, JSON &answer);
 
+    // Configuration of devices
+
+    /// Sends those members of the settings that a quick setup knows. devices: array of ids, or of objects
+    /// with "id" and "tid".
+    virtual unsigned runQuickSetup(const JSON &devices, const JSON &settings, JSON &answer);
+    /// configuration: the device's sections, each an object of items.
+    virtual unsigned runConfigQuery(const char *szDeviceId, JSON &configuration);
+    /// szTemplate: the text of a template file. devices: as for runQuickSetup.
+    virtual unsigned setTemplate(const JSON &devices, const char *szTemplate, JSON &answer);
+
     // Service settings
 
     virtual unsigned loadServerSettings(JSON &settings);
@@ -119,6 +138,8 @@ protected:
         void (*logTransportError)(const Call &call, const std::string &error) = nullptr;
         void (*logException)(const Call &call, const std::string &error) = nullptr;
         unsigned (*judgeCode)(int code) = nullptr; ///< in place of the usual judging of "code"
+        /// Called with every answer, whatever its status, before it is judged.
+        void (*logAnswer)(const Call &call, const HttpAnswer &answer) = nullptr;
     };
 
     /// Sends body to the call's path by POST and judges the answer. output: set where the call has a payload.
@@ -131,6 +152,8 @@ protected:
 
     /// An argument that has to be there.
     static bool isEmpty(const char *szText) { return !szText || !*szText; }
+    /// The stage of a commit in several requests: "all", "start", "update" or "end".
+    static bool isStage(const char *szStage);
 
 private:
     unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);

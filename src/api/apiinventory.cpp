@@ -6,16 +6,9 @@
 
 #include <nlohmann/json.hpp>
 
-#include <string_view>
-
 namespace {
 
 constexpr const char *siteRoot = "SR000000000000";
-
-bool isStage(const char *szStage) {
-    const std::string_view stage = szStage ? szStage : "";
-    return stage == "all" || stage == "start" || stage == "update" || stage == "end";
-}
 
 JSON page(int nStart, int nCount) {
     return {{"start", nStart}, {"count", nCount}};

@@ -1,0 +1,171 @@
+#include "isolatedroot.h"
+#include "logcapture.h"
+#include "scriptedpeer.h"
+#include "testsession.h"
+
+#include <QTest>
+
+#include <functional>
+
+using TestSession::client;
+
+using Call = std::function<unsigned(CApiClient &, JSON &)>;
+Q_DECLARE_METATYPE(Call)
+
+namespace {
+
+const JSON targets = {{{"id", "DV1"}, {"tid", "T1"}}};
+const JSON commands = {"/cgi-bin/one.cgi", "/cgi-bin/two.cgi"};
+
+} // namespace
+
+/// Commands on devices and their configuration, as they go over the wire.
+class TestApiClientCgis : public QObject {
+    Q_OBJECT
+
+private slots:
+    void whatIsSent_data();
+    void whatIsSent();
+    void refusedBeforeSending_data();
+    void refusedBeforeSending();
+    void generalAnswerIsLoggedBeforeItIsJudged_data();
+    void generalAnswerIsLoggedBeforeItIsJudged();
+
+private:
+    IsolatedRoot m_root;
+    ScriptedPeer m_peer;
+};
+
+void TestApiClientCgis::whatIsSent_data() {
+    QTest::addColumn<Call>("call");
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<std::string>("members");
+    QTest::addColumn<QString>("data"); // "sealed", "plain", or nothing where the method has no output
+    const auto row = [](const char *name, Call call, const char *path, const JSON &members,
+                        const char *data) {
+        QTest::newRow(name) << std::move(call) << QString(path) << members.dump() << QString(data);
+    };
+    row(
+        "listCgis", [](CApiClient &c, JSON &out) { return c.listCgis(500, 250, out); }, "/v1/cgi/list",
+        {{"start", 500}, {"count", 250}}, "sealed");
+    row(
+        "commitCgis", [](CApiClient &c, JSON &) { return c.commitCgis(commands, "update"); },
+        "/v1/cgi/commit", {{"state", "update"}, {"cgis", commands}}, "");
+    row(
+        "runCustomCgis", [](CApiClient &c, JSON &) { return c.runCustomCgis(commands, targets); },
+        "/v1/cgi/custom", {{"cgis", commands}, {"devices", targets}}, "");
+    row(
+        "runGeneralCgis",
+        [](CApiClient &c, JSON &) {
+            return c.runGeneralCgis("/v1/assip/auto", {{"tid", "T1"}, {"devices", {"DV1"}}});
+        },
+        "/v1/assip/auto", {{"tid", "T1"}, {"devices", {"DV1"}}}, "");
+    row(
+        "runConfigQuery", [](CApiClient &c, JSON &out) { return c.runConfigQuery("DV1", out); },
+        "/v1/config/query", {{"deviceid", "DV1"}}, "plain");
+    row(
+        "setTemplate", [](CApiClient &c, JSON &out) { return c.setTemplate(targets, "a: 1\n", out); },
+        "/v1/config/config", {{"devices", targets}, {"template", "a: 1\n"}}, "plain");
+    const JSON all = {{"posixTz", "UTC0"},   {"timesync", "ntp"},    {"time", "10:00"},
+                      {"powerfreq", 50},     {"mute", true},         {"server1", "1"},
+                      {"server2", "2"},      {"server3", "3"},       {"server4", "4"},
+                      {"server5", "5"},      {"date", "2026/01/01"}, {"daylightEnable", 0},
+                      {"updateInterval", 60}};
+    JSON sent = all;
+    sent["devices"] = targets;
+    row(
+        "runQuickSetup",
+        [all](CApiClient &c, JSON &out) {
+            JSON settings = all;
+            settings["id"] = "somebody else";
+            settings["pass"] = "secret";
+            return c.runQuickSetup(targets, settings, out);
+        },
+        "/v1/quicksetup", sent, "plain");
+    row(
+        "runQuickSetup",
+        [](CApiClient &c, JSON &out) {
+            return c.runQuickSetup(targets, {{"mute", nullptr}}, out);
+        },
+        "/v1/quicksetup", {{"devices", targets}, {"mute", nullptr}}, "plain");
+}
+
+void TestApiClientCgis::whatIsSent() {
+    QFETCH(Call, call);
+    QFETCH(QString, path);
+    QFETCH(std::string, members);
+    QFETCH(QString, data);
+    const LogCapture log;
+    JSON expected = JSON::parse(members);
+    expected["id"] = TestSession::account;
+    JSON answer = {{"code", 0}};
+    m_peer.answer(ScriptedPeer::json(answer));
+    JSON out;
+    // An answer without the promised data is no success, and leaves the output alone.
+    QCOMPARE(call(*client(m_peer.port()), out), unsigned(data.isEmpty() ? ApiOk : ApiMissingData));
+    QVERIFY(out.is_null());
+    answer["data"] = data == "sealed" ? JSON(TestSession::sealed("[1]")) : JSON::array({1});
+    m_peer.answer(ScriptedPeer::json(answer));
+    QCOMPARE(call(*client(m_peer.port()), out), unsigned(ApiOk));
+    QVERIFY(out == (data.isEmpty() ? JSON() : JSON::array({1})));
+
+    const std::vector<ScriptedPeer::Request> requests = m_peer.takeRequests();
+    QCOMPARE(requests.size(), std::size_t(2));
+    QCOMPARE(QString::fromStdString(requests[0].path), path);
+    QCOMPARE(requests[0].json().dump(), expected.dump());
+    const QString method = QString::fromLatin1(QTest::currentDataTag());
+    QCOMPARE(log.count("CApiClient::" + method + " > Set authorization to " + TestSession::token), 2);
+    CApiClient noSession("127.0.0.1", m_peer.port());
+    QCOMPARE(call(noSession, out), unsigned(ApiInvalidArgument));
+    QVERIFY(m_peer.takeRequests().empty());
+}
+
+void TestApiClientCgis::refusedBeforeSending_data() {
+    QTest::addColumn<Call>("call");
+    const auto row = [](const char *name, Call call) { QTest::newRow(name) << std::move(call); };
+    row("unknown stage", [](CApiClient &c, JSON &) { return c.commitCgis(commands, "begin"); });
+    row("commands, an object", [](CApiClient &c, JSON &) { return c.commitCgis(JSON::object(), "all"); });
+    row("command as a text", [](CApiClient &c, JSON &) { return c.runCustomCgis("/one.cgi", targets); });
+    row("no list of devices", [](CApiClient &c, JSON &) { return c.runCustomCgis(commands, "DV1"); });
+    row("general, no devices",
+        [](CApiClient &c, JSON &) { return c.runGeneralCgis("/v1/x", JSON::object()); });
+    row("general, no object", [](CApiClient &c, JSON &) { return c.runGeneralCgis("/v1/x", {"devices"}); });
+    row("general, no path", [](CApiClient &c, JSON &) {
+        return c.runGeneralCgis("", {{"devices", targets}});
+    });
+    row("query of no device", [](CApiClient &c, JSON &out) { return c.runConfigQuery("", out); });
+    row("empty template", [](CApiClient &c, JSON &out) { return c.setTemplate(targets, nullptr, out); });
+    row("set-up of no list",
+        [](CApiClient &c, JSON &out) { return c.runQuickSetup("DV1", JSON::object(), out); });
+}
+
+void TestApiClientCgis::refusedBeforeSending() {
+    QFETCH(Call, call);
+    const LogCapture log;
+    const int before = m_peer.connections();
+    JSON out;
+    QCOMPARE(call(*client(m_peer.port()), out), unsigned(ApiInvalidArgument));
+    QCOMPARE(m_peer.connections(), before);
+}
+
+void TestApiClientCgis::generalAnswerIsLoggedBeforeItIsJudged_data() {
+    QTest::addColumn<int>("status");
+    QTest::addColumn<QString>("body");
+    QTest::addColumn<unsigned>("result");
+    QTest::newRow("refused") << 200 << R"({"code":4,"msg":"100%s unknown"})" << unsigned(ApiServerError);
+    QTest::newRow("no JSON") << 200 << "oops" << unsigned(ApiException);
+    QTest::newRow("other status") << 500 << "down" << unsigned(ApiHttpStatusError);
+}
+
+void TestApiClientCgis::generalAnswerIsLoggedBeforeItIsJudged() {
+    QFETCH(int, status);
+    QFETCH(QString, body);
+    QFETCH(unsigned, result);
+    const LogCapture log;
+    m_peer.answer({ScriptedPeer::http(status, body.toStdString())});
+    QCOMPARE(client(m_peer.port())->runGeneralCgis("/v1/assip/auto", {{"devices", targets}}), result);
+    QCOMPARE(log.count("Request /v1/assip/auto gets result: " + body), 1);
+}
+
+QTEST_GUILESS_MAIN(TestApiClientCgis)
+#include "tst_apiclient_cgis.moc"
