@@ -7,16 +7,22 @@
 
 #include <mutex>
 
-/// A service that has nothing but a list of tasks and one of alarms, and is logged in to.
+/// A service that has nothing but a list of tasks and one of alarms, makes tasks without number, says yes to
+/// everything else, and is logged in to.
 class FakeLists {
 public:
     FakeLists() {
         m_peer.follow([this](const ScriptedPeer::Request &request) { return answer(request); });
+        logIn();
+    }
+    ~FakeLists() { CLocalStore::instance().clearLoginInfo(); }
+
+    /// Begins a session, in place of an earlier one.
+    void logIn() {
         const std::string cipher = Ciphers::sealSecret("session-token_0123456789").value_or("");
         CLocalStore::instance().setLoginInfo("127.0.0.1", m_peer.port(), "admin",
                                              QByteArray::fromStdString(cipher));
     }
-    ~FakeLists() { CLocalStore::instance().clearLoginInfo(); }
 
     void setTasks(const std::vector<nlohmann::json> &tasks) { setTaskAnswer(tasks); }
     /// The whole list, right or wrong.
@@ -29,10 +35,15 @@ public:
         const std::lock_guard lock(m_mutex);
         m_alarms = std::move(data);
     }
-    /// From now on the requests to the path answer with this code.
+    /// From now on the requests to the path answer with this code; 0 ends it.
     void refuse(const std::string &path, int code) {
         const std::lock_guard lock(m_mutex);
         m_codes[path] = code;
+    }
+    /// What making a task is answered with, in place of its record.
+    void setTaskMade(nlohmann::json data) {
+        const std::lock_guard lock(m_mutex);
+        m_made = std::move(data);
     }
     /// The bodies that were sent to a path.
     std::vector<nlohmann::json> sentTo(const std::string &path) {
@@ -53,12 +64,18 @@ private:
 
     ScriptedPeer::Reply answer(const ScriptedPeer::Request &request) {
         const std::lock_guard lock(m_mutex);
-        if (const auto code = m_codes.find(request.path); code != m_codes.end())
+        if (const auto code = m_codes.find(request.path); code != m_codes.end() && code->second != 0)
             return ScriptedPeer::json({{"code", code->second}});
         if (request.path == "/v1/alarm/list")
             return sealed(m_alarms);
-        if (request.path != "/v1/task/list" || !m_tasks.is_array())
-            return request.path == "/v1/task/list" ? sealed(m_tasks) : ScriptedPeer::json({{"code", 0}});
+        if (request.path == "/v1/task/init")
+            return sealed(m_made.is_null() ? makeTask(request.json()) : m_made);
+        if (request.path == "/v1/site/list")
+            return sealed(nlohmann::json::array());
+        if (request.path != "/v1/task/list")
+            return ScriptedPeer::json({{"code", 0}, {"data", nullptr}});
+        if (!m_tasks.is_array())
+            return sealed(m_tasks);
         const std::size_t start = request.json()["start"];
         const std::size_t count = request.json()["count"];
         nlohmann::json page = nlohmann::json::array();
@@ -67,8 +84,21 @@ private:
         return sealed(page);
     }
 
+    nlohmann::json makeTask(const nlohmann::json &asked) {
+        nlohmann::json devices = nlohmann::json::array();
+        for (const nlohmann::json &device : asked["devices"]) {
+            const std::string id = device.is_object() ? device["id"] : device;
+            devices.push_back({{"id", id}, {"d_mac", "AA-" + id}, {"state", "pTaskFailed"}});
+        }
+        nlohmann::json task = {
+            {"tid", "T" + std::to_string(m_tasks.size() + 1)}, {"type", asked["type"]}, {"devices", devices}};
+        m_tasks.insert(m_tasks.begin(), task);
+        return task;
+    }
+
     std::mutex m_mutex;
     nlohmann::json m_tasks = nlohmann::json::array();
+    nlohmann::json m_made;
     nlohmann::json m_alarms = {{"items", nlohmann::json::array()}, {"total_items", 0}};
     std::map<std::string, int> m_codes;
     std::map<std::string, std::vector<nlohmann::json>> m_sent;

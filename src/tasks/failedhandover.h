@@ -1,0 +1,11 @@
+#pragma once
+
+#include <QString>
+
+/// An operation whose work did not reach the service, as the user is told of it.
+struct FailedHandOver {
+    QString ctid; ///< of its record
+    QString serviceType;
+    int devices = 0;
+    QString reason; ///< the part of a sentence that follows "could not be started: "
+};

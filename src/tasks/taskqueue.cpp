@@ -1,0 +1,361 @@
+#include "taskqueue.h"
+
+#include "messagelog.h"
+#include "servicesession.h"
+#include "sessionevents.h"
+#include "taskinfopool.h"
+#include "taskrepeats.h"
+#include "tasktargets.h"
+
+#include <QCoreApplication>
+#include <QDebug>
+#include <QPointer>
+#include <QScopedValueRollback>
+#include <QTimer>
+
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+
+namespace {
+
+constexpr int tickMs = 1000;
+constexpr const char *queuedState = "init";
+/// The member with the session that a record belongs to.
+constexpr const char *sessionMember = "session";
+constexpr const char *secretMember = "pass";
+
+quint64 presentSession() {
+    return CLocalStore::instance().loginInfo().generation;
+}
+
+void wipeSecret(JSON &record) {
+    const auto secret = record.find(secretMember);
+    if (secret == record.end() || !secret->is_string())
+        return;
+    auto &text = secret->get_ref<std::string &>();
+    std::fill(text.begin(), text.end(), '\0');
+    record.erase(secret);
+}
+
+/// "%d" in a log line stands for the result.
+void logLine(QtMsgType type, const char *line, unsigned result) {
+    if (!line)
+        return;
+    const QString text = QString::fromLatin1(line).replace(QStringLiteral("%d"), QString::number(result));
+    if (type == QtWarningMsg)
+        qWarning("%s", qUtf8Printable(text));
+    else
+        qDebug("%s", qUtf8Printable(text));
+}
+
+/// The addresses that the task list gives for devices of a task.
+QSet<QString> macsOf(const QString &tid, const QStringList &deviceIds) {
+    QSet<QString> macs;
+    if (const TaskRecordPtr task = CTaskInfoPool::instance().taskList()->find(tid)) {
+        for (const TaskDevice &device : task->devices) {
+            if (deviceIds.contains(device.target->id))
+                macs.insert(TaskTargets::plainMac(device.target->mac));
+        }
+    }
+    return macs;
+}
+
+QStringList idTexts(const JSON &devices) {
+    QStringList texts;
+    for (const JSON &id : TaskTargets::ids(devices)) {
+        if (id.is_string())
+            texts += QString::fromStdString(id.get_ref<const std::string &>());
+    }
+    return texts;
+}
+
+std::string newId(const char *prefix) {
+    static std::atomic<unsigned> counter = 0;
+    return prefix + std::to_string(++counter);
+}
+
+} // namespace
+
+/// How a step ended.
+struct TaskQueue::Outcome {
+    unsigned result = ApiException;
+    bool made = false; ///< there is a task on the service
+};
+
+TaskQueue::TaskQueue(std::span<const TaskFamily> families, const char *walkError)
+    : m_families(families), m_walkError(walkError), m_timer(new QTimer(this)) {
+    m_timer->setInterval(tickMs);
+    connect(m_timer, &QTimer::timeout, this, &TaskQueue::onTimeout);
+    connect(&CTaskInfoPool::instance(), &CTaskInfoPool::cleared, this, &TaskQueue::onSessionEnded);
+    connect(qApp, &QCoreApplication::aboutToQuit, this, &TaskQueue::onQuit);
+}
+
+TaskQueue::~TaskQueue() {
+    m_timer->stop();
+    onQuit();
+    m_worker.wait();
+}
+
+void TaskQueue::setCompletionCallback(quintptr context, Completion completion) {
+    const std::lock_guard lock(m_mutex);
+    m_completionContext = context;
+    m_completion = std::move(completion);
+}
+
+const TaskFamily *TaskQueue::familyOf(std::string_view type) const {
+    const auto found = std::find_if(m_families.begin(), m_families.end(),
+                                    [type](const TaskFamily &family) { return type == family.type; });
+    return found == m_families.end() ? nullptr : &*found;
+}
+
+bool TaskQueue::insert(const char *type, JSON record, QString *ctid) {
+    const TaskFamily *family = familyOf(type);
+    if (!record.is_object() || !family || !record.emplace("state", queuedState).first->is_string()) {
+        qWarning("Inserting new task with the invalid parameter.");
+        return false;
+    }
+    const std::string id = newId(family->idPrefix);
+    record["ctid"] = id;
+    record["type"] = type;
+    record[sessionMember] = presentSession();
+    {
+        const std::lock_guard lock(m_mutex);
+        m_tasks.push_back(std::move(record));
+        m_unwalked = true;
+    }
+    if (ctid)
+        *ctid = QString::fromStdString(id);
+    if (!m_timer->isActive())
+        m_timer->start();
+    return true;
+}
+
+void TaskQueue::onTimeout() {
+    if (m_ticking || !m_unwalked)
+        return;
+    const QScopedValueRollback ticking(m_ticking, true);
+    if (m_worker.isRunning())
+        return;
+    m_worker.setUp(reinterpret_cast<quintptr>(this), [this](quintptr) { handlingTask(); });
+    m_worker.start();
+}
+
+void TaskQueue::handlingTask() {
+    try {
+        std::size_t place = 0;
+        JSON record;
+        while (!m_stopping && takeQueued(place, record))
+            runStep(*familyOf(record.at("type").get<std::string>()), record);
+    } catch (const std::exception &error) {
+        qWarning("%s%s", m_walkError, error.what());
+    } catch (...) {
+        qWarning("%sUnknown exception", m_walkError);
+    }
+}
+
+/// Copies the next queued record from the place on. The length is looked at in every step, so records that
+/// were appended meanwhile are reached.
+bool TaskQueue::takeQueued(std::size_t &place, JSON &record) {
+    const std::lock_guard lock(m_mutex);
+    while (place < m_tasks.size()) {
+        const JSON &each = m_tasks[place++];
+        if (each.is_null())
+            continue;
+        const auto state = each.at("state").get<std::string>();
+        const auto type = each.at("type").get<std::string>();
+        if (state == queuedState && familyOf(type)) {
+            record = each;
+            return true;
+        }
+    }
+    m_unwalked = false;
+    return false;
+}
+
+void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
+    ServiceSession session(CLocalStore::instance().loginInfo());
+    // Queued in a session that has ended: it must not run as somebody else, or on another server.
+    if (record.at(sessionMember) != session.login().generation) {
+        setState(family, record, family.failureState());
+        return complete(ApiInvalidArgument);
+    }
+    TaskStep step{session, record};
+    setState(family, record, family.workingState());
+    Outcome outcome;
+    try {
+        outcome = perform(family, step);
+    } catch (const std::exception &error) {
+        qWarning("%s%s", family.lines.exception, error.what());
+        outcome.made = !step.tid.empty();
+    } catch (...) {
+        qWarning("%sUnknown exception", family.lines.exception);
+        outcome.made = !step.tid.empty();
+    }
+    finish(family, step, outcome);
+}
+
+TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step) {
+    const LoginInfo &login = step.session.login();
+    qDebug("API access info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
+           static_cast<int>(login.port), qUtf8Printable(login.account),
+           MessageLog::secret(login.token).constData());
+    const JSON devices = family.devices(step.record);
+    JSON task;
+    unsigned result = step.session.call(
+        [&](CApiClient &client) { return client.newTaskState(family.serviceType, devices, task); });
+    step.tid = result == ApiOk ? textMember(task, "tid") : "";
+    if (step.tid.empty())
+        return {result == ApiOk ? unsigned(ApiMissingData) : result, false};
+    // The new task is to be seen before its work begins, and a repetition is only kept for tasks in the list.
+    CTaskInfoPool::instance().fetchTaskStatuses(step.session);
+    tell([this, &family, ctid = stringMember(step.record, "ctid"), tid = QString::fromStdString(step.tid)] {
+        rememberRepeat(family, ctid, tid);
+        emit serviceTaskMade(ctid, tid);
+    });
+    family.announce(step);
+    result = family.work(step);
+    if (result == ApiOk)
+        logLine(QtDebugMsg, family.lines.success, result);
+    else
+        logLine(QtWarningMsg, family.lines.failure, result);
+    return {result, true};
+}
+
+void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome) {
+    const bool over = step.session.isLost() || !step.session.isPresent();
+    if (step.session.isLost())
+        tell([generation = step.session.login().generation] {
+            SessionEvents::instance().reportLost(generation);
+        });
+    if (outcome.result == ApiOk)
+        setState(family, step.record, family.successState());
+    else if (outcome.made || over)
+        setState(family, step.record, family.failureState());
+    if (outcome.result != ApiOk && !over)
+        tell([this, failure = FailedHandOver{
+                        stringMember(step.record, "ctid"), QString::fromLatin1(family.serviceType),
+                        static_cast<int>(step.record.at(family.targets).size()),
+                        apiResultText(outcome.result)}] { emit handOverFailed(failure); });
+    complete(outcome.result);
+}
+
+void TaskQueue::complete(quint32 error) {
+    std::unique_lock lock(m_mutex);
+    const Completion completion = m_completion;
+    const quintptr context = m_completionContext;
+    lock.unlock();
+    if (completion)
+        completion(context, error);
+}
+
+void TaskQueue::setState(const TaskFamily &family, const JSON &record, const char *state) {
+    try {
+        const auto ctid = record.at("ctid").get<std::string>();
+        {
+            const std::lock_guard lock(m_mutex);
+            const auto found = std::find_if(m_tasks.begin(), m_tasks.end(), [&](const JSON &each) {
+                return each.at("ctid").get<std::string>() == ctid;
+            });
+            if (found == m_tasks.end() || found->at("state") == state)
+                return;
+            (*found)["state"] = state;
+            if (state != std::string_view(family.workingState()))
+                wipeSecret(*found);
+        }
+        tell([this, ctid = QString::fromStdString(ctid), state = QString::fromLatin1(state)] {
+            emit recordChanged(ctid, state);
+        });
+    } catch (const std::exception &error) {
+        qWarning("%s%s", family.lines.update, error.what());
+    } catch (...) {
+        qWarning("%sUnknown exception", family.lines.update);
+    }
+}
+
+QString TaskQueue::stateOf(const QString &ctid) const {
+    return stringMember(copyOf(ctid), "state");
+}
+
+JSON TaskQueue::copyOf(const QString &ctid) const {
+    const std::string wanted = ctid.toStdString();
+    const std::lock_guard lock(m_mutex);
+    const auto found = std::find_if(m_tasks.begin(), m_tasks.end(),
+                                    [&](const JSON &each) { return textMember(each, "ctid") == wanted; });
+    return found == m_tasks.end() ? JSON() : *found;
+}
+
+void TaskQueue::rememberRepeat(const TaskFamily &family, const QString &ctid, const QString &tid) {
+    TaskRepeats::instance().remember(tid, {[queue = QPointer(this), ctid, tid](const QStringList &ids) {
+                                               if (queue)
+                                                   queue->repeat(ctid, tid, ids);
+                                           },
+                                           family.asksAgain});
+}
+
+void TaskQueue::repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds) {
+    JSON record = copyOf(ctid);
+    const TaskFamily *family = familyOf(textMember(record, "type"));
+    if (!family)
+        return;
+    if (family->asksAgain)
+        return emit dialogNeeded(QString::fromLatin1(family->serviceType), deviceIds);
+    JSON &devices = record[family->targets];
+    devices = TaskTargets::only(devices, deviceIds);
+    if (const auto files = record.find("cert"); files != record.end())
+        *files = TaskTargets::onlyFilesOf(*files, macsOf(tid, deviceIds));
+    record["state"] = queuedState;
+    insert(family->type, std::move(record));
+}
+
+void TaskQueue::startAgain(const QString &ctid) {
+    JSON record = copyOf(ctid);
+    const TaskFamily *family = familyOf(textMember(record, "type"));
+    if (!family)
+        return;
+    // While its task has not been made a record still has what it was inserted with.
+    if (family->asksAgain && textMember(record, "state") != family->workingState())
+        return emit dialogNeeded(QString::fromLatin1(family->serviceType),
+                                 idTexts(record.at(family->targets)));
+    record["state"] = queuedState;
+    insert(family->type, std::move(record));
+    dismiss(ctid);
+}
+
+void TaskQueue::dismiss(const QString &ctid) {
+    const std::string wanted = ctid.toStdString();
+    const std::lock_guard lock(m_mutex);
+    for (JSON &each : m_tasks) {
+        if (textMember(each, "ctid") == wanted)
+            wipeSecret(each);
+    }
+}
+
+void TaskQueue::onSessionEnded() {
+    const quint64 present = presentSession();
+    std::vector<JSON> dropped;
+    {
+        const std::lock_guard lock(m_mutex);
+        for (JSON &each : m_tasks) {
+            if (each.at(sessionMember) == present)
+                continue;
+            wipeSecret(each);
+            if (textMember(each, "state") == queuedState)
+                dropped.push_back({{"ctid", each.at("ctid")}, {"type", each.at("type")}});
+        }
+    }
+    for (const JSON &each : dropped) {
+        const TaskFamily *family = familyOf(textMember(each, "type"));
+        setState(*family, each, family->failureState());
+    }
+}
+
+void TaskQueue::onQuit() {
+    m_stopping = true;
+}
+
+/// Who listens lives in the user-interface thread.
+template <typename Told>
+void TaskQueue::tell(Told told) {
+    QMetaObject::invokeMethod(this, std::move(told), Qt::QueuedConnection);
+}

@@ -1,0 +1,104 @@
+#pragma once
+
+#include "failedhandover.h"
+#include "nettask.h"
+#include "taskfamily.h"
+
+#include <QObject>
+
+#include <atomic>
+#include <mutex>
+#include <span>
+#include <vector>
+
+class QTimer;
+
+/// A queue of long operations. Windows insert records and may close at once; a worker thread takes the
+/// records in their order, one at a time, makes a task on the service for each and does its work. How a task
+/// goes on from there shows in the service's list.
+///
+/// Records stay for as long as the process lives, so that their operations can be repeated; their passwords
+/// do not. A record is worked on once, in the session in which it was inserted. User-interface thread unless
+/// a function says otherwise; the signals come there.
+class TaskQueue : public QObject {
+    Q_OBJECT
+
+public:
+    /// Called on the worker's thread when a record has had its turn; error 0 means success.
+    using Completion = std::function<void(quintptr context, quint32 error)>;
+    using Callable = std::function<void(const QString &ctid)>;
+
+    ~TaskQueue() override;
+
+    void setCompletionCallback(quintptr context, Completion completion);
+    /// Two callables that the queue keeps for those who use it.
+    void setProgressCallback(Callable callable) { m_progress = std::move(callable); }
+    void setStateCallback(Callable callable) { m_state = std::move(callable); }
+    const Callable &progressCallback() const { return m_progress; }
+    const Callable &stateCallback() const { return m_state; }
+
+    /// The worker's body: works on every queued record, those that come meanwhile too. Blocks.
+    void handlingTask();
+
+    /// Does the work of a failed record again, as a new record.
+    void startAgain(const QString &ctid);
+    /// A failed record will not be started again.
+    void dismiss(const QString &ctid);
+
+    /// Empty where there is no such record. Any thread.
+    QString stateOf(const QString &ctid) const;
+
+signals:
+    void recordChanged(const QString &ctid, const QString &state);
+    /// The record's task is on the service; tid is its id there.
+    void serviceTaskMade(const QString &ctid, const QString &tid);
+    void handOverFailed(const FailedHandOver &failure);
+    /// A record can only be repeated with a password or a key that is not kept: whoever can ask for it opens
+    /// that dialog for the devices.
+    void dialogNeeded(const QString &serviceType, const QStringList &deviceIds);
+
+protected:
+    /// families: the types of records; has to outlive the queue. walkError: begins the line that is logged
+    /// when the list cannot be walked.
+    TaskQueue(std::span<const TaskFamily> families, const char *walkError);
+
+    /// Completes a record (id, type, state) and appends it. ctid: takes its id where it is not null. False,
+    /// and a line logged, for a type that the queue does not know or a state that is no text.
+    bool insert(const char *type, JSON record, QString *ctid = nullptr);
+
+private:
+    struct Outcome;
+
+    void onTimeout();
+    void onSessionEnded();
+    void onQuit();
+
+    const TaskFamily *familyOf(std::string_view type) const;
+    bool takeQueued(std::size_t &place, JSON &record);
+    void runStep(const TaskFamily &family, const JSON &record);
+    Outcome perform(const TaskFamily &family, TaskStep &step);
+    void finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome);
+    void complete(quint32 error);
+    void setState(const TaskFamily &family, const JSON &record, const char *state);
+    void rememberRepeat(const TaskFamily &family, const QString &ctid, const QString &tid);
+    void repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds);
+    JSON copyOf(const QString &ctid) const;
+    template <typename Told>
+    void tell(Told told);
+
+    std::span<const TaskFamily> m_families;
+    const char *m_walkError;
+
+    mutable std::mutex m_mutex; ///< for the list and the completion callback
+    std::vector<JSON> m_tasks;
+    Completion m_completion;
+    quintptr m_completionContext = 0;
+
+    Callable m_progress;
+    Callable m_state;
+    QTimer *m_timer;
+    bool m_ticking = false;
+    std::atomic<bool> m_unwalked = false; ///< a record may be queued
+    std::atomic<bool> m_stopping = false;
+    NetTask m_worker{NetTask::Turn::Beside}; ///< last: its job uses the others until it has ended
+};

@@ -1,0 +1,312 @@
+#include "fakelists.h"
+#include "isolatedroot.h"
+#include "logcapture.h"
+#include "servicesession.h"
+#include "sessionevents.h"
+#include "taskinfopool.h"
+#include "taskqueue.h"
+#include "taskrepeats.h"
+#include "tasktargets.h"
+
+#include <QCoreApplication>
+#include <QSemaphore>
+#include <QSignalSpy>
+#include <QTest>
+
+#include <thread>
+
+using nlohmann::json;
+
+namespace {
+
+/// What the test's records do when their turn comes.
+std::function<unsigned(TaskStep &)> work;
+
+constexpr TaskFamily::Lines lines = {"failed (%d)", "worked", "threw: ", "no update: "};
+constexpr auto plainIds = [](const JSON &record) { return TaskTargets::ids(record.at("devices")); };
+constexpr auto withPass = [](const JSON &record) {
+    return TaskTargets::withMembers(record.at("devices"), record, {"pass"});
+};
+constexpr auto announce = [](const TaskStep &) {};
+constexpr auto doWork = [](TaskStep &step) { return work(step); };
+
+constexpr TaskFamily families[] = {
+    {"plain", "deviceRestart", "plain_", "devices", false, false, lines, plainIds, announce, doWork},
+    {"secret", "deviceChangePass", "secret_", "devices", false, true, lines, withPass, announce, doWork},
+};
+
+class Queue : public TaskQueue {
+public:
+    Queue() : TaskQueue(families, "walk: ") {}
+    using TaskQueue::insert;
+
+    QString add(const char *type = "plain", const JSON &devices = {"DV1", "DV2"}) {
+        QString ctid;
+        insert(type, {{"devices", devices}, {"pass", "P1:cipher"}}, &ctid);
+        return ctid;
+    }
+};
+
+} // namespace
+
+Q_DECLARE_METATYPE(FailedHandOver)
+
+/// The queue of both task managers, with families of the test's own.
+class TestTaskQueue : public QObject {
+    Q_OBJECT
+
+private slots:
+    void init() {
+        m_log = std::make_unique<LogCapture>();
+        m_service = std::make_unique<FakeLists>();
+        m_queue = std::make_unique<Queue>();
+        work = [](TaskStep &) { return unsigned(ApiOk); };
+    }
+    void cleanup() {
+        m_queue.reset();
+        m_service.reset();
+        CTaskInfoPool::instance().clear();
+        TaskRepeats::instance().clear();
+        QCoreApplication::processEvents();
+        m_log.reset();
+    }
+
+    void recordsRunInOrderAndLateOnesInTheSameWalk() {
+        QStringList done;
+        QSemaphore begun, goOn;
+        work = [&](TaskStep &step) {
+            begun.release();
+            goOn.acquire();
+            done += QString::fromStdString(step.text("ctid"));
+            return unsigned(ApiOk);
+        };
+        const QString first = m_queue->add();
+        const QString second = m_queue->add();
+        std::thread walk([&] { m_queue->handlingTask(); });
+        begun.acquire();
+        QCOMPARE(m_queue->stateOf(first), QString("applying"));
+        QCOMPARE(m_queue->stateOf(second), QString("init"));
+        const QString late = m_queue->add();
+        goOn.release(3);
+        walk.join();
+        QCOMPARE(done, QStringList({first, second, late}));
+        QCOMPARE(m_queue->stateOf(late), QString("apply_done"));
+        QCOMPARE(m_log->count("worked"), 3);
+        QCOMPARE(m_log->count("API access info ip: 127.0.0.1, port: "), 3);
+    }
+
+    void timerStartsTheWorkAndTellsOfIt() {
+        QSignalSpy changed(m_queue.get(), &TaskQueue::recordChanged);
+        QSignalSpy made(m_queue.get(), &TaskQueue::serviceTaskMade);
+        quint32 error = 99;
+        quintptr context = 0;
+        m_queue->setCompletionCallback(7, [&](quintptr c, quint32 e) { context = c, error = e; });
+        work = [](TaskStep &step) {
+            return step.text("ctid").starts_with("plain_") &&
+                           CTaskInfoPool::instance().taskList()->find(QString::fromStdString(step.tid))
+                       ? unsigned(ApiServerError)
+                       : unsigned(ApiOk);
+        };
+        const QString ctid = m_queue->add();
+        QTRY_COMPARE(changed.count(), 2);
+        QCOMPARE(changed[0], QVariantList({ctid, "applying"}));
+        // Failed on purpose: by then the list that is shown had the new task.
+        QCOMPARE(changed[1], QVariantList({ctid, "apply_fail"}));
+        QCOMPARE(made.value(0), QVariantList({ctid, "T1"}));
+        QCOMPARE(m_log->count("failed (15)"), 1);
+        QCOMPARE(context, quintptr(7));
+        QCOMPARE(error, quint32(ApiServerError));
+    }
+
+    void taskThatCannotBeMadeStaysAndIsTold_data() {
+        QTest::addColumn<int>("code");
+        QTest::addColumn<std::string>("made");
+        QTest::addColumn<QString>("reason");
+        const QString unreadable = "the server's answer could not be read";
+        QTest::newRow("refused") << 3 << std::string("null") << QString("the server refused it");
+        QTest::newRow("no tid") << 0 << std::string("{}") << unreadable;
+        QTest::newRow("null tid") << 0 << std::string(R"({"tid":null})") << unreadable;
+        QTest::newRow("no object") << 0 << std::string("[1]") << unreadable;
+    }
+    void taskThatCannotBeMadeStaysAndIsTold() {
+        QFETCH(int, code);
+        QFETCH(std::string, made);
+        QFETCH(QString, reason);
+        if (code != 0)
+            m_service->refuse("/v1/task/init", code);
+        m_service->setTaskMade(json::parse(made));
+        QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
+        bool worked = false;
+        work = [&](TaskStep &) { return worked = true, unsigned(ApiOk); };
+        const QString ctid = m_queue->add("secret");
+        m_queue->handlingTask();
+        m_queue->handlingTask();
+        QTRY_COMPARE(failed.count(), 1);
+        const auto failure = failed[0][0].value<FailedHandOver>();
+        QCOMPARE(failure.ctid, ctid);
+        QCOMPARE(failure.serviceType, QString("deviceChangePass"));
+        QCOMPARE(failure.devices, 2);
+        QCOMPARE(failure.reason, reason);
+        QCOMPARE(m_queue->stateOf(ctid), QString("applying"));
+        QVERIFY(!worked);
+
+        // Started again it is a new task, with the password that the first one never got rid of.
+        m_service->refuse("/v1/task/init", 0);
+        m_service->setTaskMade(nullptr);
+        m_queue->startAgain(ctid);
+        m_queue->handlingTask();
+        QVERIFY(worked);
+        const std::vector<json> sent = m_service->sentTo("/v1/task/init");
+        QCOMPARE(sent.size(), 2u);
+        QVERIFY(sent[1]["devices"] == sent[0]["devices"]);
+        QVERIFY(sent[1]["devices"][0]["pass"] == "P1:cipher");
+    }
+
+    void failedHandOverIsTold_data() {
+        QTest::addColumn<bool>("throws");
+        QTest::newRow("refused") << false;
+        QTest::newRow("exception") << true;
+    }
+    void failedHandOverIsTold() {
+        QFETCH(bool, throws);
+        work = [throws](TaskStep &) -> unsigned {
+            if (throws)
+                throw std::runtime_error("no luck");
+            return ApiTransportError;
+        };
+        QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
+        QSignalSpy dialog(m_queue.get(), &TaskQueue::dialogNeeded);
+        const QString plain = m_queue->add();
+        const QString secret = m_queue->add("secret");
+        m_queue->handlingTask();
+        QTRY_COMPARE(failed.count(), 2);
+        QCOMPARE(m_queue->stateOf(plain), QString("apply_fail"));
+        QCOMPARE(m_log->count(throws ? "threw: no luck" : "failed (12)"), 2);
+        QCOMPARE(m_log->count("failed (12)"), throws ? 0 : 2);
+        work = [](TaskStep &) { return unsigned(ApiOk); };
+        m_queue->startAgain(plain);
+        m_queue->startAgain(secret);
+        m_queue->handlingTask();
+        QCOMPARE(m_service->sentTo("/v1/task/init").size(), 3u);
+        QCOMPARE(dialog.count(), 1);
+        QCOMPARE(dialog[0], QVariantList({"deviceChangePass", QStringList({"DV1", "DV2"})}));
+    }
+
+    void logOffDropsWhatIsQueued_data() {
+        QTest::addColumn<bool>("again");
+        QTest::newRow("log-off") << false;
+        QTest::newRow("another session at once") << true;
+    }
+    void logOffDropsWhatIsQueued() {
+        QFETCH(bool, again);
+        QSemaphore begun, goOn;
+        work = [&](TaskStep &step) {
+            begun.release();
+            goOn.acquire();
+            return step.session.call([](CApiClient &client) { return client.runCustomCgis({}, {}); });
+        };
+        QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
+        const QString running = m_queue->add();
+        const QString queued = m_queue->add();
+        std::thread walk([&] { m_queue->handlingTask(); });
+        begun.acquire();
+        if (again) {
+            m_service->logIn();
+        } else {
+            CLocalStore::instance().clearLoginInfo();
+            CTaskInfoPool::instance().clear();
+            QCOMPARE(m_queue->stateOf(queued), QString("apply_fail"));
+        }
+        goOn.release(2);
+        walk.join();
+        QCoreApplication::processEvents();
+        QCOMPARE(m_queue->stateOf(running), QString("apply_fail"));
+        QCOMPARE(m_queue->stateOf(queued), QString("apply_fail"));
+        QCOMPARE(m_service->sentTo("/v1/task/init").size(), 1u);
+        QCOMPARE(m_service->sentTo("/v1/cgi/custom").size(), 0u);
+        QCOMPARE(failed.count(), 0);
+    }
+
+    void lostSessionIsReported() {
+        m_service->refuse("/v1/task/init", 105);
+        QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
+        QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
+        const QString ctid = m_queue->add();
+        m_queue->handlingTask();
+        QTRY_COMPARE(lost.count(), 1);
+        QCOMPARE(failed.count(), 0);
+        QCOMPARE(m_queue->stateOf(ctid), QString("apply_fail"));
+    }
+
+    void failedDevicesAreRepeated() {
+        QSignalSpy made(m_queue.get(), &TaskQueue::serviceTaskMade);
+        QSignalSpy dialog(m_queue.get(), &TaskQueue::dialogNeeded);
+        JSON record = {{"devices", {"DV1", "DV2"}},
+                       {"cert", {{{"d_mac", "aa:dv1"}}, {{"d_mac", "AADV2"}}, {{"fname", "all"}}}}};
+        QVERIFY(m_queue->insert("plain", record));
+        m_queue->add("secret");
+        JSON files;
+        work = [&](TaskStep &step) { return files = step.record.value("cert", files), unsigned(ApiOk); };
+        m_queue->handlingTask();
+        QTRY_COMPARE(made.count(), 2);
+        const TaskRepeats::Repeat *repeat = TaskRepeats::instance().find("T1");
+        QVERIFY(repeat && !repeat->needsDialog);
+        repeat->again({"DV2"});
+        const TaskRepeats::Repeat *asking = TaskRepeats::instance().find("T2");
+        QVERIFY(asking && asking->needsDialog);
+        asking->again({"DV1"});
+        m_queue->handlingTask();
+        const std::vector<json> sent = m_service->sentTo("/v1/task/init");
+        QCOMPARE(sent.size(), 3u);
+        QVERIFY(sent[2]["devices"] == json::array({"DV2"}));
+        QVERIFY(files == (json{{{"d_mac", "AADV2"}}, {{"fname", "all"}}}));
+        QCOMPARE(dialog.value(0), QVariantList({"deviceChangePass", QStringList{"DV1"}}));
+    }
+
+    void recordThatWouldStopTheWalkIsRefused() {
+        QVERIFY(!m_queue->insert("plain", {{"state", 7}, {"devices", {"DV1"}}}));
+        QVERIFY(!m_queue->insert("plain", {{"state", nullptr}, {"devices", {"DV1"}}}));
+        QVERIFY(!m_queue->insert("other", {{"devices", {"DV1"}}}));
+        QVERIFY(!m_queue->insert("plain", JSON()));
+        QCOMPARE(m_log->count("Inserting new task with the invalid parameter."), 4);
+        m_queue->handlingTask();
+        QCOMPARE(m_log->count("walk: "), 0);
+    }
+
+    void insertionWhileTheListIsWalked() {
+        // Nobody is logged in, so that every step ends at once.
+        CLocalStore::instance().clearLoginInfo();
+        constexpr int records = 3000;
+        std::atomic<bool> inserting = true;
+        std::atomic<int> steps = 0;
+        m_queue->setCompletionCallback(0, [&](quintptr, quint32) { ++steps; });
+        std::thread walk([&] {
+            while (inserting)
+                m_queue->handlingTask();
+            m_queue->handlingTask();
+        });
+        QStringList ctids;
+        for (int i = 0; i < records; ++i) {
+            ctids += m_queue->add(i % 2 ? "plain" : "secret");
+            if (i % 100 == 0)
+                m_queue->dismiss(ctids[i / 2]);
+            if (i % 500 == 0)
+                CTaskInfoPool::instance().clear();
+        }
+        inserting = false;
+        walk.join();
+        QCOMPARE(steps.load(), records);
+        QCOMPARE(QSet<QString>(ctids.begin(), ctids.end()).size(), records);
+        for (int i = 0; i < records; i += 50)
+            QCOMPARE(m_queue->stateOf(ctids[i]), QString("applying"));
+    }
+
+private:
+    IsolatedRoot m_root;
+    std::unique_ptr<LogCapture> m_log;
+    std::unique_ptr<FakeLists> m_service;
+    std::unique_ptr<Queue> m_queue;
+};
+
+QTEST_GUILESS_MAIN(TestTaskQueue)
+#include "tst_taskqueue.moc"
