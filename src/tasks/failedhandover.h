@@ -7,5 +7,5 @@ struct FailedHandOver {
     QString ctid; ///< of its record
     QString serviceType;
     int devices = 0;
-    QString reason; ///< the part of a sentence that follows "could not be started: "
+    QString reason; ///< a whole sentence
 };

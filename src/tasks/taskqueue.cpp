@@ -70,6 +70,10 @@ QStringList idTexts(const JSON &devices) {
     return texts;
 }
 
+QString reasonOf(unsigned result) {
+    return TaskQueue::tr("Reason: %1.").arg(apiResultText(result));
+}
+
 std::string newId(const char *prefix) {
     static std::atomic<unsigned> counter = 0;
     return prefix + std::to_string(++counter);
@@ -233,10 +237,10 @@ void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Out
     else if (outcome.made || over)
         setState(family, step.record, family.failureState());
     if (outcome.result != ApiOk && !over)
-        tell([this, failure = FailedHandOver{
-                        stringMember(step.record, "ctid"), QString::fromLatin1(family.serviceType),
-                        static_cast<int>(step.record.at(family.targets).size()),
-                        apiResultText(outcome.result)}] { emit handOverFailed(failure); });
+        tell([this, failure = FailedHandOver{stringMember(step.record, "ctid"),
+                                             QString::fromLatin1(family.serviceType),
+                                             static_cast<int>(step.record.at(family.targets).size()),
+                                             reasonOf(outcome.result)}] { emit handOverFailed(failure); });
     complete(outcome.result);
 }
 

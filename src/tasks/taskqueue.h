@@ -40,6 +40,9 @@ public:
     /// The worker's body: works on every queued record, those that come meanwhile too. Blocks.
     void handlingTask();
 
+    /// True while a record is at work or waits for it.
+    bool isBusy() const { return m_unwalked || m_worker.isRunning(); }
+
     /// Does the work of a failed record again, as a new record.
     void startAgain(const QString &ctid);
     /// A failed record will not be started again.

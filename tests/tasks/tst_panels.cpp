@@ -1,5 +1,6 @@
 #include "alarmpanel.h"
 #include "confirmdialog.h"
+#include "exetaskmgr.h"
 #include "fakelists.h"
 #include "isolatedroot.h"
 #include "logcapture.h"
@@ -218,6 +219,30 @@ private slots:
         QCOMPARE(m_toasts->texts.size(), 1);
         QCOMPARE(m_log->count("Unsupported notification type when Notifier::ShowMessage"), 1);
         Notifier::instance().setEnabled(true, true);
+    }
+
+    void operationThatDidNotBeginIsToldAndStartedAgain() {
+        showTasks({});
+        auto *strip = m_tasks->findChild<QFrame *>("failedTaskStrip");
+        QVERIFY(!strip->isVisible());
+        m_service->refuse("/v1/task/init", 3);
+        ExeTaskMgr &manager = ExeTaskMgr::instance();
+        QVERIFY(manager.insertNewAutoAssignIpTask({"DV1", "DV2"}));
+        QVERIFY(manager.insertNewExportDebugInfoTask({"DV1"}, "/reports"));
+        auto *text = m_tasks->findChild<QLabel *>("failedTaskLabel");
+        auto *count = m_tasks->findChild<QLabel *>("failedTaskCountLabel");
+        QTRY_VERIFY(strip->isVisible() && count->isVisible());
+        QCOMPARE(count->text(), QString("1 of 2"));
+        QCOMPARE(
+            text->text(),
+            QString("Assign IP Address (Auto) on 2 device(s) did not begin. Reason: the server refused it."));
+        m_service->refuse("/v1/task/init", 0);
+        QTest::mouseClick(button("startAgainButton"), Qt::LeftButton);
+        QVERIFY(text->text().startsWith("Export Debug Info"));
+        QTest::mouseClick(button("dismissFailedTaskButton"), Qt::LeftButton);
+        QVERIFY(!strip->isVisible());
+        QTRY_COMPARE_WITH_TIMEOUT(m_service->sentTo("/v1/assip/auto").size(), 1u, 10000);
+        QVERIFY(m_service->sentTo("/v1/export/debif").empty());
     }
 
     void alarmsAreReadOnceThePanelIsSeen() {

@@ -122,8 +122,8 @@ private slots:
         QTest::addColumn<int>("code");
         QTest::addColumn<std::string>("made");
         QTest::addColumn<QString>("reason");
-        const QString unreadable = "the server's answer could not be read";
-        QTest::newRow("refused") << 3 << std::string("null") << QString("the server refused it");
+        const QString unreadable = "Reason: the server's answer could not be read.";
+        QTest::newRow("refused") << 3 << std::string("null") << QString("Reason: the server refused it.");
         QTest::newRow("no tid") << 0 << std::string("{}") << unreadable;
         QTest::newRow("null tid") << 0 << std::string(R"({"tid":null})") << unreadable;
         QTest::newRow("no object") << 0 << std::string("[1]") << unreadable;
