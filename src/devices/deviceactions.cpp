@@ -35,6 +35,23 @@ int countOf(const std::vector<SiteMembership::DeviceOutcome> &outcomes, Outcome 
         }));
 }
 
+/// How many devices take the credentials, and what became of the others.
+QString authorizationText(const std::map<DeviceStatusCode, int> &states, int asked) {
+    if (states.empty())
+        return DeviceActions::tr(
+            "The credentials were taken. What the devices say shows with the next poll.");
+    int good = 0;
+    QStringList others;
+    for (const auto &[code, count] : states) {
+        if (code == DeviceStatusCode::Authorized || code == DeviceStatusCode::Maintaining)
+            good += count;
+        else
+            others += DeviceActions::tr("%1: %2").arg(DeviceStatus::text(code).trimmed()).arg(count);
+    }
+    const QString summary = DeviceActions::tr("%1 of %2 devices are authorized.").arg(good).arg(asked);
+    return others.isEmpty() ? summary : summary + u' ' + others.join(QStringLiteral(", "));
+}
+
 QString busyText(const QString &name) {
     return DeviceActions::tr("%1 could not be started: the client is busy, try again.").arg(name);
 }
@@ -42,7 +59,58 @@ QString busyText(const QString &name) {
 } // namespace
 
 void DeviceActions::restart(const QStringList &deviceIds) {
-    start(TaskType::title(TaskType::restart), &DeviceOperations::restart, deviceIds);
+    start({TaskType::title(TaskType::restart), deviceIds, &DeviceOperations::restart, {}});
+}
+
+void DeviceActions::restore(const QStringList &deviceIds, const DeviceOperations::RestoreOptions &options) {
+    start({TaskType::title(TaskType::restore),
+           deviceIds,
+           [options](ServiceSession &session, const QStringList &ids) {
+               return DeviceOperations::restore(session, ids, options);
+           },
+           {}});
+}
+
+void DeviceActions::changePassword(const QStringList &deviceIds, const QString &name,
+                                   const QString &password) {
+    start({TaskType::title(TaskType::changePassword), deviceIds,
+           [name, password](ServiceSession &session, const QStringList &ids) {
+               return DeviceOperations::changePassword(session, ids, name, password);
+           },
+           [this](const QStringList &ids) { emit passwordWanted(ids); }});
+}
+
+void DeviceActions::setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy,
+                                      NetTask *runner, const std::function<void()> &begun) {
+    start({TaskType::title(TaskType::passwordPolicy),
+           deviceIds,
+           [policy](ServiceSession &session, const QStringList &ids) {
+               return DeviceOperations::setPasswordPolicy(session, ids, policy);
+           },
+           {}},
+          runner, begun);
+}
+
+void DeviceActions::authorize(const QStringList &deviceIds, const QString &name, const QString &password) {
+    const QString title = tr("Authorize Device");
+    const bool started = ServiceRequest::post(
+        NetJob::createRunner("authorizing devices"), this,
+        [deviceIds, name, password](ServiceSession &session) {
+            return DeviceOperations::authorize(session, deviceIds, name, password);
+        },
+        [this, title, asked = deviceIds.size()](const DeviceOperations::Authorization &outcome) {
+            emit statesChanged();
+            tellVanished(outcome.vanished);
+            if (outcome.result != ApiOk)
+                return emit failed(tr("%1 failed: %2.").arg(title, apiResultText(outcome.result)));
+            emit done(authorizationText(outcome.states, static_cast<int>(asked - outcome.vanished.size())));
+        },
+        [this, title](JobEnd end) {
+            if (end == JobEnd::NotRun || end == JobEnd::Failed)
+                emit failed(busyText(title));
+        });
+    if (!started)
+        emit failed(busyText(title));
 }
 
 void DeviceActions::deleteDevices(const std::vector<DeviceRecordPtr> &devices) {
@@ -145,24 +213,49 @@ void DeviceActions::exportList(const QString &path, const DeviceSnapshotPtr &dev
         });
 }
 
-void DeviceActions::start(const QString &name, Operation operation, const QStringList &deviceIds) {
+void DeviceActions::start(const Errand &errand) {
+    start(errand, NetJob::createRunner(qUtf8Printable(errand.name)), {});
+}
+
+void DeviceActions::start(const Errand &errand, NetTask *runner, const std::function<void()> &begun) {
     const bool started = ServiceRequest::post(
-        NetJob::createRunner(qUtf8Printable(name)), this,
-        [operation, deviceIds](ServiceSession &session) { return operation(session, deviceIds); },
-        [this, name, operation](const DeviceOperations::Outcome &outcome) {
-            if (!outcome.tid.isEmpty())
-                TaskRepeats::instance().remember(
-                    outcome.tid, {[actions = QPointer(this), name, operation](const QStringList &ids) {
-                        if (actions)
-                            actions->start(name, operation, ids);
-                    }});
-            if (outcome.result != ApiOk)
-                emit failed(tr("%1 could not be started: %2.").arg(name, apiResultText(outcome.result)));
+        runner, this,
+        [operation = errand.operation, ids = errand.deviceIds](ServiceSession &session) {
+            return operation(session, ids);
         },
-        [this, name](JobEnd end) {
+        [this, errand, begun](const DeviceOperations::Outcome &outcome) {
+            if (!outcome.tid.isEmpty())
+                remember(outcome.tid, errand);
+            tellVanished(outcome.vanished);
+            if (outcome.result != ApiOk)
+                emit failed(
+                    tr("%1 could not be started: %2.").arg(errand.name, apiResultText(outcome.result)));
+            else if (begun)
+                begun();
+        },
+        [this, name = errand.name](JobEnd end) {
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
                 emit failed(busyText(name));
         });
     if (!started)
-        emit failed(busyText(name));
+        emit failed(busyText(errand.name));
+}
+
+void DeviceActions::remember(const QString &tid, const Errand &errand) {
+    const auto again = [actions = QPointer(this), name = errand.name, operation = errand.operation,
+                        other = errand.again](const QStringList &ids) {
+        if (!actions)
+            return;
+        if (other)
+            other(ids);
+        else
+            actions->start({name, ids, operation, {}});
+    };
+    TaskRepeats::instance().remember(tid, {again, static_cast<bool>(errand.again)});
+}
+
+void DeviceActions::tellVanished(const QStringList &deviceIds) {
+    if (!deviceIds.isEmpty())
+        emit failed(tr("%n device(s) were left out: the server does not manage them any more.", nullptr,
+                       static_cast<int>(deviceIds.size())));
 }

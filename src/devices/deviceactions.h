@@ -8,6 +8,8 @@
 
 #include <functional>
 
+class NetTask;
+
 /// Starts operations on devices, tells when one could not begin, and remembers how to do them again. Each
 /// runs on a runner of its own. User-interface thread.
 class DeviceActions : public QObject {
@@ -17,6 +19,13 @@ public:
     using QObject::QObject;
 
     void restart(const QStringList &deviceIds);
+    void restore(const QStringList &deviceIds, const DeviceOperations::RestoreOptions &options);
+    /// Gives the service the credentials of the devices.
+    void authorize(const QStringList &deviceIds, const QString &name, const QString &password);
+    void changePassword(const QStringList &deviceIds, const QString &name, const QString &password);
+    /// runner: carries the request. begun: called when the task of it has begun.
+    void setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy, NetTask *runner,
+                           const std::function<void()> &begun);
 
     /// Deletes devices from the service for good.
     void deleteDevices(const std::vector<DeviceRecordPtr> &devices);
@@ -34,16 +43,32 @@ signals:
     /// The service's devices are others now, or belong to other sites.
     void devicesChanged();
     void devicesDeleted();
+    /// States of devices have changed that the next poll shows.
+    void statesChanged();
+    /// The user wants to change the password of these devices again; it was not kept.
+    void passwordWanted(const QStringList &deviceIds);
     /// The operation could not begin; the message says which and why.
     void failed(const QString &message);
 
 private:
-    using Operation = DeviceOperations::Outcome (*)(ServiceSession &, const QStringList &);
+    using Operation =
+        std::function<DeviceOperations::Outcome(ServiceSession &, const QStringList &deviceIds)>;
+
+    /// An operation that has a task.
+    struct Errand {
+        QString name; ///< for messages
+        QStringList deviceIds;
+        Operation operation;
+        /// Does the same for other devices, where the operation itself cannot be kept for that.
+        std::function<void(const QStringList &deviceIds)> again;
+    };
 
     /// The records to commit, made on the runner, and what to say when they are.
     struct Change;
     void commit(const QString &name, std::function<Change()> change, std::function<void()> succeeded);
 
-    /// name: of the operation, for messages.
-    void start(const QString &name, Operation operation, const QStringList &deviceIds);
+    void start(const Errand &errand);
+    void start(const Errand &errand, NetTask *runner, const std::function<void()> &begun);
+    void remember(const QString &tid, const Errand &errand);
+    void tellVanished(const QStringList &deviceIds);
 };

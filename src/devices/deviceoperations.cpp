@@ -1,51 +1,199 @@
 #include "deviceoperations.h"
 
+#include "messagelog.h"
+#include "pagereader.h"
 #include "servicesession.h"
 #include "taskinfopool.h"
 #include "tasktype.h"
 
+#include <QDebug>
+#include <QSet>
+
 #include <nlohmann/json.hpp>
+
+#include <array>
+#include <cstdio>
 
 namespace DeviceOperations {
 
 namespace {
 
-/// Makes a task for the devices and shows it in the task list before its work begins.
-Outcome makeTask(ServiceSession &session, const QString &type, const JSON &devices) {
-    JSON task;
-    const unsigned result = session.call(
-        [&](CApiClient &client) { return client.newTaskState(type.toUtf8().constData(), devices, task); });
-    const QString tid = result == ApiOk ? stringMember(task, "tid") : QString();
-    if (result == ApiOk && tid.isEmpty())
-        return {ApiMissingData, {}};
-    if (result == ApiOk)
-        CTaskInfoPool::instance().fetchTaskStatuses(session);
-    return {result, tid};
-}
+constexpr int pageSize = 500;
+/// Devices take commands in a buffer of this size, with the zero at the end.
+constexpr std::size_t commandSize = 256;
 
-/// Runs commands on devices under a task of their own.
-Outcome runCommands(ServiceSession &session, const QString &type, const QStringList &deviceIds,
-                    const JSON &commands) {
+JSON idsOf(const QStringList &deviceIds) {
     JSON ids = JSON::array();
     for (const QString &id : deviceIds)
         ids.push_back(id.toStdString());
-    Outcome outcome = makeTask(session, type, ids);
+    return ids;
+}
+
+/// Makes a task for the devices; the outcome's task is empty where the service made none.
+Outcome makeTask(ServiceSession &session, const QString &type, const QStringList &deviceIds) {
+    JSON task;
+    const unsigned result = session.call([&](CApiClient &client) {
+        return client.newTaskState(type.toUtf8().constData(), idsOf(deviceIds), task);
+    });
+    const QString tid = result == ApiOk ? stringMember(task, "tid") : QString();
+    return {result == ApiOk && tid.isEmpty() ? unsigned{ApiMissingData} : result, tid, {}};
+}
+
+/// Takes out the devices that the service has no more, and returns them.
+QStringList takeVanished(ServiceSession &session, QStringList &deviceIds) {
+    QSet<QString> known;
+    const unsigned result =
+        PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](const JSON &page) {
+            for (const JSON &device : page)
+                known.insert(stringMember(device, "id"));
+        });
+    QStringList vanished;
+    if (result == ApiOk)
+        deviceIds.removeIf([&](const QString &id) {
+            const bool gone = !known.contains(id);
+            if (gone)
+                vanished += id;
+            return gone;
+        });
+    return vanished;
+}
+
+/// Does something for devices, and once more for the rest when the service refuses because some of them are
+/// gone meanwhile: nobody wants a thousand devices left alone for one that was removed.
+template <typename Attempt>
+auto withoutVanished(ServiceSession &session, QStringList &deviceIds, Attempt attempt) {
+    auto outcome = attempt();
+    if (outcome.result != ApiServerError)
+        return outcome;
+    const QStringList vanished = takeVanished(session, deviceIds);
+    if (!vanished.isEmpty() && !deviceIds.isEmpty())
+        outcome = attempt();
+    outcome.vanished = vanished;
+    return outcome;
+}
+
+/// Makes a task, shows it in the task list, and then has its work done for the devices that are left.
+template <typename Work>
+Outcome runUnderTask(ServiceSession &session, const QString &type, QStringList deviceIds, Work work) {
+    Outcome outcome = withoutVanished(session, deviceIds, [&] { return makeTask(session, type, deviceIds); });
     if (outcome.result != ApiOk)
         return outcome;
-    JSON targets = JSON::array();
-    for (const JSON &id : ids)
-        targets.push_back({{"id", id}, {"tid", outcome.tid.toStdString()}});
-    JSON answers;
-    outcome.result =
-        session.call([&](CApiClient &client) { return client.runCustomCgisEx(commands, targets, answers); });
+    CTaskInfoPool::instance().fetchTaskStatuses(session);
+    outcome.result = work(deviceIds, outcome.tid.toStdString());
     return outcome;
+}
+
+/// Runs a command on devices under a task of their own.
+Outcome runCommand(ServiceSession &session, const QString &type, const QStringList &deviceIds,
+                   const QByteArray &command) {
+    return runUnderTask(session, type, deviceIds, [&](const QStringList &ids, const std::string &tid) {
+        JSON targets = JSON::array();
+        for (const QString &id : ids)
+            targets.push_back({{"id", id.toStdString()}, {"tid", tid}});
+        JSON answers;
+        return session.call([&](CApiClient &client) {
+            return client.runCustomCgisEx(JSON::array({command.toStdString()}), targets, answers);
+        });
+    });
+}
+
+QByteArray dumpOf(const QStringList &deviceIds) {
+    return QByteArray::fromStdString(dumpJson(idsOf(deviceIds)));
+}
+
+int countOf(const QStringList &deviceIds) {
+    return static_cast<int>(deviceIds.size());
+}
+
+/// A command in the buffer that devices have for it: what is longer is cut.
+template <typename... Values>
+QByteArray formatted(const char *format, Values... values) {
+    std::array<char, commandSize> buffer{};
+    std::snprintf(buffer.data(), buffer.size(), format, values...);
+    return buffer.data();
+}
+
+std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStringList &deviceIds) {
+    const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
+    std::map<DeviceStatusCode, int> states;
+    const unsigned result =
+        PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](const JSON &page) {
+            for (const JSON &status : page) {
+                if (wanted.contains(stringMember(status, "id")))
+                    ++states[DeviceStatus::codeOf(textMember(status, "connect_status"),
+                                                  textMember(status, "auth_status"),
+                                                  textMember(status, "action_status"))];
+            }
+        });
+    return result == ApiOk ? states : std::map<DeviceStatusCode, int>();
 }
 
 } // namespace
 
+QByteArray passwordCommand(const QString &name, const QString &password) {
+    return formatted("/cgi-bin/admin/editaccount.cgi?method=edit&username=%s&userpass=%s",
+                     name.toUtf8().constData(), password.toUtf8().constData());
+}
+
+QByteArray restoreCommand(const RestoreOptions &options) {
+    const auto &[network, daylightSaving, language, nadp, focus, lens] = options;
+    if (std::max({network, daylightSaving, language, nadp, focus, lens}) < 0)
+        return "/cgi-bin/admin/setparam.cgi?system_restore=1";
+    return formatted("/cgi-bin/admin/setparam.cgi?system_restoreexceptnet=%d&system_restoreexceptdst=%d"
+                     "&system_restoreexceptlang=%d&system_restoreexceptnadp=%d"
+                     "&system_restoreexceptfocusvalue=%d&system_restoreexceptlen=%d",
+                     network, daylightSaving, language, nadp, focus, lens);
+}
+
 Outcome restart(ServiceSession &session, const QStringList &deviceIds) {
-    return runCommands(session, TaskType::restart, deviceIds,
-                       JSON::array({"/cgi-bin/admin/setparam.cgi?system_reset=0"}));
+    return runCommand(session, TaskType::restart, deviceIds, "/cgi-bin/admin/setparam.cgi?system_reset=0");
+}
+
+Outcome restore(ServiceSession &session, const QStringList &deviceIds, const RestoreOptions &options) {
+    qDebug("restore device: device id count[%d], dump[%s], net[%d], dst[%d], lang[%d], nadp[%d], focus[%d], "
+           "len[%d]",
+           countOf(deviceIds), dumpOf(deviceIds).constData(), options.network, options.daylightSaving,
+           options.language, options.nadp, options.focus, options.lens);
+    return runCommand(session, TaskType::restore, deviceIds, restoreCommand(options));
+}
+
+Outcome changePassword(ServiceSession &session, const QStringList &deviceIds, const QString &name,
+                       const QString &password) {
+    qDebug("set password: device id count[%d], dump[%s], name[%s], password[%s]", countOf(deviceIds),
+           dumpOf(deviceIds).constData(), qUtf8Printable(name), MessageLog::secret(password).constData());
+    return runCommand(session, TaskType::changePassword, deviceIds, passwordCommand(name, password));
+}
+
+Outcome setPasswordPolicy(ServiceSession &session, const QStringList &deviceIds,
+                          const PasswordPolicy &policy) {
+    const Outcome outcome = runUnderTask(
+        session, TaskType::passwordPolicy, deviceIds, [&](const QStringList &ids, const std::string &tid) {
+            return session.call([&](CApiClient &client) {
+                return client.setPassPolicy(idsOf(ids), std::to_string(policy.rules).c_str(), policy.length,
+                                            tid.c_str());
+            });
+        });
+    qDebug(outcome.result == ApiOk ? "apply password policy successfully!" : "apply password policy failed!");
+    return outcome;
+}
+
+Authorization authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
+                        const QString &password) {
+    qDebug("authorize device: device id count[%d], dump[%s], name[%s], password[%s]", countOf(deviceIds),
+           dumpOf(deviceIds).constData(), qUtf8Printable(name), MessageLog::secret(password).constData());
+    QStringList ids = deviceIds;
+    Authorization outcome = withoutVanished(session, ids, [&] {
+        return Authorization{session.call([&](CApiClient &client) {
+                                 return client.authDevices(idsOf(ids), name.toUtf8().constData(),
+                                                           password.toUtf8().constData());
+                             }),
+                             {},
+                             {}};
+    });
+    qDebug(outcome.result == ApiOk ? "http api(authDevices) successfully!" : "http api(authDevices) failed!");
+    if (outcome.result == ApiOk)
+        outcome.states = readStates(session, ids);
+    return outcome;
 }
 
 } // namespace DeviceOperations

@@ -1,8 +1,12 @@
 #pragma once
 
 #include "apiresult.h"
+#include "devicestatus.h"
+#include "passwordpolicy.h"
 
 #include <QStringList>
+
+#include <map>
 
 class ServiceSession;
 
@@ -12,10 +16,49 @@ namespace DeviceOperations {
 /// How an operation began; how it goes on shows in its task.
 struct Outcome {
     unsigned result = ApiOk;
-    QString tid; ///< the operation's task; empty where none could be made
+    QString tid;          ///< the operation's task; empty where none could be made
+    QStringList vanished; ///< ids that the service does not know any more; the others went on
 };
 
 /// Has the devices restart.
 Outcome restart(ServiceSession &session, const QStringList &deviceIds);
+
+/// What a restore to factory default does with parts of the settings, in the values that devices take: 1
+/// keeps a part, -1 resets it.
+struct RestoreOptions {
+    int network = -1;
+    int daylightSaving = -1;
+    int language = -1;
+    int nadp = -1;
+    int focus = -1;
+    int lens = -1;
+};
+
+/// Has the devices restore their settings to factory default.
+Outcome restore(ServiceSession &session, const QStringList &deviceIds, const RestoreOptions &options);
+
+/// Changes the password of an account on the devices.
+Outcome changePassword(ServiceSession &session, const QStringList &deviceIds, const QString &name,
+                       const QString &password);
+
+/// Sets the rules that the devices hold passwords to.
+Outcome setPasswordPolicy(ServiceSession &session, const QStringList &deviceIds,
+                          const PasswordPolicy &policy);
+
+/// What came of giving the service the credentials of devices.
+struct Authorization {
+    unsigned result = ApiOk;
+    QStringList vanished;
+    std::map<DeviceStatusCode, int> states; ///< of the devices right after it; empty where not readable
+};
+
+/// Gives the service the credentials for the devices. There is no task for it.
+Authorization authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
+                        const QString &password);
+
+/// The command that changes an account's password, cut to what a device takes.
+QByteArray passwordCommand(const QString &name, const QString &password);
+/// The command that restores settings.
+QByteArray restoreCommand(const RestoreOptions &options);
 
 } // namespace DeviceOperations

@@ -4,6 +4,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include <algorithm>
 #include <optional>
 
 namespace DeviceRecords {
@@ -160,6 +161,19 @@ QStringList siteIdsOf(const JSON &record) {
     return ids;
 }
 
+PasswordPolicy policyOf(const JSON &value) {
+    const auto found = value.find("d_policy");
+    if (found == value.end() || !found->is_object())
+        return {};
+    const auto number = [&](const char *name, int most) {
+        const auto member = found->find(name);
+        return member != found->end() && member->is_number_integer()
+                   ? static_cast<int>(std::clamp<std::int64_t>(member->get<std::int64_t>(), 0, most))
+                   : 0;
+    };
+    return {number("plen", PasswordPolicy::longest), number("type", 63)};
+}
+
 void readColumns(const JSON &value, DeviceRecord &record) {
     Columns columns(record);
     columns.setText(DeviceColumn::Model, stringMember(value, "d_model"));
@@ -220,6 +234,7 @@ DeviceRecordPtr parse(const JSON &value) {
     record->deviceClass = classOf(stringMember(value, "d_svrtype"));
     record->siteIds = siteIdsOf(value);
     record->networkType = stringMember(value, "d_nettype");
+    record->policy = policyOf(value);
     readColumns(value, *record);
     for (const DeviceColumn column :
          {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {

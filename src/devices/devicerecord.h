@@ -1,6 +1,7 @@
 #pragma once
 
 #include "json.h"
+#include "passwordpolicy.h"
 
 #include <QString>
 #include <QStringList>
@@ -42,7 +43,8 @@ struct DeviceRecord {
     QString id;
     DeviceClass deviceClass = DeviceClass::Others;
     QStringList siteIds;
-    QString networkType; ///< empty where the record has none
+    QString networkType;   ///< empty where the record has none
+    PasswordPolicy policy; ///< for the passwords of its accounts
     /// What the columns show, "--" for what the record lacks. The status column's text stands elsewhere.
     std::array<QString, deviceColumnCount> texts;
     /// What the columns are sorted by before their texts: numbers, addresses, versions, times, or the first

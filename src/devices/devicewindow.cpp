@@ -1,25 +1,30 @@
 #include "devicewindow.h"
 
 #include "adddevicedialog.h"
+#include "assignipdialog.h"
+#include "authorizedevicedialog.h"
 #include "clientstore.h"
 #include "consolecorner.h"
-#include "countedtabwidget.h"
 #include "deviceactions.h"
 #include "devicefooter.h"
 #include "devicelog.h"
 #include "devicemenus.h"
 #include "devicemonitor.h"
-#include "devicetab.h"
+#include "devicetabs.h"
 #include "devicetoolbar.h"
 #include "filedialogs.h"
 #include "mainconsoletable.h"
+#include "messagelog.h"
 #include "noticebar.h"
 #include "reconnectingdialog.h"
 #include "refreshdevicedialog.h"
+#include "restoredevicedialog.h"
 #include "servicerequest.h"
+#include "setpassworddialog.h"
 #include "sitecommit.h"
 #include "sitetree.h"
 #include "storewriter.h"
+#include "targetbox.h"
 #include "taskinfopool.h"
 #include "transientmessage.h"
 
@@ -67,8 +72,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_actions(new DeviceActions(this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_noticeBar(new NoticeBar(m_console)),
-      m_tabs(new CountedTabWidget(m_console)),
-      m_corner(new ConsoleCorner(m_tabs)),
+      m_tabs(new DeviceTabs(m_inventory, m_console)),
       m_footer(new DeviceFooter(m_console)),
       m_selectionLogDelay(new QTimer(this)) {
     qDebug("DeviceWindow constructor");
@@ -77,31 +81,15 @@ DeviceWindow::DeviceWindow(QWidget *parent)
         qDebug("net task create failed!should not be this case!");
     m_selectionLogDelay->setSingleShot(true);
     m_selectionLogDelay->setInterval(selectionLogDelay);
-    buildTabs();
     buildLayout();
     connectParts();
-    showCounts();
+    connectOperations();
+    showStatusCounts();
     m_footer->clear();
 }
 
 DeviceWindow::~DeviceWindow() {
     qDebug("DeviceWindow destructor");
-}
-
-void DeviceWindow::buildTabs() {
-    m_tabs->setObjectName(QStringLiteral("deviceTabs"));
-    const std::pair<QString, const char *> tabs[] = {
-        {tr("Camera"), "cameraTable"}, {tr("NVR"), "nvrTable"}, {tr("Others"), "othersTable"}};
-    for (int i = 0; i < deviceClassCount; ++i) {
-        auto *tab = new DeviceTab(static_cast<DeviceClass>(i), &m_inventory, m_tabs->pageParent());
-        tab->table()->setObjectName(QLatin1String(tabs[i].second));
-        tab->table()->setAccessibleName(tabs[i].first);
-        m_tabs->addTab(tab, tabs[i].first);
-        m_deviceTabs.push_back(tab);
-    }
-    m_tabs->setCornerWidget(m_corner);
-    for (const DeviceTab *tab : m_deviceTabs)
-        tab->table()->keepColumns();
 }
 
 void DeviceWindow::buildLayout() {
@@ -132,7 +120,6 @@ void DeviceWindow::connectParts() {
     connect(m_monitor.get(), &DeviceMonitor::ticked, this, &DeviceWindow::onTick);
     connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this,
             &DeviceWindow::onTaskListUpdated);
-    connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
     connect(m_siteTree, &SiteTree::sitesEdited, this,
             [this] { m_noticeBar->setVisible(m_siteTree->edits().isDirty()); });
@@ -145,52 +132,53 @@ void DeviceWindow::connectParts() {
     connect(m_noticeBar, &NoticeBar::msgButtonClicked, this, &DeviceWindow::commitSites);
     connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
-    connect(m_tabs, &CountedTabWidget::currentChanged, this, [this] {
-        showStatusCounts();
-        onSelectionChanged();
-    });
-    for (const DeviceTab *tab : m_deviceTabs)
-        connectTable(tab);
-    connect(m_corner->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
-    connect(m_corner->columnsButton(), &QToolButton::clicked, this, [this] {
-        const QWidget *button = m_corner->columnsButton();
-        DeviceMenus::showColumnMenu(currentTab()->table(), button->mapToGlobal(QPoint(0, button->height())));
-    });
+    connect(m_tabs, &DeviceTabs::currentChanged, this, &DeviceWindow::showStatusCounts);
+    connect(m_tabs, &DeviceTabs::selectionChanged, this, &DeviceWindow::onSelectionChanged);
+    connect(m_tabs, &DeviceTabs::deleteRequested, this, &DeviceWindow::on_deleteButton_clicked);
+    connect(m_tabs, &DeviceTabs::addDeviceRequested, this, &DeviceWindow::openAddDialog);
+    connect(m_tabs, &DeviceTabs::clearFilterRequested, this, &DeviceWindow::clearFilter);
+    connect(m_tabs, &DeviceTabs::rowMenuRequested, this,
+            [this](MainConsoleTable *table, const QPoint &position) {
+                DeviceMenus::showRowMenu(m_toolBar, table, position);
+            });
+    connect(m_tabs->corner()->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
     connect(m_footer, &DeviceFooter::statusFilterChanged, this, &DeviceWindow::applyStatusFilter);
-    connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
-    connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
-    connect(m_actions, &DeviceActions::devicesDeleted, this, &DeviceWindow::onDevicesDeleted);
     connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(m_selected); });
     connect(this, &DeviceWindow::onShowAnimatedMsgDlg, this, &DeviceWindow::showDefAnimateMsgDlg);
-    QComboBox *servers = m_corner->remoteCombo();
+    QComboBox *servers = m_tabs->corner()->remoteCombo();
     connect(servers, &QComboBox::activated, this, [this, servers](int index) {
         const QString id = servers->itemData(index).toString();
         servers->setCurrentIndex(-1);
         emit remoteServerChosen(id);
     });
-    QToolButton *refresh = m_toolBar->button(QStringLiteral("refreshButton"));
-    connect(refresh, &QToolButton::clicked, this, &DeviceWindow::openRefreshDialog);
-    connect(m_toolBar->button(QStringLiteral("addDeviceButton")), &QToolButton::clicked, this,
-            &DeviceWindow::openAddDialog);
-    connect(m_toolBar->button(QStringLiteral("restartButton")), &QToolButton::clicked, this,
-            &DeviceWindow::on_restartButton_clicked);
-    connect(m_toolBar->button(QStringLiteral("deleteButton")), &QToolButton::clicked, this,
-            &DeviceWindow::on_deleteButton_clicked);
-    connect(m_toolBar->entry(QStringLiteral("exportDeviceListAction")), &QAction::triggered, this,
-            &DeviceWindow::exportDeviceList);
     addShortcuts();
 }
 
-void DeviceWindow::connectTable(const DeviceTab *tab) {
-    MainConsoleTable *table = tab->table();
-    connect(table, &MainConsoleTable::selectedDevicesChanged, this, &DeviceWindow::onSelectionChanged);
-    connect(table, &MainConsoleTable::deleteRequested, this, &DeviceWindow::on_deleteButton_clicked);
-    connect(table, &MainConsoleTable::rowMenuRequested, this,
-            [this, table](const QPoint &position) { DeviceMenus::showRowMenu(m_toolBar, table, position); });
-    connect(table, &MainConsoleTable::columnMenuRequested, this,
-            [table](const QPoint &position) { DeviceMenus::showColumnMenu(table, position); });
-    connect(tab, &DeviceTab::addDeviceRequested, this, &DeviceWindow::openAddDialog);
-    connect(tab, &DeviceTab::clearFilterRequested, this, &DeviceWindow::clearFilter);
+void DeviceWindow::connectOperations() {
+    const std::pair<const char *, void (DeviceWindow::*)()> buttons[] = {
+        {"addDeviceButton", &DeviceWindow::openAddDialog},
+        {"authorizeButton", &DeviceWindow::on_authorizeButton_clicked},
+        {"setPasswordButton", &DeviceWindow::on_setPasswordButton_clicked},
+        {"ipButton", &DeviceWindow::on_ipButton_clicked},
+        {"restartButton", &DeviceWindow::on_restartButton_clicked},
+        {"refreshButton", &DeviceWindow::openRefreshDialog},
+        {"deleteButton", &DeviceWindow::on_deleteButton_clicked},
+    };
+    for (const auto &[name, slot] : buttons)
+        connect(m_toolBar->button(QLatin1String(name)), &QToolButton::clicked, this, slot);
+    const std::pair<const char *, void (DeviceWindow::*)()> entries[] = {
+        {"exportDeviceListAction", &DeviceWindow::exportDeviceList},
+        {"factoryDefaultAction", &DeviceWindow::openRestoreDialog},
+    };
+    for (const auto &[name, slot] : entries)
+        connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this, slot);
+    connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
+    connect(m_actions, &DeviceActions::devicesDeleted, this, &DeviceWindow::onDevicesDeleted);
+    connect(m_actions, &DeviceActions::statesChanged, this, [this] { m_monitor->forceRefresh(); });
+    connect(m_actions, &DeviceActions::passwordWanted, this,
+            [this](const QStringList &ids) { openSetPasswordDialog(devicesWith(ids)); });
 }
 
 void DeviceWindow::addShortcuts() {
@@ -200,8 +188,8 @@ void DeviceWindow::addShortcuts() {
         connect(shortcut, &QShortcut::activated, this, slot);
     };
     add(QKeySequence::Find, [this] {
-        m_corner->search()->setFocus();
-        m_corner->search()->selectAll();
+        m_tabs->corner()->search()->setFocus();
+        m_tabs->corner()->search()->selectAll();
     });
     add(Qt::Key_F5, [this] { m_toolBar->button(QStringLiteral("refreshButton"))->click(); });
 }
@@ -235,15 +223,14 @@ void DeviceWindow::stopWork() {
     m_inventory.replace(std::make_shared<DeviceSnapshot>(), {});
     m_siteTree->forgetSites();
     m_noticeBar->hide();
-    for (const DeviceTab *tab : m_deviceTabs)
-        tab->table()->refill();
-    showCounts();
+    m_tabs->refill();
+    showStatusCounts();
     showContent();
     m_footer->clear();
 }
 
 void DeviceWindow::loadRemoteServers() {
-    QComboBox *combo = m_corner->remoteCombo();
+    QComboBox *combo = m_tabs->corner()->remoteCombo();
     combo->clear();
     JSON servers;
     CClientStore::instance().loadServerList(servers);
@@ -312,14 +299,93 @@ void DeviceWindow::openAddDialog() {
     dialog->open();
 }
 
-void DeviceWindow::on_restartButton_clicked() {
+std::vector<DeviceRecordPtr> DeviceWindow::devicesWith(const QStringList &ids) const {
+    std::vector<DeviceRecordPtr> devices;
+    const DeviceSnapshot &snapshot = *m_inventory.snapshot();
+    for (const QString &id : ids) {
+        if (const int place = snapshot.indexOf(id); place >= 0)
+            devices.push_back(snapshot.at(place));
+    }
+    return devices;
+}
+
+OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr> &devices) const {
+    return OperationTargets::of(devices, m_inventory, *CTaskInfoPool::instance().taskList());
+}
+
+void DeviceWindow::on_authorizeButton_clicked() {
+    auto *dialog = new AuthorizeDeviceDialog(targetsOf(m_selected), this);
+    connect(dialog, &AuthorizeDeviceDialog::authDevices, this,
+            [this, dialog](const QString &name, const QString &password) {
+                onAuthDevices(dialog->deviceIds(), name, password);
+            });
+    dialog->open();
+}
+
+void DeviceWindow::onAuthDevices(const QStringList &ids, const QString &name, const QString &password) {
+    qDebug("onAuthDevices, username : %s, password: %s", qUtf8Printable(name),
+           MessageLog::secret(password).constData());
+    m_actions->authorize(ids, name, password);
+}
+
+void DeviceWindow::on_setPasswordButton_clicked() {
+    openSetPasswordDialog(m_selected);
+}
+
+void DeviceWindow::openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices) {
+    if (devices.empty())
+        return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
+    auto *dialog = new SetPasswordDialog(targetsOf(devices), m_actions, this);
+    connect(dialog, &SetPasswordDialog::setPassword, this, &DeviceWindow::onSetPassword);
+    dialog->open();
+}
+
+void DeviceWindow::onSetPassword(JSON &devices, const QString &name, const QString &password) {
+    qDebug("onSetPassword: name: %s, password: %s", qUtf8Printable(name),
+           MessageLog::secret(password).constData());
     QStringList ids;
-    for (const DeviceRecordPtr &device : m_selected)
-        ids += device->id;
-    ask(ConfirmDialog::Kind::RestartDevices, [this, ids] {
+    for (const JSON &id : devices)
+        ids += QString::fromStdString(id.get<std::string>());
+    m_actions->changePassword(ids, name, password);
+}
+
+void DeviceWindow::openRestoreDialog() {
+    auto *dialog = new RestoreDeviceDialog(targetsOf(m_selected), this);
+    connect(dialog, &RestoreDeviceDialog::restoreDevice, this,
+            [this, dialog](int net, int dst, int lang, int nadp, int focus, int lens) {
+                onRestoreDevice(dialog->deviceIds(), {net, dst, lang, nadp, focus, lens});
+            });
+    dialog->open();
+}
+
+void DeviceWindow::onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options) {
+    const auto &[network, daylightSaving, language, nadp, focus, lens] = options;
+    qDebug("onRestoreDevice: network: %d, daylight: %d, lan: %d, nadp: %d, focus: %d, lens: %d", network,
+           daylightSaving, language, nadp, focus, lens);
+    m_actions->restore(ids, options);
+}
+
+void DeviceWindow::on_ipButton_clicked() {
+    auto *dialog = new AssignIpDialogII(targetsOf(m_selected), m_inventory.snapshot(), this);
+    dialog->open();
+}
+
+void DeviceWindow::on_restartButton_clicked() {
+    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this);
+    confirm->setAttribute(Qt::WA_DeleteOnClose);
+    auto *box = new TargetBox(confirm);
+    OperationTargets::List targets = targetsOf(m_selected);
+    const auto warnings = OperationTargets::warnings(targets, OperationTargets::Need::Authorization);
+    box->setTargets(std::move(targets));
+    box->setWarnings(warnings);
+    confirm->addDetail(box);
+    connect(box, &TargetBox::tickedChanged, confirm,
+            [confirm, box] { confirm->setAcceptable(box->tickedCount() > 0); });
+    connect(confirm, &QDialog::accepted, this, [this, box] {
         qDebug("on_restartButton_clicked accepted");
-        m_actions->restart(ids);
+        m_actions->restart(box->tickedIds());
     });
+    confirm->open();
 }
 
 void DeviceWindow::on_deleteButton_clicked() {
@@ -365,7 +431,7 @@ void DeviceWindow::exportDeviceList() {
         tr("CSV files (*.csv)"), QStringLiteral("csv"), [this](const QString &path) {
             StoreWriter::post(
                 [path] { CLocalStore::instance().setDefaultFilePath(QFileInfo(path).absolutePath()); });
-            m_actions->exportList(path, m_inventory.snapshot(), currentTab()->table()->shownDevices());
+            m_actions->exportList(path, m_inventory.snapshot(), m_tabs->currentTable()->shownDevices());
         });
 }
 
@@ -378,24 +444,22 @@ QHash<QString, QString> DeviceWindow::siteNames() const {
 
 void DeviceWindow::applySearch(const QString &text) {
     const DeviceSearch search(text, siteNames());
-    for (const DeviceTab *tab : m_deviceTabs)
-        tab->table()->setSearch(search);
+    m_tabs->setSearch(search);
     onFilterChanged();
 }
 
 void DeviceWindow::applyStatusFilter(std::optional<DeviceStatusGroup> status) {
-    for (const DeviceTab *tab : m_deviceTabs)
-        tab->table()->setStatusFilter(status);
+    m_tabs->setStatusFilter(status);
     onFilterChanged();
 }
 
 void DeviceWindow::clearFilter() {
-    m_corner->search()->clear();
+    m_tabs->corner()->search()->clear();
     m_footer->clearStatusFilter();
 }
 
 void DeviceWindow::onFilterChanged() {
-    showCounts();
+    showStatusCounts();
     showContent();
     onSelectionChanged();
 }
@@ -410,13 +474,12 @@ void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
         const DeviceSnapshotPtr previous = m_inventory.snapshot();
         m_inventory.replace(reading.devices, reading.codes);
         m_everRead = true;
-        for (const DeviceTab *tab : m_deviceTabs)
-            tab->table()->refill();
+        m_tabs->refill();
         DeviceLog::tablesFilled(reading.devices, previous);
         m_footer->markUpdated();
     }
     m_siteTree->setCounts(*m_inventory.snapshot());
-    showCounts();
+    showStatusCounts();
     showContent();
     onSelectionChanged();
 }
@@ -427,9 +490,8 @@ void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
         reload();
     if (!m_inventory.apply(update) || update.changes.empty())
         return;
-    for (const DeviceTab *tab : m_deviceTabs)
-        tab->table()->refreshStatus();
-    showCounts();
+    m_tabs->refreshStatus();
+    showStatusCounts();
     showContent();
 }
 
@@ -512,23 +574,15 @@ void DeviceWindow::commitSites() {
 
 void DeviceWindow::onDevicesDropped(const QString &siteId, const QStringList &deviceIds,
                                     Qt::DropAction action, const QString &sourceSiteId) {
-    std::vector<DeviceRecordPtr> devices;
-    const DeviceSnapshot &snapshot = *m_inventory.snapshot();
-    for (const QString &id : deviceIds) {
-        if (const int place = snapshot.indexOf(id); place >= 0)
-            devices.push_back(snapshot.at(place));
-    }
+    const std::vector<DeviceRecordPtr> devices = devicesWith(deviceIds);
     if (devices.empty())
         return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
     m_actions->putIntoSite(devices, {siteId, sourceSiteId, action == Qt::MoveAction});
 }
 
 void DeviceWindow::onSiteChanged(const QString &siteId) {
-    for (const DeviceTab *tab : m_deviceTabs)
-        tab->table()->setSite(siteId);
-    showCounts();
-    showContent();
-    onSelectionChanged();
+    m_tabs->setSite(siteId);
+    onFilterChanged();
 }
 
 void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
@@ -540,46 +594,35 @@ void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
     }
     if (place < 0)
         return showDefAnimateMsgDlg(tr("The device is not managed any more."));
-    const int tab = static_cast<int>(devices.at(place)->deviceClass);
-    m_tabs->setCurrentIndex(tab);
-    if (!currentTab()->table()->selectDevice(place)) {
-        m_siteTree->select(Sites::overviewId);
-        currentTab()->table()->selectDevice(place);
-    }
+    if (m_tabs->selectDevice(place))
+        return;
+    m_siteTree->select(Sites::overviewId);
+    m_tabs->selectDevice(place);
 }
 
 void DeviceWindow::onSelectionChanged() {
-    const MainConsoleTable *table = currentTab()->table();
+    const MainConsoleTable *table = m_tabs->currentTable();
     m_selected.clear();
     for (const int device : table->selectedDevices())
         m_selected.push_back(m_inventory.snapshot()->at(device));
     qDebug("device selected: %d", static_cast<int>(m_selected.size()));
     m_selectionLogDelay->start();
-    for (const char *name : {"restartButton", "deleteButton"})
+    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "restartButton",
+                             "restoreButton", "deleteButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(!m_selected.empty());
+    m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(!m_selected.empty());
     m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount(), table->unfilteredCount());
 }
 
-void DeviceWindow::showCounts() {
-    for (int i = 0; i < m_tabs->count(); ++i)
-        m_tabs->setCount(i, m_deviceTabs[static_cast<std::size_t>(i)]->table()->rowCount());
-    showStatusCounts();
-}
-
 void DeviceWindow::showStatusCounts() {
-    m_footer->setStatuses(m_inventory, currentTab()->table()->matchingDevices());
+    m_footer->setStatuses(m_inventory, m_tabs->currentTable()->matchingDevices());
 }
 
 void DeviceWindow::showContent() {
     const auto content = m_everRead         ? DeviceTab::Content::Read
                          : m_lastReadFailed ? DeviceTab::Content::Failed
                                             : DeviceTab::Content::Loading;
-    for (DeviceTab *tab : m_deviceTabs)
-        tab->showContent(content, m_siteTree->currentSite() != Sites::overviewId);
-}
-
-DeviceTab *DeviceWindow::currentTab() const {
-    return m_deviceTabs[static_cast<std::size_t>(m_tabs->currentIndex())];
+    m_tabs->showContent(content, m_siteTree->currentSite() != Sites::overviewId);
 }
 
 void DeviceWindow::showDefAnimateMsgDlg(const QString &message) {

@@ -2,8 +2,10 @@
 
 #include "confirmdialog.h"
 #include "deviceinventory.h"
+#include "deviceoperations.h"
 #include "inventoryreader.h"
 #include "nettask.h"
+#include "operationtargets.h"
 
 #include <QElapsedTimer>
 #include <QPointer>
@@ -12,14 +14,11 @@
 #include <functional>
 #include <memory>
 
-class ConsoleCorner;
-class CountedTabWidget;
 class DeviceActions;
 class DeviceFooter;
 class DeviceMonitor;
-class DeviceTab;
+class DeviceTabs;
 class DeviceToolBar;
-class MainConsoleTable;
 class NoticeBar;
 class QSplitter;
 class QTimer;
@@ -68,15 +67,22 @@ signals:
 
 private:
     void buildLayout();
-    void buildTabs();
     void connectParts();
-    void connectTable(const DeviceTab *tab);
+    void connectOperations();
     void addShortcuts();
 
     void onTick();
     void onTaskListUpdated();
     void openAddDialog();
+    void on_authorizeButton_clicked();
+    void onAuthDevices(const QStringList &ids, const QString &name, const QString &password);
+    void on_setPasswordButton_clicked();
+    void openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices);
+    void onSetPassword(JSON &devices, const QString &name, const QString &password);
+    void on_ipButton_clicked();
     void on_restartButton_clicked();
+    void openRestoreDialog();
+    void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
     void on_deleteButton_clicked();
     void exportDeviceList();
     void onDevicesDeleted();
@@ -96,6 +102,9 @@ private:
     void onDevicesDropped(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
                           const QString &sourceSiteId);
     QHash<QString, QString> siteNames() const;
+    /// Those of the devices that are still managed.
+    std::vector<DeviceRecordPtr> devicesWith(const QStringList &ids) const;
+    OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
 
     void openRefreshDialog();
     void onRefreshDevice();
@@ -103,9 +112,7 @@ private:
 
     void loadRemoteServers();
     void showContent();
-    void showCounts();
     void showStatusCounts();
-    DeviceTab *currentTab() const;
 
     DeviceInventory m_inventory;
     std::unique_ptr<DeviceMonitor> m_monitor;
@@ -119,9 +126,7 @@ private:
     DeviceActions *m_actions;
     DeviceToolBar *m_toolBar;
     NoticeBar *m_noticeBar;
-    CountedTabWidget *m_tabs;
-    ConsoleCorner *m_corner;
-    std::vector<DeviceTab *> m_deviceTabs;
+    DeviceTabs *m_tabs;
     DeviceFooter *m_footer;
     QTimer *m_selectionLogDelay;
 

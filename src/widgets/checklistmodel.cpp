@@ -1,6 +1,7 @@
 #include "checklistmodel.h"
 
 #include <algorithm>
+#include <numeric>
 
 void CheckListModel::setItemCount(int count, bool checked) {
     for (int item = count; item < itemCount(); ++item)
@@ -75,13 +76,13 @@ Qt::ItemFlags CheckListModel::flags(const QModelIndex &index) const {
 }
 
 void CheckListModel::sort(int column, Qt::SortOrder order) {
-    if (column < 0 || column >= columnCount())
+    if (column >= columnCount())
         return;
     m_sortColumn = column;
     m_sortOrder = order;
     emit layoutAboutToBeChanged();
     const std::vector<int> before = m_order;
-    sortOrder();
+    sortItems(m_order);
     std::vector<int> rows(m_checked.size());
     for (std::size_t row = 0; row < m_order.size(); ++row)
         rows[static_cast<std::size_t>(m_order[row])] = static_cast<int>(row);
@@ -95,15 +96,24 @@ void CheckListModel::sort(int column, Qt::SortOrder order) {
 void CheckListModel::arrange() {
     beginResetModel();
     m_order = find(m_search);
-    sortOrder();
+    sortItems(m_order);
     endResetModel();
     emit changed();
 }
 
+std::vector<int> CheckListModel::sortedItems() const {
+    std::vector<int> items(m_checked.size());
+    std::iota(items.begin(), items.end(), 0);
+    sortItems(items);
+    return items;
+}
+
 /// Equal ones keep the order in which they came.
-void CheckListModel::sortOrder() {
+void CheckListModel::sortItems(std::vector<int> &items) const {
+    if (m_sortColumn < 0)
+        return;
     const bool ascending = m_sortOrder == Qt::AscendingOrder;
-    std::sort(m_order.begin(), m_order.end(), [&](int left, int right) {
+    std::sort(items.begin(), items.end(), [&](int left, int right) {
         const int difference = compare(left, right, m_sortColumn, ascending);
         return difference != 0 ? difference < 0 : left < right;
     });

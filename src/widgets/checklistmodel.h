@@ -26,6 +26,8 @@ public:
     /// Shows the items alone that match the text.
     void setSearch(const QString &text);
 
+    /// All items in the order of the rows, those that the search hides among them.
+    std::vector<int> sortedItems() const;
     /// The item in a row.
     int itemAt(int row) const { return m_order[static_cast<std::size_t>(row)]; }
 
@@ -33,6 +35,7 @@ public:
     QVariant data(const QModelIndex &index, int role) const override;
     bool setData(const QModelIndex &index, const QVariant &value, int role) override;
     Qt::ItemFlags flags(const QModelIndex &index) const override;
+    /// Column -1 leaves the items in the order in which they came.
     void sort(int column, Qt::SortOrder order) override;
 
 signals:
@@ -56,12 +59,12 @@ protected:
 private:
     void check(int item, bool checked);
     void arrange();
-    void sortOrder();
+    void sortItems(std::vector<int> &items) const;
 
     std::vector<bool> m_checked;
     std::vector<int> m_order; ///< items of the rows
     int m_checkedCount = 0;
     QString m_search;
-    int m_sortColumn = 0;
+    int m_sortColumn = -1; ///< none: as the items came
     Qt::SortOrder m_sortOrder = Qt::AscendingOrder;
 };

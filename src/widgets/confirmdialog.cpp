@@ -89,3 +89,11 @@ ConfirmDialog::ConfirmDialog(Kind kind, QWidget *parent, int count)
 }
 
 ConfirmDialog::~ConfirmDialog() = default;
+
+void ConfirmDialog::addDetail(QWidget *detail) {
+    m_ui->bodyLayout->addWidget(detail);
+}
+
+void ConfirmDialog::setAcceptable(bool acceptable) {
+    m_ui->acceptButton->setEnabled(acceptable);
+}

@@ -29,6 +29,11 @@ public:
     explicit ConfirmDialog(Kind kind, QWidget *parent = nullptr, int count = 1);
     ~ConfirmDialog() override;
 
+    /// Adds what the user should know below the question; the dialog owns it.
+    void addDetail(QWidget *detail);
+    /// Whether the question can be answered with yes.
+    void setAcceptable(bool acceptable);
+
 private:
     std::unique_ptr<Ui::ConfirmDialog> m_ui;
 };

@@ -9,8 +9,8 @@ class PasswordEdit : public QLineEdit {
 public:
     explicit PasswordEdit(QWidget *parent = nullptr);
 
-private:
     void setShown(bool shown);
 
+private:
     QAction *m_eye;
 };

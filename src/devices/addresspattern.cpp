@@ -1,0 +1,156 @@
+#include "addresspattern.h"
+
+#include <QRegularExpression>
+#include <QStringList>
+
+#include <algorithm>
+#include <array>
+#include <cstdlib>
+
+namespace AddressPattern {
+
+namespace {
+
+constexpr int partCount = 4;
+constexpr int largestPart = 255;
+/// A pattern that offers almost nothing usable is given up after so many addresses.
+constexpr int mostLooks = 4'000'000;
+
+struct Span {
+    int first = 0;
+    int last = 0;
+};
+
+Span spanOf(const QString &part) {
+    if (part == QLatin1String("*"))
+        return {0, largestPart};
+    const QStringList ends = part.split(u'-');
+    const auto [low, high] = std::minmax(ends.first().toInt(), ends.last().toInt());
+    return {low, std::min(high, largestPart)};
+}
+
+std::array<Span, partCount> spansOf(const QString &pattern) {
+    std::array<Span, partCount> spans;
+    const QStringList parts = pattern.split(u'.');
+    for (std::size_t i = 0; i < spans.size(); ++i)
+        spans[i] = spanOf(parts[static_cast<qsizetype>(i)]);
+    return spans;
+}
+
+/// Those for loops and groups, and what is none.
+bool isReserved(int firstPart) {
+    return firstPart == 0 || firstPart == 127 || firstPart >= 224;
+}
+
+/// Collects the usable addresses of a pattern in ascending order.
+class Collector {
+public:
+    Collector(const QString &pattern, std::size_t wanted, const Limits &limits)
+        : m_spans(spansOf(pattern)), m_wanted(wanted), m_limits(limits) {}
+
+    std::vector<quint32> collect() {
+        descend(0, 0);
+        return std::move(m_found);
+    }
+
+private:
+    void descend(std::size_t part, quint32 prefix) {
+        for (int number = m_spans[part].first; number <= m_spans[part].last && !isDone(); ++number) {
+            if (part == 0 && isReserved(number))
+                continue;
+            const quint32 address = prefix << 8 | static_cast<quint32>(number);
+            if (part + 1 < m_spans.size())
+                descend(part + 1, address);
+            else
+                look(address);
+        }
+    }
+
+    void look(quint32 address) {
+        ++m_looks;
+        if (isUsable(address, m_limits))
+            m_found.push_back(address);
+    }
+
+    bool isDone() const { return m_found.size() == m_wanted || m_looks == mostLooks; }
+
+    std::array<Span, partCount> m_spans;
+    std::size_t m_wanted;
+    const Limits &m_limits;
+    int m_looks = 0;
+    std::vector<quint32> m_found;
+};
+
+} // namespace
+
+bool isAddress(const QString &text) {
+    static const QRegularExpression rule(QStringLiteral(
+        R"(\A(?:1\d?\d?|2(?:[0-4]\d?|[6789]|5[0-5]?)?|[3-9]\d?|0)(?:\.(?:1\d?\d?|2(?:[0-4]\d?|[6789]|5[0-5]?)?|[3-9]\d?|0)){3}\z)"));
+    return rule.match(text).hasMatch();
+}
+
+bool isPattern(const QString &text) {
+    static const QRegularExpression rule(QStringLiteral(
+        R"(^(\*|(?:\d{1,3}(?:-\d{1,3})?))\.(\*|(?:\d{1,3}(?:-\d{1,3})?))\.(\*|(?:\d{1,3}(?:-\d{1,3})?))\.(\*|(?:\d{1,3}(?:-\d{1,3})?))\z)"));
+    return rule.match(text).hasMatch();
+}
+
+QStringList split(const QString &list) {
+    static const QRegularExpression separator(QStringLiteral("[,;\\s]+"));
+    return list.split(separator, Qt::SkipEmptyParts);
+}
+
+qint64 count(const QString &pattern) {
+    qint64 product = 1;
+    for (const QString &part : pattern.split(u'.')) {
+        const QStringList ends = part.split(u'-');
+        if (part == QLatin1String("*"))
+            product *= largestPart + 1;
+        else if (part.contains(u'-'))
+            product *= ends.size() == 2 ? std::abs(ends[0].toInt() - ends[1].toInt()) + 1 : 0;
+    }
+    return product;
+}
+
+bool isUsable(quint32 address, const Limits &limits) {
+    const quint32 host = address & ~limits.mask;
+    const bool isEnd = ~limits.mask > 1 && (host == 0 || host == ~limits.mask);
+    return !isReserved(static_cast<int>(address >> 24)) && !isEnd && address != limits.gateway &&
+           !limits.taken.contains(address);
+}
+
+std::vector<quint32> lowest(const QStringList &patterns, std::size_t wanted, const Limits &limits) {
+    std::vector<quint32> all;
+    for (const QString &pattern : patterns) {
+        const std::vector<quint32> found = Collector(pattern, wanted, limits).collect();
+        all.insert(all.end(), found.begin(), found.end());
+    }
+    std::sort(all.begin(), all.end());
+    all.erase(std::unique(all.begin(), all.end()), all.end());
+    all.resize(std::min(all.size(), wanted));
+    return all;
+}
+
+} // namespace AddressPattern
+
+quint32 Ipv4::parse(const QString &address) {
+    quint32 value = 0;
+    for (const QString &part : address.split(u'.'))
+        value = value << 8 | part.toUInt();
+    return value;
+}
+
+QString Ipv4::toText(quint32 address) {
+    return QStringLiteral("%1.%2.%3.%4")
+        .arg(address >> 24)
+        .arg(address >> 16 & 255)
+        .arg(address >> 8 & 255)
+        .arg(address & 255);
+}
+
+bool Ipv4::isMask(const QString &text) {
+    if (!AddressPattern::isAddress(text))
+        return false;
+    const quint32 zeros = ~parse(text);
+    return zeros != 0 && zeros != ~quint32{0} && (zeros & (zeros + 1)) == 0;
+}

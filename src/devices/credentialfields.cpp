@@ -1,0 +1,35 @@
+#include "credentialfields.h"
+
+#include "credentialrules.h"
+#include "passwordedit.h"
+
+#include <QComboBox>
+#include <QLabel>
+#include <QLineEdit>
+
+namespace CredentialFields {
+
+QComboBox *makeName(QWidget *parent) {
+    auto *name = new QComboBox(parent);
+    name->setObjectName(QStringLiteral("nameComboBox"));
+    name->setEditable(true);
+    name->setInsertPolicy(QComboBox::NoInsert);
+    name->addItems({QStringLiteral("root"), QStringLiteral("admin")});
+    name->lineEdit()->setMaxLength(CredentialRules::longestName);
+    return name;
+}
+
+PasswordEdit *makePassword(const char *objectName, QWidget *parent) {
+    auto *password = new PasswordEdit(parent);
+    password->setObjectName(QLatin1String(objectName));
+    password->setMaxLength(CredentialRules::longestPassword);
+    return password;
+}
+
+bool tell(QLabel *line, const QString &problem) {
+    line->setText(problem);
+    line->setVisible(!problem.isEmpty());
+    return problem.isEmpty();
+}
+
+} // namespace CredentialFields

@@ -1,0 +1,57 @@
+#pragma once
+
+#include "countedtabwidget.h"
+#include "devicerecord.h"
+#include "devicestatus.h"
+#include "devicetab.h"
+
+#include <optional>
+#include <vector>
+
+class ConsoleCorner;
+class DeviceInventory;
+class DeviceSearch;
+class MainConsoleTable;
+
+/// The device tables, one tab a class of devices, and what stands beside the tabs.
+class DeviceTabs : public CountedTabWidget {
+    Q_OBJECT
+
+public:
+    /// The inventory must outlive the tabs.
+    explicit DeviceTabs(const DeviceInventory &inventory, QWidget *parent = nullptr);
+
+    ConsoleCorner *corner() const { return m_corner; }
+    MainConsoleTable *currentTable() const;
+
+    /// The inventory has other devices now.
+    void refill();
+    /// The inventory has other states now.
+    void refreshStatus();
+
+    void setSite(const QString &siteId);
+    void setSearch(const DeviceSearch &search);
+    void setStatusFilter(std::optional<DeviceStatusGroup> status);
+
+    /// isSite: a site is shown, not the overview.
+    void showContent(DeviceTab::Content content, bool isSite);
+
+    /// Turns to a device and selects it; false where its table does not show it.
+    bool selectDevice(int place);
+
+signals:
+    /// The selection of the current table, or which one that is, has changed.
+    void selectionChanged();
+    void deleteRequested();
+    void addDeviceRequested();
+    void clearFilterRequested();
+    void rowMenuRequested(MainConsoleTable *table, const QPoint &position);
+
+private:
+    void addTable(DeviceClass deviceClass, const QString &title, const char *name);
+    void showCounts();
+
+    const DeviceInventory &m_inventory;
+    ConsoleCorner *m_corner;
+    std::vector<DeviceTab *> m_tabs;
+};

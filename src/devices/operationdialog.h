@@ -1,0 +1,58 @@
+#pragma once
+
+#include "framelessdialog.h"
+#include "operationtargets.h"
+#include "warningline.h"
+
+class QLabel;
+class QPushButton;
+class QVBoxLayout;
+class TargetBox;
+
+/// A dialog that asks for what an operation on devices needs: its fields, below them the devices, then the
+/// buttons "Cancel" and the one that begins the operation, which stays off while no device is ticked.
+class OperationDialog : public FramelessDialog {
+    Q_OBJECT
+
+public:
+    ~OperationDialog() override;
+
+protected:
+    OperationDialog(const QString &title, const QString &acceptText, const char *acceptName, QWidget *parent);
+
+    /// Shows the devices below the fields that were added so far.
+    void showTargets(OperationTargets::List targets, OperationTargets::Need need);
+
+    /// Adds a part below those there are.
+    void addPart(QWidget *part);
+    /// Adds a field with its caption above it and a line below it for what is wrong; returns that line.
+    QLabel *addField(const QString &caption, QWidget *field, const char *warningName);
+
+    QWidget *body() const { return m_body; }
+    const TargetBox &targets() const { return *m_targets; }
+    QPushButton *acceptButton() const { return m_accept; }
+
+    /// What speaks against some of the devices beside their states; replaces what an earlier call gave.
+    void setWarnings(std::vector<TargetWarning> warnings);
+    /// What is wrong with the whole; empty for nothing.
+    void setComplaint(const QString &text) { m_complaint.setText(text); }
+
+    /// The accept button was pressed, with devices ticked.
+    virtual void apply() = 0;
+    /// Whether it can be pressed at all, as far as the fields go; asked when devices are ticked or unticked.
+    virtual bool isComplete() const { return true; }
+    void updateAccept();
+
+    /// Text of a given kind of label, plain whatever it says.
+    QLabel *label(const QString &text, const char *role) const;
+
+private:
+    QWidget *buildFooter(const QString &acceptText, const char *acceptName);
+
+    QWidget *m_body;
+    QVBoxLayout *m_parts;
+    TargetBox *m_targets;
+    QPushButton *m_accept = nullptr;
+    WarningLine m_complaint;
+    std::vector<TargetWarning> m_given; ///< what the devices' states speak against
+};

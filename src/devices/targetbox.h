@@ -1,0 +1,47 @@
+#pragma once
+
+#include "operationtargets.h"
+
+#include <QWidget>
+
+class QCheckBox;
+class QLabel;
+class QToolButton;
+class TargetModel;
+class TargetWarningLines;
+
+/// The part of a dialog that names the devices an operation is meant for: how many, a list that opens to be
+/// searched and unticked, and what speaks against some of them, with a way to leave those out.
+class TargetBox : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit TargetBox(QWidget *parent = nullptr);
+
+    void setTargets(OperationTargets::List targets);
+    /// Replaces what is said against targets.
+    void setWarnings(std::vector<TargetWarning> warnings);
+
+    const OperationTargets::List &targets() const;
+    /// Places of the targets that are ticked.
+    std::vector<int> ticked() const;
+    int tickedCount() const;
+    QStringList tickedIds() const;
+
+signals:
+    /// Other devices are ticked now.
+    void tickedChanged();
+
+private:
+    QWidget *buildHead();
+    QWidget *buildList();
+    void toggleList();
+    void showTicked();
+
+    TargetModel *m_model;
+    QLabel *m_count = nullptr;
+    QToolButton *m_toggle = nullptr;
+    QWidget *m_list = nullptr;
+    QCheckBox *m_all = nullptr;
+    TargetWarningLines *m_warnings;
+};
