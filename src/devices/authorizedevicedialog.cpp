@@ -9,13 +9,13 @@
 #include <QLineEdit>
 
 AuthorizeDeviceDialog::AuthorizeDeviceDialog(OperationTargets::List targets, QWidget *parent)
-    : OperationDialog(tr("Authorize Device"), tr("Apply"), "applyButton", parent),
+    : OperationDialog(tr("Authorize Device"), parent),
       m_name(CredentialFields::makeName(body())),
       m_password(CredentialFields::makePassword("passEdit", body())),
       m_nameWarning(addField(tr("Username"), m_name, "nameWarningLabel")),
       m_passwordWarning(addField(tr("Password"), m_password, "passWarningLabel")) {
     setObjectName(QStringLiteral("AuthorizeDeviceDialog"));
-    showTargets(std::move(targets), OperationTargets::Need::Connection);
+    finish(std::move(targets), OperationTargets::Need::Connection, tr("Apply"), "applyButton");
     setWarnings(accountWarnings());
     const auto clear = [](QLabel *line) { return [line] { CredentialFields::tell(line, {}); }; };
     connect(m_name, &QComboBox::editTextChanged, this, clear(m_nameWarning));
@@ -32,13 +32,12 @@ std::vector<TargetWarning> AuthorizeDeviceDialog::accountWarnings() const {
         targets().targets(),
         {{DeviceStatusCode::AccountBlocked,
           [](int count) {
-              return tr("%n device(s) have blocked their account and refuse every password for a while.",
-                        nullptr, count);
+              return tr("%n device(s) will fail: their account is blocked for a while.", nullptr, count);
           },
           tr("Account blocked")},
          {DeviceStatusCode::InvalidPassword,
           [](int count) {
-              return tr("%n device(s) refused the last password. Another wrong one may block their account.",
+              return tr("%n device(s) refused the last password; another wrong one may block the account.",
                         nullptr, count);
           },
           tr("Invalid password")}});

@@ -87,11 +87,11 @@ std::vector<TargetWarning> IpAssignment::conflicts(const Network &network,
     std::vector<TargetWarning> found;
     warn(
         found, items, [&](int item) { return address(item) != 0 && uses.value(address(item)) > 1; },
-        [](int count) { return Texts::tr("%n device(s) share an address.", nullptr, count); },
+        [](int count) { return Texts::tr("Addresses given twice: %n device(s).", nullptr, count); },
         Texts::tr("Address given twice"));
     warn(
         found, items, [&](int item) { return taken.contains(address(item)); },
-        [](int count) { return Texts::tr("%n address(es) belong to other devices.", nullptr, count); },
+        [](int count) { return Texts::tr("Addresses of other devices: %n.", nullptr, count); },
         Texts::tr("Address in use"));
     warn(
         found, items,
@@ -100,8 +100,7 @@ std::vector<TargetWarning> IpAssignment::conflicts(const Network &network,
                    !AddressPattern::isUsable(address(item), {network.mask, network.gateway, {}});
         },
         [](int count) {
-            return Texts::tr("%n address(es) are no device's: network, broadcast, gateway or reserved ones.",
-                             nullptr, count);
+            return Texts::tr("Network, broadcast, gateway or reserved addresses: %n.", nullptr, count);
         },
         Texts::tr("No device address"));
     return found;
@@ -116,7 +115,7 @@ std::vector<TargetWarning> IpAssignment::doubts(const Network &network, const st
                    (address(item) & network.mask) != (network.gateway & network.mask);
         },
         [](int count) {
-            return Texts::tr("%n device(s) would not reach the gateway, which is in another subnet.", nullptr,
+            return Texts::tr("%n device(s) would not reach the gateway: it is in another subnet.", nullptr,
                              count);
         },
         Texts::tr("Gateway in another subnet"));

@@ -20,24 +20,20 @@ QLabel *namedLabel(const char *name, QWidget *parent) {
 
 } // namespace
 
-OperationDialog::OperationDialog(const QString &title, const QString &acceptText, const char *acceptName,
-                                 QWidget *parent)
+OperationDialog::OperationDialog(const QString &title, QWidget *parent)
     : FramelessDialog(parent),
+      m_layout(new QVBoxLayout(content())),
       m_body(new QWidget(content())),
       m_parts(new QVBoxLayout(m_body)),
-      m_targets(new TargetBox(m_body)),
       m_complaint(namedLabel("msgWarningIcon", m_body), namedLabel("msgWarningLabel", m_body)) {
     setWindowTitle(title);
     setAttribute(Qt::WA_DeleteOnClose);
     m_parts->setContentsMargins(20, 18, 20, 12);
     m_parts->setSpacing(8);
-    auto *layout = new QVBoxLayout(content());
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(0);
-    layout->addWidget(m_body, 1);
-    layout->addWidget(buildFooter(acceptText, acceptName));
+    m_layout->setContentsMargins(0, 0, 0, 0);
+    m_layout->setSpacing(0);
+    m_layout->addWidget(m_body, 1);
     content()->setFixedWidth(dialogWidth);
-    connect(m_targets, &TargetBox::tickedChanged, this, &OperationDialog::updateAccept);
 }
 
 OperationDialog::~OperationDialog() = default;
@@ -64,8 +60,10 @@ QWidget *OperationDialog::buildFooter(const QString &acceptText, const char *acc
     return footer;
 }
 
-void OperationDialog::showTargets(OperationTargets::List targets, OperationTargets::Need need) {
+void OperationDialog::finish(OperationTargets::List targets, OperationTargets::Need need,
+                             const QString &acceptText, const char *acceptName) {
     m_given = OperationTargets::warnings(targets, need);
+    m_targets = new TargetBox(m_body);
     m_targets->setTargets(std::move(targets));
     m_targets->setWarnings(m_given);
     m_parts->addWidget(m_targets);
@@ -76,6 +74,9 @@ void OperationDialog::showTargets(OperationTargets::List targets, OperationTarge
     layout->addWidget(m_body->findChild<QLabel *>(QStringLiteral("msgWarningIcon")));
     layout->addWidget(m_body->findChild<QLabel *>(QStringLiteral("msgWarningLabel")), 1);
     m_parts->addWidget(line);
+    m_layout->addWidget(buildFooter(acceptText, acceptName));
+    connect(m_targets, &TargetBox::tickedChanged, this, &OperationDialog::updateAccept);
+    updateAccept();
 }
 
 void OperationDialog::addPart(QWidget *part) {

@@ -18,10 +18,12 @@ public:
     ~OperationDialog() override;
 
 protected:
-    OperationDialog(const QString &title, const QString &acceptText, const char *acceptName, QWidget *parent);
+    OperationDialog(const QString &title, QWidget *parent);
 
-    /// Shows the devices below the fields that were added so far.
-    void showTargets(OperationTargets::List targets, OperationTargets::Need need);
+    /// Adds the devices and the buttons below the fields: the last thing that a constructor does, so that the
+    /// keyboard's way leads from top to bottom.
+    void finish(OperationTargets::List targets, OperationTargets::Need need, const QString &acceptText,
+                const char *acceptName);
 
     /// Adds a part below those there are.
     void addPart(QWidget *part);
@@ -49,9 +51,10 @@ protected:
 private:
     QWidget *buildFooter(const QString &acceptText, const char *acceptName);
 
+    QVBoxLayout *m_layout;
     QWidget *m_body;
     QVBoxLayout *m_parts;
-    TargetBox *m_targets;
+    TargetBox *m_targets = nullptr;
     QPushButton *m_accept = nullptr;
     WarningLine m_complaint;
     std::vector<TargetWarning> m_given; ///< what the devices' states speak against

@@ -63,7 +63,7 @@ std::vector<TargetWarning> warnings(const List &targets, Need need) {
     warn(
         found, targets,
         [](const OperationTarget &target) { return target.status == DeviceStatusCode::Unreachable; },
-        [](int count) { return Texts::tr("%n device(s) cannot be reached and will fail.", nullptr, count); },
+        [](int count) { return Texts::tr("%n device(s) will fail: not reachable.", nullptr, count); },
         Texts::tr("Unreachable"));
     if (need != Need::Connection)
         warn(
@@ -71,16 +71,14 @@ std::vector<TargetWarning> warnings(const List &targets, Need need) {
             [need](const OperationTarget &target) {
                 return target.status != DeviceStatusCode::Unreachable && !isAuthorized(target.status, need);
             },
-            [](int count) {
-                return Texts::tr("%n device(s) are not authorized and will fail.", nullptr, count);
-            },
+            [](int count) { return Texts::tr("%n device(s) will fail: not authorized.", nullptr, count); },
             Texts::tr("Not authorized"));
     warn(
         found, targets,
         [](const OperationTarget &target) {
             return !target.busyWith.isEmpty() || target.status == DeviceStatusCode::Maintaining;
         },
-        [](int count) { return Texts::tr("%n device(s) are busy with another task.", nullptr, count); },
+        [](int count) { return Texts::tr("%n device(s) at work for another task.", nullptr, count); },
         Texts::tr("Busy"));
     return found;
 }

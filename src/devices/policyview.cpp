@@ -1,7 +1,6 @@
 #include "policyview.h"
 
 #include "icons.h"
-#include "theme.h"
 
 #include <QHBoxLayout>
 #include <QLabel>
@@ -12,7 +11,7 @@ namespace {
 constexpr QSize iconSize{12, 12};
 const QString metIcon = QStringLiteral(":/images/icon_general_success_solid_green.svg");
 const QString unmetIcon = QStringLiteral(":/images/icon_general_warning_solid.svg");
-const QString openIcon = QStringLiteral(":/images/icon_general_none_line.svg");
+const QString openIcon = QStringLiteral(":/images/icon_general_success_solid_gray.svg");
 
 } // namespace
 
@@ -37,8 +36,7 @@ void PolicyView::addLine(const QString &text, const QString &icon) {
     auto *line = new QWidget(this);
     auto *mark = new QLabel(line);
     mark->setFixedWidth(iconSize.width());
-    mark->setPixmap(
-        Icons::pixmap(icon, iconSize, devicePixelRatioF(), icon == openIcon ? Theme::textQuiet : QColor()));
+    mark->setPixmap(Icons::pixmap(icon, iconSize, devicePixelRatioF()));
     auto *label = new QLabel(text, line);
     label->setObjectName(QStringLiteral("policyRuleLabel"));
     label->setTextFormat(Qt::PlainText);

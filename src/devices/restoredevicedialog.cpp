@@ -27,7 +27,7 @@ constexpr std::size_t networkPart = 0;
 } // namespace
 
 RestoreDeviceDialog::RestoreDeviceDialog(OperationTargets::List targets, QWidget *parent)
-    : OperationDialog(tr("Restore to Factory Default"), tr("Restore"), "restoreButton", parent) {
+    : OperationDialog(tr("Restore to Factory Default"), parent) {
     setObjectName(QStringLiteral("RestoreDeviceDialog"));
     auto *heading = label(tr("Restore all settings to factory default, including:"), "");
     heading->setWordWrap(true);
@@ -39,9 +39,9 @@ RestoreDeviceDialog::RestoreDeviceDialog(OperationTargets::List targets, QWidget
     }
     connect(m_parts[networkPart], &QCheckBox::toggled, this, &RestoreDeviceDialog::showRisk);
     buildCountField();
+    finish(std::move(targets), OperationTargets::Need::Authorization, tr("Restore"), "restoreButton");
     acceptButton()->setProperty("role", "danger");
-    showTargets(std::move(targets), OperationTargets::Need::Authorization);
-    updateAccept();
+    m_parts[networkPart]->setFocus();
 }
 
 void RestoreDeviceDialog::buildCountField() {

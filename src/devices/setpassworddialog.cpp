@@ -39,7 +39,7 @@ QString strengthText(Passwords::Strength strength) {
 } // namespace
 
 SetPasswordDialog::SetPasswordDialog(OperationTargets::List targets, DeviceActions *actions, QWidget *parent)
-    : OperationDialog(tr("Set Password"), tr("Apply"), "applyButton", parent),
+    : OperationDialog(tr("Set Password"), parent),
       m_actions(actions),
       m_netTask(new (std::nothrow) NetTask),
       m_name(CredentialFields::makeName(body())),
@@ -60,7 +60,7 @@ SetPasswordDialog::SetPasswordDialog(OperationTargets::List targets, DeviceActio
     m_confirmWarning = addField(tr("Confirm Password"), m_confirm, "confirmWarningLabel");
     buildPolicyHead();
     addPart(m_policyView);
-    showTargets(std::move(targets), OperationTargets::Need::Account);
+    finish(std::move(targets), OperationTargets::Need::Account, tr("Apply"), "applyButton");
     connect(m_name, &QComboBox::editTextChanged, this, &SetPasswordDialog::onTextChanged);
     connect(m_password, &QLineEdit::textChanged, this, &SetPasswordDialog::onTextChanged);
     connect(m_confirm, &QLineEdit::textChanged, this, &SetPasswordDialog::onTextChanged);

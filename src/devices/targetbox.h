@@ -4,9 +4,7 @@
 
 #include <QWidget>
 
-class QCheckBox;
 class QLabel;
-class QToolButton;
 class TargetModel;
 class TargetWarningLines;
 
@@ -34,14 +32,10 @@ signals:
 
 private:
     QWidget *buildHead();
-    QWidget *buildList();
-    void toggleList();
+    void openList();
     void showTicked();
 
     TargetModel *m_model;
     QLabel *m_count = nullptr;
-    QToolButton *m_toggle = nullptr;
-    QWidget *m_list = nullptr;
-    QCheckBox *m_all = nullptr;
     TargetWarningLines *m_warnings;
 };

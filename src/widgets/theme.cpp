@@ -71,6 +71,8 @@ QPalette palette() {
         palette.setColor(role, text);
     for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
         palette.setColor(QPalette::Disabled, role, textOff);
+    palette.setColor(QPalette::Link, accent);
+    palette.setColor(QPalette::LinkVisited, accent);
     palette.setColor(QPalette::PlaceholderText, textQuiet);
     palette.setColor(QPalette::ToolTipBase, raised);
     return palette;
