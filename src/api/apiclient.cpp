@@ -3,6 +3,7 @@
 #include "ciphers.h"
 #include "httpexchange.h"
 #include "messagelog.h"
+#include "transfererror.h"
 
 #include <QDebug>
 
@@ -106,35 +107,54 @@ unsigned CApiClient::postAsAccount(const Call &call, JSON body, JSON *output) {
 }
 
 unsigned CApiClient::post(const Call &call, const JSON &body, JSON *output) {
+    return send(
+        call,
+        [&body](HttpRequest &request) {
+            // The service wants this type although the body is JSON.
+            request.contentType = "application/x-www-form-urlencoded";
+            request.body = dumpJson(body);
+        },
+        output);
+}
+
+unsigned CApiClient::send(const Call &call, const Fill &fill, JSON *output) {
     try {
-        HttpRequest request;
-        request.host = m_strHost;
-        request.port = m_uPort;
-        request.verb = "POST";
-        request.path = call.path;
-        // The service wants this type although the body is JSON.
-        request.contentType = "application/x-www-form-urlencoded";
-        request.authorization = call.genericToken ? Ciphers::genericToken().value_or("") : m_strAccess;
-        request.body = dumpJson(body);
-        request.totalTimeout = m_totalTimeout;
-        qDebug("CApiClient::%s > Set authorization to %s", call.method,
-               MessageLog::secret(request.authorization).constData());
-        const HttpAnswer answer = exchangeHttp(request);
-        if (!answer.arrived) {
-            std::cout << "HTTP error: " << answer.error << std::endl;
-            if (call.logTransportError)
-                call.logTransportError(call, answer.error);
-            return ApiTransportError;
-        }
-        if (call.logAnswer)
-            call.logAnswer(call, answer);
-        return judge(call, answer, output);
+        return exchange(call, fill, output);
+    } catch (const TransferError &error) {
+        if (m_transfer)
+            m_transfer->fail(error.failure(), error.file());
+        logException(call, error.what());
+        if (error.failure() == TransferFailure::TargetNotWritten)
+            return ApiTargetNotWritten;
     } catch (const std::exception &error) {
         logException(call, error.what());
     } catch (...) {
         logException(call, "Unknown exception");
     }
     return ApiException;
+}
+
+unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) {
+    HttpRequest request;
+    request.host = m_strHost;
+    request.port = m_uPort;
+    request.verb = "POST";
+    request.path = call.path;
+    request.authorization = call.genericToken ? Ciphers::genericToken().value_or("") : m_strAccess;
+    request.totalTimeout = m_totalTimeout;
+    fill(request);
+    qDebug("CApiClient::%s > Set authorization to %s", call.method,
+           MessageLog::secret(request.authorization).constData());
+    const HttpAnswer answer = exchangeHttp(request);
+    if (!answer.arrived) {
+        std::cout << call.transportError << answer.error << std::endl;
+        if (call.logTransportError)
+            call.logTransportError(call, answer.error);
+        return ApiTransportError;
+    }
+    if (call.logAnswer)
+        call.logAnswer(call, answer);
+    return judge(call, answer, output);
 }
 
 void CApiClient::logException(const Call &call, const std::string &error) {
@@ -146,12 +166,17 @@ void CApiClient::logException(const Call &call, const std::string &error) {
 unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, JSON *output) {
     if (answer.status != 200)
         return ApiHttpStatusError;
+    if (answer.isFile) {
+        renewToken(call, answer.authorization);
+        return ApiOk;
+    }
     const JSON body = parseJson(answer.body);
     const unsigned result = (call.judgeCode ? call.judgeCode : judgeUsualCode)(codeOf(body));
     if (result != ApiOk)
         return result;
-    if (!answer.authorization.empty())
-        renewToken(call, answer.authorization);
+    renewToken(call, answer.authorization);
+    if (call.payload == Payload::File)
+        return ApiMissingData;
     if (call.payload == Payload::None || !output)
         return ApiOk;
     const auto data = body.find("data");
@@ -162,10 +187,14 @@ unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, JSON *out
 }
 
 void CApiClient::renewToken(const Call &call, const std::string &token) {
+    if (token.empty())
+        return;
     if (!isToken(token)) {
         qWarning("CApiClient::%s > the renewed token is malformed and was not taken", call.method);
         return;
     }
     m_strAccess = token;
-    qDebug("CApiClient::%s > m_strAccess: %s", call.method, MessageLog::secret(m_strAccess).constData());
+    const std::string begin =
+        call.renewal ? call.renewal : std::string("CApiClient::") + call.method + " > m_strAccess: ";
+    qDebug("%s%s", begin.c_str(), MessageLog::secret(m_strAccess).constData());
 }

@@ -5,15 +5,22 @@
 
 #include <chrono>
 #include <cstdint>
+#include <functional>
+#include <memory>
 #include <string>
+#include <vector>
 
 struct HttpAnswer;
+struct HttpRequest;
+struct UploadPart;
+class Transfer;
 
 /// One request to the device manager service.
 ///
 /// A short-lived object: construct it with the service's address, set account and token, call one method,
-/// look at its result, destroy it. Every method opens its own HTTPS connection, blocks for at most a minute,
-/// and returns an ApiResult; no exception leaves it. Used by one thread for one call.
+/// look at its result, destroy it. Every method opens its own HTTPS connection, blocks for at most a minute
+/// (a transfer of files: as long as there is progress within a minute), and returns an ApiResult; no
+/// exception leaves it. Used by one thread for one call.
 ///
 /// Unless a method says otherwise it needs a token and an account (ApiInvalidArgument without them, nothing
 /// sent), and outputs are filled only with ApiOk.
@@ -30,8 +37,10 @@ public:
     bool setAccessToken(const char *szToken);
     /// False for null.
     bool setAccount(const char *szAccount);
-    /// The time that a call may take altogether, in place of a minute.
+    /// The time that a call may take altogether, or a transfer without progress, in place of a minute.
     void setTotalTimeout(std::chrono::milliseconds timeout) { m_totalTimeout = timeout; }
+    /// Lets somebody watch and cancel the transfer of files that is called next, and learn why it failed.
+    void setTransfer(std::shared_ptr<Transfer> transfer) { m_transfer = std::move(transfer); }
     /// The raw token: as set, or as the service renewed it in the last call.
     const std::string &accessToken() const { return m_strAccess; }
 
@@ -89,7 +98,13 @@ public:
     /// Sends the body, which names its "devices", to a path of the service.
     virtual unsigned runGeneralCgis(const char *szPath, const JSON &body);
 
-    // Tasks, alarms, log
+    // Service settings
+
+    virtual unsigned loadServerSettings(JSON &settings);
+    /// Sends those members of the object that are settings of the service, nothing else.
+    virtual unsigned saveServerSettings(const JSON &settings);
+
+    // Tasks and alarms
 
     /// Registers a task. devices: array of ids or of objects with "id" and the task's parameters. task: its
     /// record.
@@ -104,11 +119,41 @@ public:
     virtual unsigned listAlarmInfo(int nStart, int nCount, JSON &alarms);
     /// alids: array of the ids of alarms.
     virtual unsigned removeAlarmInfo(const JSON &alids);
-    /// Log entries of a time range, both ends Unix ms as decimal text and inclusive. table: array of objects
-    /// whose members are named like the columns of the log page; ApiException when an entry lacks a value.
-    virtual unsigned browseLogs(const char *szStart, const char *szEnd, JSON &table);
+
+    // Files for devices, each the work of a task that was registered before
+    //
+    // They are read while they are sent, so their size costs no memory. A file has to be a plain one with
+    // something in it, and has to stay as it is until it is sent: ApiException otherwise. Why a transfer
+    // failed is told by the Transfer, if one was set. It may take long: run it beside the turn of other jobs.
+    // szPath: full path. szFileName: what it is called at the service. Texts are UTF-8. devices: array of
+    // ids.
+
+    virtual unsigned uploadConfigFile(const char *szTaskId, const char *szPath, const char *szFileName,
+                                      const JSON &devices);
+    /// A service on this computer is given the path alone and reads the image itself.
+    virtual unsigned uploadFWFile(const char *szTaskId, const char *szPath, const char *szFileName);
+    /// bSdCard: whether the package goes to the device's memory card.
+    virtual unsigned uploadPackage(const char *szTaskId, const char *szPath, const char *szFileName,
+                                   const JSON &devices, bool bSdCard);
+    /// settings: object with "mode", "https_port", "country", "state", "locality", "org", "org_unit" and
+    /// "validity"; others are not sent. devices: array of objects with "id" and "tid". No file is sent.
+    virtual unsigned createHttpsSelfSignedCerts(const JSON &settings, const JSON &devices);
+    /// certs: array of objects with "fpath", "fname" and "d_mac", one a device.
+    virtual unsigned createHttpsCertsInstall(const char *szTaskId, const JSON &certs);
+    /// certs and pkeys: arrays as above, both for the same devices.
+    virtual unsigned createHttpsCertsPKeys(const char *szTaskId, const JSON &certs, const JSON &pkeys);
+    virtual unsigned uploadPEAPCA(const char *szTaskId, const char *szPath, const char *szFileName);
+    /// szPath: of the CA certificate. certs and pkeys: as of createHttpsCertsPKeys.
+    virtual unsigned uploadTLSCA(const char *szTaskId, const char *szPath, const char *szFileName,
+                                 const JSON &certs, const JSON &pkeys);
+
+    // Exports
+
     /// Has debug information collected. szStorePath: where, on the service's machine.
     virtual unsigned exportDebugInfo(const char *szStorePath, const JSON &devices, JSON &answer);
+    /// Fetches the file (a zip) of a finished export. szTarget: the path it gets, which has to be free;
+    /// nothing is there unless it is whole. ApiTargetNotWritten when it exists already or cannot be written.
+    virtual unsigned exportFile(const char *szTaskId, const char *szTarget);
 
     // Configuration of devices
 
@@ -120,26 +165,28 @@ public:
     /// szTemplate: the text of a template file. devices: as for runQuickSetup.
     virtual unsigned setTemplate(const JSON &devices, const char *szTemplate, JSON &answer);
 
-    // Service settings
+    // The service's log
 
-    virtual unsigned loadServerSettings(JSON &settings);
-    /// Sends those members of the object that are settings of the service, nothing else.
-    virtual unsigned saveServerSettings(const JSON &settings);
+    /// Log entries of a time range, both ends Unix ms as decimal text and inclusive. table: array of objects
+    /// whose members are named like the columns of the log page; ApiException when an entry lacks a value.
+    virtual unsigned browseLogs(const char *szStart, const char *szEnd, JSON &table);
 
 protected:
-    enum class Payload { None, Plain, Ciphered };
+    enum class Payload { None, Plain, Ciphered, File };
 
     /// What tells one request from another; the rest of the road is the same for all.
     struct Call {
         const char *method; ///< as it stands in the log lines
         const char *path;
         Payload payload = Payload::None;
-        bool genericToken = false; ///< a fresh token of its own in place of the session's
+        bool genericToken = false;                   ///< a fresh token of its own in place of the session's
+        const char *transportError = "HTTP error: "; ///< begins the line on standard output
         void (*logTransportError)(const Call &call, const std::string &error) = nullptr;
         void (*logException)(const Call &call, const std::string &error) = nullptr;
         unsigned (*judgeCode)(int code) = nullptr; ///< in place of the usual judging of "code"
         /// Called with every answer, whatever its status, before it is judged.
         void (*logAnswer)(const Call &call, const HttpAnswer &answer) = nullptr;
+        const char *renewal = nullptr; ///< begins the log line of a renewed token, in place of the usual
     };
 
     /// Sends body to the call's path by POST and judges the answer. output: set where the call has a payload.
@@ -156,6 +203,20 @@ protected:
     static bool isStage(const char *szStage);
 
 private:
+    /// Gives a request, which has what all of them have, what it has of its own.
+    using Fill = std::function<void(HttpRequest &)>;
+
+    unsigned send(const Call &call, const Fill &fill, JSON *output);
+    unsigned exchange(const Call &call, const Fill &fill, JSON *output);
+
+    /// How the uploads differ from the rest of the road.
+    static Call uploadCall(const char *method, const char *path, const char *transportError = nullptr);
+    static Call certificateCall(const char *method, const char *path);
+    /// Sends a form: the parameters with task and account, then the files.
+    unsigned upload(const Call &call, const char *szTaskId, JSON parameters,
+                    const std::vector<UploadPart> &files);
+    std::shared_ptr<Transfer> transferOrOwn() const;
+
     unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
     static void logException(const Call &call, const std::string &error);
     void renewToken(const Call &call, const std::string &token);
@@ -166,4 +227,5 @@ private:
     std::string m_strPassCipher;
     std::string m_strAccount;
     std::chrono::milliseconds m_totalTimeout{60000};
+    std::shared_ptr<Transfer> m_transfer;
 };

@@ -18,6 +18,8 @@ QString apiResultText(unsigned result) {
         return tr("a secret could not be ciphered");
     case ApiInvalidArgument:
         return tr("nobody is logged in");
+    case ApiTargetNotWritten:
+        return tr("the file exists already or cannot be written");
     default:
         return tr("error %1").arg(result);
     }

@@ -1,48 +1,21 @@
 #include "httpexchange.h"
 
+#include "answerhead.h"
+#include "bodysender.h"
+#include "downloadtarget.h"
 #include "requestdeadline.h"
+#include "transfererror.h"
 
 #include <httplib.h>
+
+#include <optional>
 
 namespace {
 
 constexpr std::size_t bodyLimit = 64u << 20;
-/// Of the head; the TLS record (16 KiB) that goes beyond it is still read.
-constexpr std::size_t headLimit = 16u << 10;
+constexpr int tooLarge = 413;
 constexpr const char *clientCertificate = "./client.cer";
 constexpr const char *clientKey = "./client.key";
-
-/// Keeps the head of an answer within bounds: the transport reads a status line of any length and then
-/// matches it with a recursive expression, whose stack a long line would overflow.
-class HeadLimit {
-public:
-    /// The context may call back as long as it lives.
-    void watch(SSL_CTX *context) {
-        SSL_CTX_set_msg_callback(context, &HeadLimit::onMessage);
-        SSL_CTX_set_msg_callback_arg(context, this);
-    }
-    /// The head is complete; the body has a limit of its own.
-    void lift() { m_lifted = true; }
-
-private:
-    static void onMessage(int isSent, int, int type, const void *bytes, std::size_t, SSL *session,
-                          void *limit) {
-        if (isSent || type != SSL3_RT_HEADER || !SSL_is_init_finished(session))
-            return;
-        const auto *recordHead = static_cast<const unsigned char *>(bytes);
-        static_cast<HeadLimit *>(limit)->addRecord(recordHead[3] * 256u + recordHead[4], session);
-    }
-
-    void addRecord(std::size_t length, SSL *session) {
-        // What came before counts: a record may hold the end of the head and the beginning of the body.
-        if (!m_lifted && m_received > headLimit)
-            SSL_set_shutdown(session, SSL_get_shutdown(session) | SSL_RECEIVED_SHUTDOWN);
-        m_received += length;
-    }
-
-    std::size_t m_received = 0;
-    bool m_lifted = false;
-};
 
 /// With the client certificate when both of its files load, else without one: the service decides.
 std::unique_ptr<httplib::SSLClient> makeClient(const HttpRequest &request) {
@@ -65,49 +38,145 @@ void configure(httplib::SSLClient &client, const HttpRequest &request, RequestDe
     client.set_connection_timeout(own ? request.waitTimeout : request.totalTimeout);
     if (own)
         client.set_read_timeout(request.waitTimeout);
+    if (request.transfer) {
+        // A service may need a while to store what it gets; the deadline sees to it that it ends.
+        client.set_read_timeout(request.totalTimeout);
+        client.set_write_timeout(request.totalTimeout);
+    }
 }
 
-} // namespace
+/// The answer as it comes in.
+class Receiver {
+public:
+    Receiver(const HttpRequest &request, HttpAnswer &answer, RequestDeadline &deadline)
+        : m_request(request), m_answer(answer), m_deadline(deadline) {}
 
-HttpAnswer exchangeHttp(const HttpRequest &request) {
+    void start(const httplib::Response &response) {
+        m_answer.isFile = m_request.target && response.status == 200 &&
+                          response.get_header_value("Content-Type").starts_with("application/octet-stream");
+        if (!m_answer.isFile)
+            return;
+        // Without either of them a connection that broke would pass for the end of the file.
+        m_isBounded = response.has_header("Content-Length") || response.has_header("Transfer-Encoding");
+        m_request.transfer->begin(response.get_header_value<std::uint64_t>("Content-Length"));
+    }
+
+    bool take(const char *bytes, std::size_t length) {
+        if (m_answer.isFile)
+            return m_isBounded && takeOfFile(bytes, length);
+        if (m_answer.body.size() + length > bodyLimit)
+            return false;
+        m_answer.body.append(bytes, length);
+        return true;
+    }
+
+    bool isWhole() const { return !m_answer.isFile || m_isBounded; }
+
+private:
+    bool takeOfFile(const char *bytes, std::size_t length) {
+        m_received += length;
+        m_deadline.restart();
+        m_request.transfer->advance(m_received);
+        return !m_request.transfer->isCancelled() && m_request.target->write(bytes, length);
+    }
+
+    const HttpRequest &m_request;
+    HttpAnswer &m_answer;
+    RequestDeadline &m_deadline;
+    std::uint64_t m_received = 0;
+    bool m_isBounded = false;
+};
+
+/// What is to be said of a request without an answer; of a transfer, also to whoever watches it.
+HttpAnswer failed(const HttpRequest &request, bool timeIsOver, const std::string &error) {
+    if (request.target && request.target->hasFailed())
+        throw TransferError(TransferFailure::TargetNotWritten, "the target cannot be written",
+                            request.target->name());
     HttpAnswer answer;
-    if (request.port == 0 || request.port > 65535) {
-        answer.error = "Invalid port";
+    answer.error = timeIsOver ? "Time is over" : error;
+    if (!request.transfer)
         return answer;
-    }
-    RequestDeadline deadline(request.totalTimeout);
-    HeadLimit head;
-    const std::unique_ptr<httplib::SSLClient> client = makeClient(request);
-    if (!client->is_valid()) {
-        answer.error = "SSL context";
-        return answer;
-    }
-    configure(*client, request, deadline);
-    head.watch(client->ssl_context());
+    request.transfer->fail(timeIsOver ? TransferFailure::Stalled : TransferFailure::RefusedOrLost);
+    if (request.transfer->isCancelled())
+        answer.error = "Canceled";
+    return answer;
+}
 
+httplib::Request messageOf(const HttpRequest &request) {
     httplib::Request message;
     message.method = request.verb;
     message.path = request.path;
     message.headers = {{"Content-Type", request.contentType}, {"Authorization", request.authorization}};
     message.body = request.body;
-    message.response_handler = [&head](const httplib::Response &) {
-        head.lift();
-        return true;
-    };
-    message.content_receiver = [&answer](const char *data, std::size_t length, std::uint64_t, std::uint64_t) {
-        if (answer.body.size() + length > bodyLimit)
-            return false;
-        answer.body.append(data, length);
-        return true;
-    };
-    const httplib::Result result = client->send(message);
-    if (!result) {
-        answer.body.clear();
-        answer.error = deadline.isOver() ? "Time is over" : httplib::to_string(result.error());
-        return answer;
+    return message;
+}
+
+/// A request of an SSL client from the first to the last byte.
+class Exchange {
+public:
+    explicit Exchange(const HttpRequest &request)
+        : m_request(request), m_deadline(request.totalTimeout), m_receiver(request, m_answer, m_deadline) {
+        if (request.transfer)
+            m_cutOnCancel.emplace(*request.transfer, [this] { m_deadline.cut(); });
     }
-    answer.arrived = true;
-    answer.status = result->status;
-    answer.authorization = result->get_header_value("Authorization");
-    return answer;
+
+    HttpAnswer run() {
+        const std::unique_ptr<httplib::SSLClient> client = makeClient(m_request);
+        if (!client->is_valid())
+            return failed(m_request, false, "SSL context");
+        configure(*client, m_request, m_deadline);
+        m_head.watch(client->ssl_context());
+        const httplib::Request message = prepared();
+        return judged(client->send(message));
+    }
+
+private:
+    httplib::Request prepared() {
+        httplib::Request message = messageOf(m_request);
+        if (m_request.form)
+            m_sender.emplace(*m_request.form, *m_request.transfer, m_deadline, m_head).attach(message);
+        message.response_handler = [this](const httplib::Response &response) {
+            m_head.lift();
+            m_receiver.start(response);
+            return true;
+        };
+        message.content_receiver = [this](const char *data, std::size_t length, std::uint64_t,
+                                          std::uint64_t) { return m_receiver.take(data, length); };
+        return message;
+    }
+
+    HttpAnswer judged(const httplib::Result &result) {
+        if (m_sender)
+            m_sender->rethrow();
+        if (m_sender && m_sender->refusal() != 0)
+            return arrived(m_sender->refusal());
+        if (!result || !m_receiver.isWhole())
+            return failed(m_request, m_deadline.isOver(), httplib::to_string(result.error()));
+        m_answer.authorization = result->get_header_value("Authorization");
+        return arrived(result->status);
+    }
+
+    HttpAnswer arrived(int status) {
+        m_answer.arrived = true;
+        m_answer.status = status;
+        if (m_request.transfer && status == tooLarge)
+            m_request.transfer->fail(TransferFailure::TooLarge);
+        return std::move(m_answer);
+    }
+
+    const HttpRequest &m_request;
+    HttpAnswer m_answer;
+    RequestDeadline m_deadline;
+    std::optional<Transfer::CutOnCancel> m_cutOnCancel;
+    AnswerHead m_head;
+    Receiver m_receiver;
+    std::optional<BodySender> m_sender;
+};
+
+} // namespace
+
+HttpAnswer exchangeHttp(const HttpRequest &request) {
+    if (request.port == 0 || request.port > 65535)
+        return failed(request, false, "Invalid port");
+    return Exchange(request).run();
 }

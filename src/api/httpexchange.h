@@ -4,6 +4,10 @@
 #include <cstdint>
 #include <string>
 
+class DownloadTarget;
+class MultipartBody;
+class Transfer;
+
 /// One HTTPS request, as the transport needs it.
 struct HttpRequest {
     std::string host;
@@ -14,7 +18,10 @@ struct HttpRequest {
     std::string authorization; ///< the bare value, without a scheme word
     std::string body;
     std::chrono::milliseconds waitTimeout{0};      ///< to connect, and of each read; 0 for the defaults
-    std::chrono::milliseconds totalTimeout{60000}; ///< of the whole request
+    std::chrono::milliseconds totalTimeout{60000}; ///< of the whole request; of a transfer without progress
+    Transfer *transfer = nullptr;                  ///< makes it a transfer, which this one counts and can end
+    MultipartBody *form = nullptr;                 ///< of a transfer: sent in place of body
+    DownloadTarget *target = nullptr;              ///< of a transfer: takes the answer's body if it is a file
 };
 
 /// What came back. Without an answer, error holds the reason's name and nothing else is set.
@@ -24,8 +31,10 @@ struct HttpAnswer {
     int status = 0;
     std::string authorization; ///< the answer's header of that name, or empty
     std::string body;
+    bool isFile = false; ///< the body went to the request's target, whole
 };
 
 /// Opens a connection, sends the request, reads the answer (64 MiB of body at most) and closes. Blocks; any
-/// thread whose stack has 64 MiB, which a hostile status line needs. Throws only what allocation throws.
+/// thread whose stack has 64 MiB, which a hostile status line needs. Throws
+/// what allocation throws, and for a transfer TransferError; how it failed otherwise is told to the transfer.
 HttpAnswer exchangeHttp(const HttpRequest &request);

@@ -46,6 +46,17 @@ public:
             watched.connection.cut();
     }
 
+    /// The watching thread need not hear of it: when it wakes, it sees the later end.
+    void postpone(std::uint64_t id, Clock::time_point end) {
+        const std::lock_guard lock(m_mutex);
+        m_watched.at(id).end = end;
+    }
+
+    void cut(std::uint64_t id) {
+        const std::lock_guard lock(m_mutex);
+        cut(m_watched.at(id));
+    }
+
     bool isOver(std::uint64_t id) {
         const std::lock_guard lock(m_mutex);
         return m_watched.at(id).over;
@@ -96,8 +107,8 @@ private:
 
 } // namespace
 
-RequestDeadline::RequestDeadline(std::chrono::milliseconds total)
-    : m_id(Watchdog::instance().add(Clock::now() + total)) {}
+RequestDeadline::RequestDeadline(std::chrono::milliseconds time)
+    : m_time(time), m_id(Watchdog::instance().add(Clock::now() + time)) {}
 
 RequestDeadline::~RequestDeadline() {
     Watchdog::instance().remove(m_id);
@@ -105,6 +116,14 @@ RequestDeadline::~RequestDeadline() {
 
 void RequestDeadline::watch(long long socket) {
     Watchdog::instance().connect(m_id, SocketLifeline(socket));
+}
+
+void RequestDeadline::restart() {
+    Watchdog::instance().postpone(m_id, Clock::now() + m_time);
+}
+
+void RequestDeadline::cut() {
+    Watchdog::instance().cut(m_id);
 }
 
 bool RequestDeadline::isOver() const {
