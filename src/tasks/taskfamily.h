@@ -2,13 +2,17 @@
 
 #include "json.h"
 
+#include <memory>
+
 class ServiceSession;
+class Transfer;
 
 /// One record's turn at work, as its family's functions see it. On a runner's thread.
 struct TaskStep {
     ServiceSession &session;
     const JSON &record;
-    std::string tid = {}; ///< the service task's id; empty before it is made
+    std::shared_ptr<Transfer> transfer; ///< to be given to a call that sends files
+    std::string tid = {};               ///< the service task's id; empty before it is made
 
     /// The text of a member of the record; empty where there is none.
     std::string text(const char *member) const { return std::string(textMember(record, member)); }
@@ -16,12 +20,13 @@ struct TaskStep {
 
 /// What tells the records of one type from those of another: one row of a queue's table.
 struct TaskFamily {
-    const char *type;        ///< of the records
-    const char *serviceType; ///< of the tasks made on the service
-    const char *idPrefix;    ///< of the records' ids
-    const char *targets;     ///< the member that holds the devices
-    bool isUpload = false;   ///< sends a file; else it applies something
-    bool asksAgain = false;  ///< holds a password or a key, which a repetition has to ask for
+    const char *type;               ///< of the records
+    const char *serviceType;        ///< of the tasks made on the service
+    const char *idPrefix;           ///< of the records' ids
+    const char *targets;            ///< the member that holds the devices
+    bool isUpload = false;          ///< sends a file; else it applies something
+    bool asksAgain = false;         ///< holds a password or a key, which a repetition has to ask for
+    const char *fileName = nullptr; ///< the member with the name of the one file that is sent
 
     struct Lines {
         const char *failure; ///< "%d" stands for the result

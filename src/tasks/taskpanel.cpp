@@ -13,7 +13,9 @@
 #include "taskrepeats.h"
 #include "taskstate.h"
 #include "tasktexts.h"
+#include "transferstrip.h"
 #include "transientmessage.h"
+#include "uploadtaskmgr.h"
 
 #include <QAction>
 #include <QButtonGroup>
@@ -193,6 +195,8 @@ QWidget *TaskPanel::buildStrips() {
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
     layout->addWidget(failed);
+    layout->addWidget(new TransferStrip(&UploadTaskMgr::instance(), box));
+    failed->follow(&UploadTaskMgr::instance());
     failed->follow(&ExeTaskMgr::instance());
     return box;
 }

@@ -5,7 +5,10 @@
 #include "sessionevents.h"
 #include "taskinfopool.h"
 #include "taskrepeats.h"
+#include "taskstate.h"
 #include "tasktargets.h"
+#include "tasktype.h"
+#include "transfer.h"
 
 #include <QCoreApplication>
 #include <QDebug>
@@ -70,8 +73,15 @@ QStringList idTexts(const JSON &devices) {
     return texts;
 }
 
-QString reasonOf(unsigned result) {
-    return TaskQueue::tr("Reason: %1.").arg(apiResultText(result));
+QString reasonOf(unsigned result, const Transfer &transfer) {
+    const QString text = transfer.failureText();
+    return !text.isEmpty() ? text : TaskQueue::tr("Reason: %1.").arg(apiResultText(result));
+}
+
+/// What is sent, for people.
+QString nameOf(const TaskFamily &family, const TaskStep &step) {
+    return family.fileName ? stringMember(step.record, family.fileName)
+                           : TaskType::title(QString::fromLatin1(family.serviceType));
 }
 
 std::string newId(const char *prefix) {
@@ -184,7 +194,8 @@ void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
         setState(family, record, family.failureState());
         return complete(ApiInvalidArgument);
     }
-    TaskStep step{session, record};
+    TaskStep step{session, record, std::make_shared<Transfer>()};
+    setSending({nameOf(family, step), step.transfer});
     setState(family, record, family.workingState());
     Outcome outcome;
     try {
@@ -196,6 +207,7 @@ void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
         qWarning("%sUnknown exception", family.lines.exception);
         outcome.made = !step.tid.empty();
     }
+    setSending({});
     finish(family, step, outcome);
 }
 
@@ -223,6 +235,10 @@ TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step) 
         logLine(QtDebugMsg, family.lines.success, result);
     else
         logLine(QtWarningMsg, family.lines.failure, result);
+    // The service would wait for the rest of it until it gives up.
+    if (result != ApiOk && step.transfer->isCancelled())
+        CTaskInfoPool::instance().updateTaskState(step.session, QString::fromStdString(step.tid),
+                                                  TaskState::aborted);
     return {result, true};
 }
 
@@ -236,11 +252,11 @@ void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Out
         setState(family, step.record, family.successState());
     else if (outcome.made || over)
         setState(family, step.record, family.failureState());
-    if (outcome.result != ApiOk && !over)
-        tell([this, failure = FailedHandOver{stringMember(step.record, "ctid"),
-                                             QString::fromLatin1(family.serviceType),
-                                             static_cast<int>(step.record.at(family.targets).size()),
-                                             reasonOf(outcome.result)}] { emit handOverFailed(failure); });
+    if (outcome.result != ApiOk && !over && !step.transfer->isCancelled())
+        tell([this, failure = FailedHandOver{
+                        stringMember(step.record, "ctid"), QString::fromLatin1(family.serviceType),
+                        static_cast<int>(step.record.at(family.targets).size()),
+                        reasonOf(outcome.result, *step.transfer)}] { emit handOverFailed(failure); });
     complete(outcome.result);
 }
 
@@ -336,6 +352,7 @@ void TaskQueue::dismiss(const QString &ctid) {
 }
 
 void TaskQueue::onSessionEnded() {
+    cancelSending();
     const quint64 present = presentSession();
     std::vector<JSON> dropped;
     {
@@ -356,6 +373,22 @@ void TaskQueue::onSessionEnded() {
 
 void TaskQueue::onQuit() {
     m_stopping = true;
+    cancelSending();
+}
+
+TaskQueue::Sending TaskQueue::sending() const {
+    const std::lock_guard lock(m_mutex);
+    return m_sending;
+}
+
+void TaskQueue::setSending(Sending sending) {
+    const std::lock_guard lock(m_mutex);
+    m_sending = std::move(sending);
+}
+
+void TaskQueue::cancelSending() {
+    if (const std::shared_ptr<Transfer> transfer = sending().transfer)
+        transfer->cancel();
 }
 
 /// Who listens lives in the user-interface thread.

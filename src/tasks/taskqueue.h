@@ -7,11 +7,14 @@
 #include <QObject>
 
 #include <atomic>
+#include <functional>
+#include <memory>
 #include <mutex>
 #include <span>
 #include <vector>
 
 class QTimer;
+class Transfer;
 
 /// A queue of long operations. Windows insert records and may close at once; a worker thread takes the
 /// records in their order, one at a time, makes a task on the service for each and does its work. How a task
@@ -48,6 +51,13 @@ public:
     /// A failed record will not be started again.
     void dismiss(const QString &ctid);
 
+    /// What a record sends at the moment.
+    struct Sending {
+        QString name;                       ///< of the file, or of the operation where there are several
+        std::shared_ptr<Transfer> transfer; ///< null while no record is at work
+    };
+    Sending sending() const;
+
     /// Empty where there is no such record. Any thread.
     QString stateOf(const QString &ctid) const;
 
@@ -82,6 +92,8 @@ private:
     Outcome perform(const TaskFamily &family, TaskStep &step);
     void finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome);
     void complete(quint32 error);
+    void setSending(Sending sending);
+    void cancelSending();
     void setState(const TaskFamily &family, const JSON &record, const char *state);
     void rememberRepeat(const TaskFamily &family, const QString &ctid, const QString &tid);
     void repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds);
@@ -92,10 +104,11 @@ private:
     std::span<const TaskFamily> m_families;
     const char *m_walkError;
 
-    mutable std::mutex m_mutex; ///< for the list and the completion callback
+    mutable std::mutex m_mutex; ///< for the list, the completion callback and what is sent
     std::vector<JSON> m_tasks;
     Completion m_completion;
     quintptr m_completionContext = 0;
+    Sending m_sending;
 
     Callable m_progress;
     Callable m_state;

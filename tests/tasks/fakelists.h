@@ -45,10 +45,21 @@ public:
         const std::lock_guard lock(m_mutex);
         m_made = std::move(data);
     }
+    /// From now on requests to the path are read and never answered; an empty path ends it.
+    void hold(const std::string &path) {
+        const std::lock_guard lock(m_mutex);
+        m_held = path;
+    }
     /// The bodies that were sent to a path.
     std::vector<nlohmann::json> sentTo(const std::string &path) {
+        std::vector<nlohmann::json> bodies;
+        for (const std::string &body : rawSentTo(path))
+            bodies.push_back(nlohmann::json::parse(body, nullptr, false));
+        return bodies;
+    }
+    std::vector<std::string> rawSentTo(const std::string &path) {
         for (const ScriptedPeer::Request &request : m_peer.takeRequests())
-            m_sent[request.path].push_back(request.json());
+            m_sent[request.path].push_back(request.body);
         return m_sent[path];
     }
 
@@ -64,6 +75,8 @@ private:
 
     ScriptedPeer::Reply answer(const ScriptedPeer::Request &request) {
         const std::lock_guard lock(m_mutex);
+        if (request.path == m_held)
+            return {{}, ScriptedPeer::End::Hold};
         if (const auto code = m_codes.find(request.path); code != m_codes.end() && code->second != 0)
             return ScriptedPeer::json({{"code", code->second}});
         if (request.path == "/v1/alarm/list")
@@ -101,6 +114,7 @@ private:
     nlohmann::json m_made;
     nlohmann::json m_alarms = {{"items", nlohmann::json::array()}, {"total_items", 0}};
     std::map<std::string, int> m_codes;
-    std::map<std::string, std::vector<nlohmann::json>> m_sent;
+    std::string m_held;
+    std::map<std::string, std::vector<std::string>> m_sent;
     ScriptedPeer m_peer;
 };

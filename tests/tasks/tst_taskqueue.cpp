@@ -31,8 +31,9 @@ constexpr auto announce = [](const TaskStep &) {};
 constexpr auto doWork = [](TaskStep &step) { return work(step); };
 
 constexpr TaskFamily families[] = {
-    {"plain", "deviceRestart", "plain_", "devices", false, false, lines, plainIds, announce, doWork},
-    {"secret", "deviceChangePass", "secret_", "devices", false, true, lines, withPass, announce, doWork},
+    {"plain", "deviceRestart", "plain_", "devices", false, false, nullptr, lines, plainIds, announce, doWork},
+    {"secret", "deviceChangePass", "secret_", "devices", false, true, nullptr, lines, withPass, announce,
+     doWork},
 };
 
 class Queue : public TaskQueue {
