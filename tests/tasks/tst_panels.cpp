@@ -9,12 +9,14 @@
 #include "taskpanel.h"
 #include "taskrepeats.h"
 #include "toast.h"
+#include "uploadtaskmgr.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QLabel>
 #include <QLineEdit>
 #include <QListView>
+#include <QProgressBar>
 #include <QPushButton>
 #include <QScrollBar>
 #include <QSignalSpy>
@@ -243,6 +245,28 @@ private slots:
         QVERIFY(!strip->isVisible());
         QTRY_COMPARE_WITH_TIMEOUT(m_service->sentTo("/v1/assip/auto").size(), 1u, 10000);
         QVERIFY(m_service->sentTo("/v1/export/debif").empty());
+    }
+
+    void uploadIsShownAndCancelled() {
+        showTasks({});
+        auto *strip = m_tasks->findChild<QFrame *>("transferStrip");
+        QVERIFY(!strip->isVisible());
+        QVERIFY(m_root.write("image.bin", QByteArray(100000, 'x')));
+        m_service->hold("/v1/fwupl");
+        QVERIFY(UploadTaskMgr::instance().insertNewFWUploadTask("auto", m_root.filePath("image.bin"),
+                                                                "image.bin", {"DV1"}, "FW1", ""));
+        auto *progress = m_tasks->findChild<QLabel *>("transferProgressLabel");
+        QTRY_VERIFY_WITH_TIMEOUT(strip->isVisible() && progress->text().contains("waiting"), 10000);
+        QCOMPARE(m_tasks->findChild<QLabel *>("transferNameLabel")->text(), QString("image.bin"));
+        auto *bar = m_tasks->findChild<QProgressBar *>("transferBar");
+        QCOMPARE(bar->value(), bar->maximum());
+        QTest::mouseClick(button("cancelTransferButton"), Qt::LeftButton);
+        QVERIFY(!button("cancelTransferButton")->isEnabled());
+        QTRY_VERIFY_WITH_TIMEOUT(!strip->isVisible(), 1000);
+        QTRY_COMPARE(m_service->sentTo("/v1/task/updateState").size(), 1u);
+        QTRY_VERIFY(!UploadTaskMgr::instance().isBusy());
+        QCoreApplication::processEvents();
+        QVERIFY2(!m_tasks->findChild<QFrame *>("failedTaskStrip")->isVisible(), "it is no failure");
     }
 
     void alarmsAreReadOnceThePanelIsSeen() {
