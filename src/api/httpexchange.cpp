@@ -26,13 +26,25 @@ std::unique_ptr<httplib::SSLClient> makeClient(const HttpRequest &request) {
     return client;
 }
 
+/// Keeps what the system holds back for sending small: megabytes of it would pass for progress at once and
+/// then, on a slow line, for a standstill.
+void limitUnsent([[maybe_unused]] socket_t socket) {
+#ifdef TCP_NOTSENT_LOWAT
+    constexpr int most = 256 << 10;
+    ::setsockopt(socket, IPPROTO_TCP, TCP_NOTSENT_LOWAT, &most, sizeof most);
+#endif
+}
+
 void configure(httplib::SSLClient &client, const HttpRequest &request, RequestDeadline &deadline) {
     client.enable_server_certificate_verification(false);
     SSL_CTX_set_min_proto_version(client.ssl_context(), TLS1_2_VERSION);
     client.set_decompress(false);
     client.set_tcp_nodelay(true);
-    client.set_socket_options(
-        [&deadline](socket_t socket) { deadline.watch(static_cast<long long>(socket)); });
+    client.set_socket_options([&deadline, isTransfer = request.transfer != nullptr](socket_t socket) {
+        deadline.watch(static_cast<long long>(socket));
+        if (isTransfer)
+            limitUnsent(socket);
+    });
     // The library's own connect time-out (300 s) would outlast the request.
     const bool own = request.waitTimeout.count() > 0;
     client.set_connection_timeout(own ? request.waitTimeout : request.totalTimeout);
@@ -57,7 +69,8 @@ public:
         if (!m_answer.isFile)
             return;
         // Without either of them a connection that broke would pass for the end of the file.
-        m_isBounded = response.has_header("Content-Length") || response.has_header("Transfer-Encoding");
+        m_isBounded = response.has_header("Content-Length") ||
+                      response.get_header_value("Transfer-Encoding") == "chunked";
         m_request.transfer->begin(response.get_header_value<std::uint64_t>("Content-Length"));
     }
 
@@ -121,6 +134,9 @@ public:
     }
 
     HttpAnswer run() {
+        // Cancelled before it began, or the program is about to end.
+        if (m_deadline.isOver())
+            return failed(m_request, true, {});
         const std::unique_ptr<httplib::SSLClient> client = makeClient(m_request);
         if (!client->is_valid())
             return failed(m_request, false, "SSL context");

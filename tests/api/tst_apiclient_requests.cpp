@@ -97,6 +97,13 @@ std::vector<Method> sessionMethods() {
          "/v1/dstatus/list", page},
         {"loadServerSettings", [](CApiClient &c) { return c.loadServerSettings(out); }, "/v1/config/get",
          JSON::object()},
+        {"createHttpsSelfSignedCerts",
+         [](CApiClient &c) {
+             return c.createHttpsSelfSignedCerts({{"mode", "m"}, {"https_port", 443}, {"tid", "no"}},
+                                                 {{{"id", "DV1"}, {"tid", "T1"}}});
+         },
+         "/v1/gencert",
+         {{"mode", "m"}, {"https_port", 443}, {"devices", {{{"id", "DV1"}, {"tid", "T1"}}}}}},
         {"saveServerSettings",
          [](CApiClient &c) {
              return c.saveServerSettings({{"ui_lang", "de"}});

@@ -65,7 +65,8 @@ bool readSome(SSL *session, std::string &text) {
     return count > 0;
 }
 
-bool readRequest(SSL *session, ScriptedPeer::Request &request) {
+/// Up to the end of the head; a beginning of the body may come with it.
+bool readHead(SSL *session, ScriptedPeer::Request &request) {
     std::string text;
     std::size_t headEnd = std::string::npos;
     while ((headEnd = text.find("\r\n\r\n")) == std::string::npos) {
@@ -74,11 +75,6 @@ bool readRequest(SSL *session, ScriptedPeer::Request &request) {
     }
     request = parsedHead(text.substr(0, headEnd + 4));
     request.body = text.substr(headEnd + 4);
-    const std::string length = request.header("content-length");
-    while (!length.empty() && request.body.size() < std::stoul(length)) {
-        if (!readSome(session, request.body))
-            return false;
-    }
     return true;
 }
 
@@ -135,6 +131,12 @@ void ScriptedPeer::greet(Greeting greeting) {
     m_greeting = greeting;
 }
 
+void ScriptedPeer::watchBody(std::size_t step, BodyWatcher watcher) {
+    const std::lock_guard lock(m_mutex);
+    m_bodyStep = step;
+    m_bodyWatcher = std::move(watcher);
+}
+
 std::vector<ScriptedPeer::Request> ScriptedPeer::takeRequests() {
     const std::lock_guard lock(m_mutex);
     return std::exchange(m_requests, {});
@@ -183,7 +185,8 @@ void ScriptedPeer::converse(int socket) {
     const Session session(SSL_new(m_tls->context.get()), &SSL_free);
     SSL_set_fd(session.get(), socket);
     Request request;
-    if (SSL_accept(session.get()) != 1 || !readRequest(session.get(), request))
+    if (SSL_accept(session.get()) != 1 || !readHead(session.get(), request) ||
+        !takeBody(session.get(), request))
         return;
     Script script;
     {
@@ -209,6 +212,28 @@ void ScriptedPeer::converse(int socket) {
     } else {
         SSL_shutdown(session.get());
     }
+}
+
+/// False when the client has gone before the end.
+bool ScriptedPeer::takeBody(ssl_st *session, Request &request) {
+    std::size_t step = 0;
+    BodyWatcher watcher;
+    {
+        const std::lock_guard lock(m_mutex);
+        step = m_bodyStep;
+        watcher = m_bodyWatcher;
+    }
+    const std::string length = request.header("content-length");
+    std::size_t next = step;
+    while (!length.empty() && request.body.size() < std::stoul(length)) {
+        if (!readSome(session, request.body))
+            return false;
+        for (; watcher && request.body.size() >= next; next += step) {
+            if (!watcher(next))
+                return true;
+        }
+    }
+    return true;
 }
 
 /// False when the peer is to end.

@@ -13,6 +13,8 @@
 #include <thread>
 #include <vector>
 
+struct ssl_st;
+
 /// A TLS server on a free port of the loopback address that answers as no sane service would: raw bytes, in
 /// pieces, late, or never. One connection at a time, one request a connection.
 class ScriptedPeer {
@@ -61,6 +63,11 @@ public:
     /// How it meets every connection from the next one on.
     void greet(Greeting greeting);
 
+    /// Told how much of a body has come, whenever another step of it has; false lets the rest lie, so that
+    /// the peer answers at once. Runs in the peer's thread.
+    using BodyWatcher = std::function<bool(std::size_t received)>;
+    void watchBody(std::size_t step, BodyWatcher watcher);
+
     /// The requests since the last call.
     std::vector<Request> takeRequests();
     /// Connections since the start, also those without a request.
@@ -77,6 +84,7 @@ private:
 
     void serve();
     void converse(int socket);
+    bool takeBody(ssl_st *session, Request &request);
     bool rest(std::chrono::milliseconds time);
 
     std::unique_ptr<Tls> m_tls;
@@ -89,6 +97,8 @@ private:
     Greeting m_greeting = Greeting::Handshake;
     int m_socket = -1;
     Script m_script;
+    std::size_t m_bodyStep = 0;
+    BodyWatcher m_bodyWatcher;
     std::vector<Request> m_requests;
     std::thread m_thread;
 };
