@@ -66,6 +66,20 @@ void hold(Model &model, Device &device, bool reachable) {
     changeConnection(model, device, reachable);
 }
 
+void letIn(Model &model, Device &device) {
+    hold(model, device, true);
+    model.authorization.admit(device);
+}
+
+std::size_t admitAll(Model &model) {
+    Transaction transaction(model.store.database());
+    for (std::size_t i = 0; i < model.devices.size(); ++i) {
+        letIn(model, model.devices.at(i));
+    }
+    transaction.commit();
+    return model.devices.size();
+}
+
 std::string counted(std::size_t devices) {
     return "ok " + std::to_string(devices) + (devices == 1 ? " device" : " devices");
 }
@@ -175,6 +189,9 @@ std::string Control::runOnDevices(const Words &words) {
     if (command == "restore" && words.size() == 2) {
         return restore(words[1]);
     }
+    if (command == "admit" && words.size() == 2) {
+        return admit(words[1]);
+    }
     if (command == "remove" && words.size() == 2) {
         return remove(words[1]);
     }
@@ -232,6 +249,16 @@ std::string Control::restore(const std::string &what) {
             return restoreAll(model);
         }
         hold(model, model.devices.get(what), true);
+        return std::size_t{1};
+    }));
+}
+
+std::string Control::admit(const std::string &what) {
+    return counted(m_service.withModel([&](Model &model) {
+        if (what == "all") {
+            return admitAll(model);
+        }
+        letIn(model, model.devices.get(what));
         return std::size_t{1};
     }));
 }
@@ -312,7 +339,9 @@ std::string Control::task(const Words &words) {
             const auto time =
                 *delay == 0 ? std::string() : std::to_string(now + static_cast<std::int64_t>(*delay));
             devices.push_back({{"id", id}, {"actm", time}});
-            work.push_back({id, Json::object(), false, {}});
+            DeviceWork &item = work.emplace_back();
+            item.id = id;
+            item.access = Access::Anybody;
         }
         const std::string user = model.accounts.all().front().email;
         const std::string id = model.engine.create(words[1], user, devices, now).id;

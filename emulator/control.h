@@ -29,6 +29,7 @@ private:
     std::string fault(const std::string &text);
     std::string drop(const std::string &what);
     std::string restore(const std::string &what);
+    std::string admit(const std::string &what);
     std::string remove(const std::string &id);
     std::string add(const std::string &count);
     std::string tick(const std::string &count);

@@ -15,6 +15,7 @@ namespace emulator {
 namespace {
 
 constexpr int hashRounds = 60000;
+constexpr int deviceRounds = 1000;
 constexpr std::size_t hashBytes = 32;
 
 struct FreeCipherText {
@@ -60,6 +61,11 @@ std::string stretched(std::string_view password, std::string_view salt, int roun
     return hash;
 }
 
+PasswordHash hashed(std::string_view password, int rounds) {
+    const std::string salt = randomBytes(16);
+    return {toHex(salt), toHex(stretched(password, salt, rounds)), rounds};
+}
+
 int hexDigit(char c) {
     if (c >= '0' && c <= '9') {
         return c - '0';
@@ -90,8 +96,7 @@ bool ciphersWork() {
 }
 
 PasswordHash hashPassword(std::string_view password) {
-    const std::string salt = randomBytes(16);
-    return {toHex(salt), toHex(stretched(password, salt, hashRounds)), hashRounds};
+    return hashed(password, hashRounds);
 }
 
 bool passwordMatches(std::string_view password, const PasswordHash &known) {
@@ -102,6 +107,21 @@ bool passwordMatches(std::string_view password, const PasswordHash &known) {
     }
     const std::string offered = stretched(password, *salt, known.rounds);
     return CRYPTO_memcmp(offered.data(), hash->data(), hashBytes) == 0;
+}
+
+bool isDeviceAccount(std::string_view name) {
+    return name == ownerAccount || name == "admin";
+}
+
+std::string deviceSecret(std::string_view password) {
+    const PasswordHash hash = hashed(password, deviceRounds);
+    return hash.salt + ':' + hash.hash;
+}
+
+bool opensDevice(std::string_view password, const std::string &secret) {
+    const auto colon = secret.find(':');
+    return colon != std::string::npos &&
+           passwordMatches(password, {secret.substr(0, colon), secret.substr(colon + 1), deviceRounds});
 }
 
 std::string newSessionToken() {

@@ -25,6 +25,15 @@ struct PasswordHash {
 PasswordHash hashPassword(std::string_view password);
 bool passwordMatches(std::string_view password, const PasswordHash &known);
 
+/// The accounts of a device: the one that may do everything, under which the service works, and another.
+inline constexpr std::string_view ownerAccount = "root";
+bool isDeviceAccount(std::string_view name);
+
+/// What is kept of a device's password, and whether a password is the one of which it was kept. A fleet may
+/// have tens of thousands of them, so they are hashed with less effort.
+std::string deviceSecret(std::string_view password);
+bool opensDevice(std::string_view password, const std::string &secret);
+
 /// 32 random bytes as base64url text.
 std::string newSessionToken();
 

@@ -147,7 +147,8 @@ Json firstRecord(const Appearance &appearance) {
 Device withMembers(const Device &device, const Json &members) {
     Device changed = device;
     Json record = Json::parse(device.body);
-    record.update(members);
+    // A member that is to go comes as null, as in a merge patch.
+    record.merge_patch(members);
     setRecord(changed, std::move(record));
     return changed;
 }

@@ -32,7 +32,7 @@ std::string classOf(const std::string &model);
 /// The record that a service has of a device that has not let it in.
 Json firstRecord(const Appearance &appearance);
 
-/// A device with some members of its record changed.
+/// A device with some members of its record changed; null takes one out.
 Device withMembers(const Device &device, const Json &members);
 
 /// Takes a record apart into the form in which it is kept: the id, the MAC and the address beside the text.

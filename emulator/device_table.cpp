@@ -87,6 +87,11 @@ void DeviceTable::saveState(const Device &device) {
     m_store.saveDeviceState(device);
 }
 
+void DeviceTable::setSecret(Device &device, const std::string &secret) {
+    device.secret = secret;
+    m_store.saveDeviceSecret(device);
+}
+
 void DeviceTable::remove(const std::unordered_set<std::string> &ids) {
     if (ids.empty()) {
         return;

@@ -35,6 +35,7 @@ public:
     /// Keeps the changed record of a device, whose MAC may be another one now.
     void update(Device &device, Device changed);
     void saveState(const Device &device);
+    void setSecret(Device &device, const std::string &secret);
     void remove(const std::unordered_set<std::string> &ids);
     /// Takes sites that went out of every device.
     void leaveSites(const std::unordered_set<std::string> &sites);

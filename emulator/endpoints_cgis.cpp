@@ -1,10 +1,9 @@
+#include "address_book.h"
 #include "clock.h"
-#include "device_targets.h"
+#include "device_commands.h"
 #include "endpoint.h"
 #include "service.h"
-
-#include <algorithm>
-#include <map>
+#include "work_orders.h"
 
 namespace emulator {
 
@@ -79,59 +78,40 @@ std::vector<std::string> commandsOf(const Json &body) {
     return commands;
 }
 
-/// The action of a device that gets the commands; empty where they leave it running.
-std::string actionOf(const std::vector<std::string> &commands) {
-    const auto any = [&](const char *parameter) {
-        return std::any_of(commands.begin(), commands.end(), [&](const std::string &command) {
-            return command.find(parameter) != std::string::npos;
-        });
+Json answerAtOnce(Model &model, Device &device, const CommandSeries &series, AddressBook &addresses) {
+    const DeviceWork work = series.workFor(device, addresses);
+    const auto answer = [&](int status, const std::string &body) {
+        return Json{{"id", device.id}, {"status", status}, {"body", body}};
     };
-    if (any("system_restore=1") || any("system_restoreexcept")) {
-        return "deviceRestore";
+    switch (doAtOnce(model, device, work)) {
+    case Outcome::NoConnection:
+        return answer(503, "no connection");
+    case Outcome::NotAuthorized:
+        return answer(401, "not authorized");
+    case Outcome::Failed:
+        return answer(400, work.failure);
+    case Outcome::Done:
+        break;
     }
-    return any("system_reset=0") ? "deviceRestart" : "";
-}
-
-Json answerAtOnce(Model &model, Device &device, const std::string &action) {
-    if (!device.reachable) {
-        return {{"id", device.id}, {"status", 503}, {"body", "no connection"}};
+    if (!series.action().empty()) {
+        model.engine.restart(device, series.action(), nowMs());
     }
-    if (device.authorization != Authorization::Authorized) {
-        return {{"id", device.id}, {"status", 401}, {"body", "not authorized"}};
-    }
-    if (!action.empty()) {
-        model.engine.restart(device, action, nowMs());
-    }
-    return {{"id", device.id}, {"status", 200}, {"body", "ok"}};
-}
-
-/// All of it is judged before any of it starts.
-void startUnderTasks(Model &model, const std::vector<Target> &targets, bool restarts) {
-    std::map<std::string, std::vector<DeviceWork>> works;
-    for (const Target &target : targets) {
-        if (!target.taskId.empty()) {
-            works[target.taskId].push_back({target.id, Json::object(), restarts, {}});
-        }
-    }
-    for (const auto &[taskId, work] : works) {
-        model.engine.judgeWork(taskId, work);
-    }
-    for (const auto &[taskId, work] : works) {
-        model.engine.startWork(taskId, work, nowMs());
-    }
+    return answer(200, "ok");
 }
 
 Json runCommands(Service &service, const Call &call) {
-    const std::string action = actionOf(commandsOf(call.body));
+    const CommandSeries series(commandsOf(call.body));
     const auto targets = targetsOf(call.body);
     return service.withModel([&](Model &model) {
         model.engine.settle(nowMs());
-        checkKnown(model, targets);
-        startUnderTasks(model, targets, !action.empty());
+        checkKnownWithoutTask(model, targets);
+        AddressBook addresses(model);
+        startUnderTasks(model, targets, {},
+                        [&](const Device &device) { return series.workFor(device, addresses); });
         Json answers = Json::array();
         for (const Target &target : targets) {
             answers.push_back(target.taskId.empty()
-                                  ? answerAtOnce(model, model.devices.get(target.id), action)
+                                  ? answerAtOnce(model, model.devices.get(target.id), series, addresses)
                                   : Json{{"id", target.id}, {"status", 0}, {"body", ""}});
         }
         return answers;

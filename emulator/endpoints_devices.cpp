@@ -1,10 +1,9 @@
 #include "clock.h"
 #include "credentials.h"
 #include "device_commit.h"
-#include "device_maker.h"
-#include "device_targets.h"
 #include "endpoint.h"
 #include "service.h"
+#include "work_orders.h"
 
 #include <charconv>
 
@@ -83,40 +82,15 @@ Answer scanResults(Service &service, const Call &) {
     return Answer::secret(service.withModel([](Model &model) { return model.scans.foundText(nowMs()); }));
 }
 
-void setPolicyAtOnce(Model &model, const std::vector<Target> &targets, const Json &changes) {
-    Transaction transaction(model.store.database());
-    for (const Target &target : targets) {
-        Device &device = model.devices.get(target.id);
-        model.devices.update(device, withMembers(device, changes));
-    }
-    transaction.commit();
-}
-
-void setPolicyUnder(const Task &task, Model &model, const std::vector<Target> &targets, const Json &changes) {
-    if (task.type != "devicePassPolicy") {
-        throw Refusal(Code::Malformed, "the task is for something else");
-    }
-    std::vector<DeviceWork> work;
-    for (const Target &target : targets) {
-        work.push_back({target.id, changes, false, {}});
-    }
-    model.engine.startWork(task.id, work, nowMs());
-}
-
 Answer setPolicy(Service &service, const Call &call) {
-    const auto targets = targetsOf(call.body);
-    const Json changes = {
-        {"d_policy", {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}}}};
-    const std::string taskId = textMember(call.body, "tid");
-    service.withModel([&](Model &model) {
-        model.engine.settle(nowMs());
-        checkKnown(model, targets);
-        if (const Task *task = model.tasks.find(taskId)) {
-            setPolicyUnder(*task, model, targets, changes);
-        } else {
-            setPolicyAtOnce(model, targets, changes);
-        }
-    });
+    auto targets = targetsOf(call.body);
+    DeviceWork work;
+    work.changes["d_policy"] = {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}};
+    const std::string taskId = optionalText(call.body, "tid");
+    for (Target &target : targets) {
+        target.taskId = target.taskId.empty() ? taskId : target.taskId;
+    }
+    order(service, targets, "devicePassPolicy", [&](const Device &) { return work; });
     return {};
 }
 

@@ -3,6 +3,7 @@
 #include "clock.h"
 #include "model.h"
 #include "random.h"
+#include "task_codes.h"
 
 #include <algorithm>
 #include <array>

@@ -20,13 +20,13 @@ Model::Model(const std::filesystem::path &storePath, const ModelLimits &limits)
       settings(store),
       sites(store),
       devices(store),
-      authorization(devices, store),
+      authorization(devices, store, limits.blockMs),
       scans(devices),
       batches(limits.batchTimeoutMs),
       log(store),
       alarms(store, log),
       tasks(store),
-      engine(store, tasks, devices, log) {}
+      engine(store, tasks, devices, settings, log) {}
 
 bool Model::hasFleet() {
     return !store.value(seedKey).empty();

@@ -20,6 +20,7 @@ namespace emulator {
 struct ModelLimits {
     SessionLimits sessions;
     std::int64_t batchTimeoutMs = 60000;
+    std::int64_t blockMs = 60000;
 };
 
 /// Everything that the service knows. Not thread-safe: the service hands it out under its lock.

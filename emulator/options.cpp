@@ -44,6 +44,7 @@ Behaviour
   --latency MS          added to each answer
   --batch-timeout MS    life of a commit that was started and not ended (60000)
   --token-grace MS      how long a token stays good after its renewal (60000)
+  --block-time MS       how long a device blocks its account after five wrong passwords (60000)
   --fault FAULT         answer badly; repeatable
   --help, --version
 
@@ -65,6 +66,7 @@ when left out), not the first N of them (after), N times at most (times), each w
 Commands on standard input, one a line, each answered by one line "ok ..." or "error ..." on standard error:
   fault FAULT           faults clear          expire-sessions       counts           stop
   drop ID|N             restore ID|all        remove ID             add N            life on|off
+  admit ID|all          bring devices back and let the service in
   status ID AUTH CONNECT ACTION    texts with blanks in double quotes, "-" keeps what is there
   tick N                live N ticks at once
   task TYPE COUNT [DELAY_MS]       another client's task on COUNT devices, run at once or scheduled
@@ -73,9 +75,13 @@ Commands on standard input, one a line, each answered by one line "ok ..." or "e
   alarm DESPID [COUNT]  raise alarms; nothing happens to the devices
 
 Devices that nobody manages yet answer to scans at 10.99.0.10 to 10.99.0.49. A device lets the account "root" in
-with any password of 8 characters or more and denies other accounts; a shorter password is wrong, and three
-wrong ones block the account for a minute. Tasks run on 20 devices at a time. A device that is ordered to
-restart or restore is away for three steps, which raises no alarm.
+with any password of 8 characters or more until one is set, then with that one alone; it denies other accounts,
+and five wrong passwords block the account for a minute. A device in "Set Password" wants a first password before
+anything else. Each device has the accounts "root" and "admin"; a new password of "root" shuts the service out.
+
+Tasks run on 20 devices at a time; devices that have not let the service in fail. A device that is ordered to
+restart or restore is away for three steps, which raises no alarm. The network is 255.255.0.0; its DHCP server
+gives addresses from x.y.192.1 on.
 )";
 
 template <typename Number>
@@ -135,6 +141,7 @@ Setters valueSetters(Options &options) {
         {"--session-limit", numberInto<std::size_t>("--session-limit", options.sessionLimit, 1000000)},
         {"--batch-timeout", numberInto("--batch-timeout", options.batchTimeoutMs, longestHold)},
         {"--token-grace", numberInto("--token-grace", options.tokenGraceMs, longestHold)},
+        {"--block-time", numberInto("--block-time", options.blockMs, longestHold)},
         {"--task-pace", numberInto("--task-pace", options.taskPaceMs, longestHold)},
         {"--task-work-timeout", numberInto("--task-work-timeout", options.taskWorkTimeoutMs, longestHold)},
         {"--task-failures", numberInto("--task-failures", options.taskFailures, 1.0)},

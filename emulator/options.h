@@ -28,6 +28,7 @@ struct Options {
     std::size_t sessionLimit = 0;
     std::int64_t batchTimeoutMs = 60000;
     std::int64_t tokenGraceMs = 60000;
+    std::int64_t blockMs = 60000;
     std::int64_t taskPaceMs = 1000;
     std::int64_t taskWorkTimeoutMs = 120000;
     double taskFailures = 0;

@@ -58,6 +58,7 @@ struct Device {
     bool held = false; ///< kept unreachable by command; life does not bring it back
     std::string action = standby;
     int refusedPasswords = 0;
+    std::string secret; ///< what is kept of the account's password; empty while any long one will do
 };
 
 } // namespace emulator

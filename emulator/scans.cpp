@@ -3,8 +3,7 @@
 #include "answer.h"
 #include "device_maker.h"
 #include "device_table.h"
-
-#include <arpa/inet.h>
+#include "ipv4.h"
 
 #include <algorithm>
 #include <charconv>
@@ -23,14 +22,6 @@ constexpr std::size_t mostNeighbours = 2000;
 constexpr std::size_t managedInSearch = 5;
 constexpr std::int64_t firstAnswerMs = 400;
 constexpr std::int64_t lastAnswerMs = 2000;
-
-std::optional<std::uint32_t> addressNumber(const std::string &text) {
-    in_addr address{};
-    if (inet_pton(AF_INET, text.c_str(), &address) != 1) {
-        return std::nullopt;
-    }
-    return ntohl(address.s_addr);
-}
 
 std::uint32_t checkedAddress(const std::string &text) {
     const auto number = addressNumber(text);

@@ -13,7 +13,7 @@ namespace emulator {
 namespace {
 
 ModelLimits limitsOf(const Options &options) {
-    return {{options.sessionLimit, options.tokenGraceMs}, options.batchTimeoutMs};
+    return {{options.sessionLimit, options.tokenGraceMs}, options.batchTimeoutMs, options.blockMs};
 }
 
 using Clock = std::chrono::steady_clock;

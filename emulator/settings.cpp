@@ -3,6 +3,8 @@
 #include "answer.h"
 #include "store.h"
 
+#include <algorithm>
+
 namespace emulator {
 
 namespace {
@@ -30,6 +32,12 @@ Settings::Settings(Store &store) : m_store(store), m_values(factorySettings()) {
     if (!kept.empty()) {
         m_values.update(Json::parse(kept));
     }
+}
+
+std::size_t Settings::firmwareLimit() const {
+    const bool limited = m_values.at("svr_fw_upload_limit_enabled").get<bool>();
+    // A limit of none at all would hold every task for ever.
+    return limited ? std::max<std::size_t>(m_values.at("svr_fw_upload_limit").get<std::size_t>(), 1) : 0;
 }
 
 void Settings::change(const Json &members) {

@@ -21,6 +21,7 @@ CREATE TABLE IF NOT EXISTS site(row INTEGER PRIMARY KEY, id TEXT UNIQUE NOT NULL
 CREATE TABLE IF NOT EXISTS device(row INTEGER PRIMARY KEY, id TEXT UNIQUE NOT NULL, body TEXT NOT NULL,
     sites TEXT NOT NULL, sites_as_text INTEGER NOT NULL, mac_key TEXT NOT NULL, ip TEXT NOT NULL,
     authorized INTEGER NOT NULL, reachable INTEGER NOT NULL, held INTEGER NOT NULL, refused INTEGER NOT NULL);
+CREATE TABLE IF NOT EXISTS device_secret(device TEXT PRIMARY KEY, secret TEXT NOT NULL);
 CREATE TABLE IF NOT EXISTS task(row INTEGER PRIMARY KEY AUTOINCREMENT, head TEXT NOT NULL,
     devices TEXT NOT NULL, work TEXT NOT NULL);
 CREATE TABLE IF NOT EXISTS alarm(row INTEGER PRIMARY KEY AUTOINCREMENT, at INTEGER NOT NULL, body TEXT NOT NULL);
@@ -64,6 +65,8 @@ Store::Store(const std::filesystem::path &path)
           "held=excluded.held,refused=excluded.refused"),
       m_saveDeviceSites(m_database, "UPDATE device SET sites=?,sites_as_text=? WHERE id=?"),
       m_saveDeviceState(m_database, "UPDATE device SET authorized=?,reachable=?,held=?,refused=? WHERE id=?"),
+      m_saveDeviceSecret(m_database, "INSERT OR REPLACE INTO device_secret VALUES(?,?)"),
+      m_removeDeviceSecret(m_database, "DELETE FROM device_secret WHERE device=?"),
       m_removeDevice(m_database, "DELETE FROM device WHERE id=?") {}
 
 std::string Store::value(const std::string &key) {
@@ -158,8 +161,8 @@ void Store::replaceSites(const std::vector<Site> &sites) {
 
 void Store::loadDevices(const std::function<void(Device)> &take) {
     Statement rows(m_database,
-                   "SELECT id,mac_key,ip,body,sites,sites_as_text,authorized,reachable,held,refused "
-                   "FROM device ORDER BY row");
+                   "SELECT id,mac_key,ip,body,sites,sites_as_text,authorized,reachable,held,refused,"
+                   "coalesce(secret,'') FROM device LEFT JOIN device_secret ON device=id ORDER BY row");
     while (rows.step()) {
         Device device;
         device.id = rows.text(0);
@@ -172,6 +175,7 @@ void Store::loadDevices(const std::function<void(Device)> &take) {
         device.reachable = rows.integer(7) != 0;
         device.held = rows.integer(8) != 0;
         device.refusedPasswords = static_cast<int>(rows.integer(9));
+        device.secret = rows.text(10);
         take(std::move(device));
     }
 }
@@ -205,7 +209,15 @@ void Store::saveDeviceState(const Device &device) {
         .run();
 }
 
+void Store::saveDeviceSecret(const Device &device) {
+    m_removeDeviceSecret.bind(device.id).run();
+    if (!device.secret.empty()) {
+        m_saveDeviceSecret.bind(device.id).bind(device.secret).run();
+    }
+}
+
 void Store::removeDevice(const std::string &id) {
+    m_removeDeviceSecret.bind(id).run();
     m_removeDevice.bind(id).run();
 }
 

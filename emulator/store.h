@@ -39,6 +39,7 @@ public:
     void saveDevice(const Device &device);
     void saveDeviceSites(const Device &device);
     void saveDeviceState(const Device &device);
+    void saveDeviceSecret(const Device &device);
     void removeDevice(const std::string &id);
 
 private:
@@ -56,6 +57,8 @@ private:
     Statement m_saveDevice;
     Statement m_saveDeviceSites;
     Statement m_saveDeviceState;
+    Statement m_saveDeviceSecret;
+    Statement m_removeDeviceSecret;
     Statement m_removeDevice;
 };
 

@@ -1,18 +1,17 @@
 #include "task_engine.h"
 
 #include "answer.h"
-#include "device_maker.h"
 #include "device_table.h"
 #include "log_table.h"
 #include "random.h"
+#include "settings.h"
 #include "store.h"
+#include "task_codes.h"
+#include "task_progress.h"
+#include "task_request.h"
 
 #include <algorithm>
-#include <array>
-#include <charconv>
-#include <iterator>
 #include <optional>
-#include <sstream>
 #include <utility>
 
 namespace emulator {
@@ -25,130 +24,31 @@ constexpr std::size_t mostAtOnce = 20;
 constexpr int leastSteps = 6;
 constexpr int outageStep = 2;
 constexpr int outageSteps = 3;
-constexpr auto firmware = "deviceFWUpgrade";
-
-std::vector<std::string> wordsOf(const char *text) {
-    std::istringstream stream(text);
-    return {std::istream_iterator<std::string>(stream), {}};
-}
 
 [[noreturn]] void refuse(const std::string &why) {
     throw Refusal(Code::Malformed, why);
-}
-
-/// The time that the parameters ask for; 0 for none.
-std::int64_t wantedTime(const Json &parameters) {
-    const std::string text = optionalText(parameters, "actm");
-    std::int64_t time = 0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), time);
-    if (!text.empty() && (error != std::errc() || end != text.data() + text.size() || time < 0)) {
-        refuse("\"actm\" is no time");
-    }
-    return time;
 }
 
 bool isRestart(const std::string &type) {
     return type == "deviceRestart" || type == "deviceRestore";
 }
 
-const char *runningState(const Task &task, const TaskDevice &device) {
-    static constexpr std::array phases = {state::uploading, state::updating, state::reconnecting};
-    if (task.type != firmware || device.step == 0) {
-        return state::processing;
-    }
-    return phases[static_cast<std::size_t>(device.step) * phases.size() /
-                  static_cast<std::size_t>(device.steps)];
-}
-
-std::optional<std::size_t> nextQueued(const Task &task) {
-    for (std::size_t i = 0; i < task.devices.size(); ++i) {
-        if (task.devices[i].phase == Phase::Queued) {
-            return i;
-        }
-    }
-    return std::nullopt;
-}
-
-bool any(const Task &task, Phase phase) {
-    return std::any_of(task.devices.begin(), task.devices.end(),
-                       [&](const TaskDevice &device) { return device.phase == phase; });
-}
-
-int meanProgress(const Task &task) {
-    std::size_t sum = 0;
-    for (const TaskDevice &device : task.devices) {
-        sum += static_cast<std::size_t>(device.progress);
-    }
-    return static_cast<int>(sum / std::max<std::size_t>(task.devices.size(), 1));
-}
-
-std::string shownState(const Task &task) {
-    const std::string first = task.devices[*std::min_element(task.running.begin(), task.running.end())].state;
-    // A device that takes the place of another does not begin the task a second time.
-    const bool again = task.type == firmware && first == state::processing && any(task, Phase::Ended);
-    return again ? state::uploading : first;
-}
-
 } // namespace
 
-const std::vector<std::string> &taskTypes() {
-    static const auto types =
-        wordsOf("deviceConfigFileUpload deviceFWUpgrade deviceGenSelfSignedCert deviceHttpsCertInstall "
-                "deviceHttpsCertsAndPKeys deviceIEEE_EAP_PEAP deviceIEEE_EAP_TLS devicePackageUpload "
-                "deviceAssignIPAuto deviceAssignIPManual deviceExportDeviceInfo deviceQuickSetup "
-                "deviceRestart deviceRestore deviceChangePass devicePassPolicy deviceCreateTemplate "
-                "deviceSetTemplate deviceCustomCommand");
-    return types;
-}
-
-std::string failureCode(Random &random) {
-    // Those that end in an underscore go on with the number of a slot.
-    static const auto codes = wordsOf(
-        "pTaskMismatchingStatus pTaskUnsupportedMethod pTaskMismatchingPrivateKeyAndCertificate "
-        "pTaskInvalidFileOrPublicKey pTaskCertificateNotInstalled pTaskNotInstalled "
-        "pTaskDeviceResponseTimeout pTaskDeviceResponseTimeoutEx pTaskFailedToConnectToDevice "
-        "pTaskFailedToConnectToDeviceEx pTaskFailedToSetPassword pTaskInvalidFileForThisModelGroup "
-        "pTaskIncompatibleFirmware pTaskNoSdCardDetected pTaskSdCardError_ pTaskMaxPackageUploadLimit_ "
-        "pTaskInsufficientStorage_ pTaskBrokenFile_ pInternalProcessError_");
-    const std::string &code = codes[random.below(codes.size())];
-    const std::uint64_t slot = 1 + random.below(16);
-    return code.ends_with('_') ? code + (slot < 10 ? "0" : "") + std::to_string(slot) : code;
-}
-
-TaskEngine::TaskEngine(Store &store, TaskTable &tasks, DeviceTable &devices, LogTable &log)
-    : m_store(store), m_tasks(tasks), m_devices(devices), m_log(log), m_open(tasks.open()) {}
+TaskEngine::TaskEngine(Store &store, TaskTable &tasks, DeviceTable &devices, const Settings &settings,
+                       LogTable &log)
+    : m_store(store),
+      m_tasks(tasks),
+      m_devices(devices),
+      m_settings(settings),
+      m_log(log),
+      m_outages(devices),
+      m_open(tasks.open()) {}
 
 Task &TaskEngine::create(const std::string &type, const std::string &user, const Json &devices,
                          std::int64_t nowMs) {
-    if (std::find(taskTypes().begin(), taskTypes().end(), type) == taskTypes().end()) {
-        refuse("no task is a \"" + type + '"');
-    }
-    Task task;
-    std::unordered_set<std::string> seen;
-    for (const Json &element : devices) {
-        TaskDevice device;
-        if (!element.is_string() && !element.is_object()) {
-            refuse("an element of \"devices\" names no device");
-        }
-        device.id = element.is_string() ? element.get<std::string>() : textMember(element, "id");
-        device.identity = identityText(m_devices.get(device.id));
-        device.parameters = element.is_object() ? element : Json::object();
-        task.scheduledAt = std::max(task.scheduledAt, wantedTime(device.parameters));
-        if (seen.insert(device.id).second) {
-            task.devices.push_back(std::move(device));
-        }
-    }
-    if (task.devices.empty()) {
-        refuse("a task needs devices");
-    }
-    task.type = type;
+    Task task = requestedTask(type, devices, m_devices, nowMs);
     task.user = user;
-    task.createdAt = task.updatedAt = nowMs;
-    task.scheduledAt = task.scheduledAt > nowMs ? task.scheduledAt : 0;
-    task.status = task.state = task.scheduledAt != 0 ? state::scheduled : state::init;
-    for (TaskDevice &device : task.devices) {
-        device.state = task.state;
-    }
     Transaction transaction(m_store.database());
     m_log.add(nowMs, "System", "Audit",
               "Task " + type + " created, devices: " + std::to_string(task.devices.size()), user);
@@ -161,16 +61,19 @@ Task &TaskEngine::create(const std::string &type, const std::string &user, const
 void TaskEngine::judgeWork(const std::string &taskId, const std::vector<DeviceWork> &work) const {
     const Task &task = m_tasks.get(taskId);
     std::unordered_set<std::string> waiting;
+    std::unordered_set<std::string> gone;
     for (const TaskDevice &device : task.devices) {
         if (device.phase == Phase::WithoutWork) {
             waiting.insert(device.id);
+        } else if (device.phase == Phase::Ended && !m_devices.find(device.id)) {
+            gone.insert(device.id);
         }
     }
     if (work.empty()) {
         refuse("the work names no device");
     }
     for (const DeviceWork &item : work) {
-        if (waiting.erase(item.id) == 0) {
+        if (waiting.erase(item.id) == 0 && !gone.contains(item.id)) {
             refuse("device " + item.id + " waits for no work under this task");
         }
     }
@@ -186,14 +89,13 @@ void TaskEngine::startWork(const std::string &taskId, const std::vector<DeviceWo
     }
     for (TaskDevice &device : task.devices) {
         const auto found = items.find(device.id);
-        if (found == items.end()) {
+        if (found == items.end() || device.phase != Phase::WithoutWork) {
             continue;
         }
         device.phase = Phase::Queued;
         device.state = task.status == state::scheduled ? state::scheduled : state::queued;
-        device.changes = found->second->changes;
-        device.failure = found->second->failure;
-        device.restarts = found->second->restarts || isRestart(task.type);
+        device.work = *found->second;
+        device.work.restarts = device.work.restarts || isRestart(task.type);
     }
     // Devices are seen to queue before the first of them are taken.
     task.startsAt = nowMs + m_rules.paceMs;
@@ -233,7 +135,7 @@ void TaskEngine::settle(std::int64_t nowMs) {
         }
         transaction.commit();
     }
-    endOutages(nowMs);
+    m_outages.endDue(nowMs);
 }
 
 void TaskEngine::settleTask(Task &task, std::int64_t nowMs) {
@@ -254,7 +156,9 @@ void TaskEngine::wake(Task &task, std::int64_t nowMs) {
     task.status = state::init;
     task.startsAt = nowMs;
     for (TaskDevice &device : task.devices) {
-        device.state = device.phase == Phase::Queued ? state::queued : state::init;
+        device.state = device.phase == Phase::Ended    ? device.state
+                       : device.phase == Phase::Queued ? state::queued
+                                                       : state::init;
     }
 }
 
@@ -277,7 +181,7 @@ bool TaskEngine::dropOverdue(Task &task, std::int64_t nowMs) const {
 bool TaskEngine::run(Task &task, std::int64_t nowMs) {
     // After a restart of the program the time begins with the first look.
     task.startsAt = task.startsAt == 0 ? nowMs : task.startsAt;
-    bool changed = fillPlaces(task);
+    bool changed = fillPlaces(task, nowMs);
     for (std::size_t place = 0; place < task.running.size();) {
         TaskDevice &device = task.devices[task.running[place]];
         if (device.dueAt > nowMs) {
@@ -286,7 +190,8 @@ bool TaskEngine::run(Task &task, std::int64_t nowMs) {
         }
         changed = true;
         advance(task, device);
-        const auto next = device.phase == Phase::Ended ? nextQueued(task) : std::nullopt;
+        const bool hasPlace = device.phase == Phase::Ended && task.running.size() <= placesOf(task);
+        const auto next = hasPlace ? nextQueued(task) : std::nullopt;
         if (device.phase != Phase::Ended) {
             device.dueAt += m_rules.paceMs;
         } else if (next) {
@@ -299,15 +204,28 @@ bool TaskEngine::run(Task &task, std::int64_t nowMs) {
     return changed;
 }
 
-bool TaskEngine::fillPlaces(Task &task) {
+/// How many devices of a task may run at a time; the settings bound those that get firmware, of all tasks.
+std::size_t TaskEngine::placesOf(const Task &task) const {
+    const std::size_t limit = isFirmware(task) ? m_settings.firmwareLimit() : 0;
+    if (limit == 0) {
+        return mostAtOnce;
+    }
+    std::size_t elsewhere = 0;
+    for (const Task *open : m_open) {
+        elsewhere += open != &task && isFirmware(*open) ? open->running.size() : 0;
+    }
+    return std::min(mostAtOnce, limit - std::min(limit, elsewhere));
+}
+
+bool TaskEngine::fillPlaces(Task &task, std::int64_t nowMs) {
     bool filled = false;
-    while (task.running.size() < mostAtOnce) {
+    while (task.running.size() < placesOf(task)) {
         const auto next = nextQueued(task);
         if (!next) {
             break;
         }
         task.running.push_back(*next);
-        begin(task, *next, task.startsAt);
+        begin(task, *next, nowMs);
         filled = true;
     }
     return filled;
@@ -321,8 +239,8 @@ void TaskEngine::begin(Task &task, std::size_t index, std::int64_t nowMs) {
     device.step = 0;
     device.steps = leastSteps + static_cast<int>(random.below(3));
     device.failsAt = 1 + static_cast<int>(random.below(static_cast<std::uint64_t>(device.steps)));
-    if (random.chance(m_rules.failures) && device.failure.empty()) {
-        device.failure = failureCode(random);
+    if (random.chance(m_rules.failures) && device.work.failure.empty()) {
+        device.work.failure = failureCode(random);
     }
     device.dueAt = nowMs + m_rules.paceMs;
     if (Device *target = m_devices.find(device.id)) {
@@ -333,34 +251,28 @@ void TaskEngine::begin(Task &task, std::size_t index, std::int64_t nowMs) {
 void TaskEngine::advance(const Task &task, TaskDevice &device) {
     Device &target = m_devices.get(device.id);
     ++device.step;
-    if (const auto outage = m_outages.find(device.id);
-        outage != m_outages.end() && outage->second.endsAt <= device.dueAt) {
-        endOutage(device.id, outage->second);
-        m_outages.erase(outage);
+    m_outages.endOf(device.id, device.dueAt);
+    if (!target.reachable && !m_outages.has(device.id)) {
+        return end(task, device, device.step > 1 ? state::lostConnection : state::noConnection);
     }
-    if (!target.reachable && !m_outages.contains(device.id)) {
-        const bool lately = device.step > 1;
-        return end(task, device, lately ? "pTaskFailedToConnectToDeviceEx" : "pTaskFailedToConnectToDevice");
+    if (device.step == 1 && !obeys(target, device.work.access)) {
+        return end(task, device, state::mismatch);
     }
-    if (!device.failure.empty() && device.step >= device.failsAt) {
-        return end(task, device, device.failure);
+    if (!device.work.failure.empty() && device.step >= device.failsAt) {
+        return end(task, device, device.work.failure);
     }
     if (device.step == device.steps) {
         return succeed(task, device);
     }
-    if (device.restarts && device.step == outageStep) {
-        target.reachable = false;
-        m_outages[device.id] = {device.dueAt + outageSteps * m_rules.paceMs, {}};
+    if (device.work.restarts && device.step == outageStep) {
+        m_outages.begin(target, {}, device.dueAt + outageSteps * m_rules.paceMs);
     }
     device.state = runningState(task, device);
     device.progress = device.step * 100 / device.steps;
 }
 
 void TaskEngine::succeed(const Task &task, TaskDevice &device) {
-    if (!device.changes.empty()) {
-        Device &target = m_devices.get(device.id);
-        m_devices.update(target, withMembers(target, device.changes));
-    }
+    carryOut(m_devices, m_devices.get(device.id), device.work);
     device.progress = 100;
     end(task, device, state::done);
 }
@@ -409,43 +321,28 @@ void TaskEngine::finish(Task &task, const std::string &finalState, std::int64_t 
 
 void TaskEngine::restart(Device &device, const std::string &action, std::int64_t nowMs) {
     if (device.reachable) {
-        // It is not written down: a device comes back from a restart, whatever becomes of this program.
-        device.reachable = false;
         device.action = action;
-        m_outages[device.id] = {nowMs + outageSteps * m_rules.paceMs, action};
-    }
-}
-
-void TaskEngine::endOutages(std::int64_t nowMs) {
-    std::erase_if(m_outages, [&](const auto &entry) {
-        const bool ends = entry.second.endsAt <= nowMs;
-        if (ends) {
-            endOutage(entry.first, entry.second);
-        }
-        return ends;
-    });
-}
-
-void TaskEngine::endOutage(const std::string &deviceId, const Outage &outage) {
-    if (Device *device = m_devices.find(deviceId)) {
-        device->reachable = !device->held;
-        device->action = device->action == outage.action ? standby : device->action;
+        m_outages.begin(device, action, nowMs + outageSteps * m_rules.paceMs);
     }
 }
 
 void TaskEngine::forget(const std::unordered_set<std::string> &deviceIds, std::int64_t nowMs) {
+    const auto isGone = [&](const TaskDevice &device) {
+        return deviceIds.contains(device.id) || !m_devices.find(device.id);
+    };
     for (Task *task : std::vector<Task *>(m_open)) {
-        if (std::erase_if(task->devices, [&](const auto &device) { return deviceIds.contains(device.id); }) ==
-            0) {
-            continue;
-        }
-        task->running.clear();
-        for (std::size_t i = 0; i < task->devices.size(); ++i) {
-            if (task->devices[i].phase == Phase::Running) {
-                task->running.push_back(i);
+        bool touched = false;
+        for (TaskDevice &device : task->devices) {
+            if (device.phase != Phase::Ended && deviceIds.contains(device.id)) {
+                end(*task, device, state::notManaged);
+                touched = true;
             }
         }
-        if (task->devices.empty()) {
+        if (!touched) {
+            continue;
+        }
+        std::erase_if(task->running, [&](std::size_t i) { return task->devices[i].phase == Phase::Ended; });
+        if (std::all_of(task->devices.begin(), task->devices.end(), isGone)) {
             std::erase(m_open, task);
             m_tasks.remove({task->id});
             continue;

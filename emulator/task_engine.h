@@ -1,5 +1,6 @@
 #pragma once
 
+#include "device_outages.h"
 #include "task_table.h"
 
 #include <cstdint>
@@ -12,7 +13,7 @@ namespace emulator {
 
 class DeviceTable;
 class LogTable;
-class Random;
+class Settings;
 
 /// How tasks run.
 struct TaskRules {
@@ -22,28 +23,14 @@ struct TaskRules {
     std::uint64_t seed = 0;
 };
 
-/// The work of a task for one of its devices.
-struct DeviceWork {
-    std::string id;
-    Json changes = Json::object(); ///< members of the device's record when the work succeeds
-    bool restarts = false;         ///< the device is away for a moment while it works
-    std::string failure;           ///< a code in which the work is bound to end; empty for none
-};
-
-const std::vector<std::string> &taskTypes();
-
-/// One of the codes in which work on a device fails.
-std::string failureCode(Random &random);
-
 /// Makes tasks and runs them, twenty devices at a time in each. Time passes with settle.
 class TaskEngine {
 public:
-    TaskEngine(Store &store, TaskTable &tasks, DeviceTable &devices, LogTable &log);
+    TaskEngine(Store &store, TaskTable &tasks, DeviceTable &devices, const Settings &settings, LogTable &log);
 
     TaskRules &rules() { return m_rules; }
 
-    /// A task on devices, named by their ids or by objects that hold an "id" and parameters; a parameter
-    /// "actm" schedules the task. Throws Refusal for an unknown type or device and where no device is named.
+    /// A task as requestedTask makes it; throws what that throws.
     Task &create(const std::string &type, const std::string &user, const Json &devices, std::int64_t nowMs);
 
     /// Throws Refusal when the task is unknown or cannot take this work.
@@ -63,22 +50,16 @@ public:
     /// Restarts a device for nobody's task.
     void restart(Device &device, const std::string &action, std::int64_t nowMs);
 
-    /// Takes devices that are to go out of the tasks that are not final.
+    /// Ends what devices that are to go still do. Tasks without any other device go with them.
     void forget(const std::unordered_set<std::string> &deviceIds, std::int64_t nowMs);
 
 private:
-    struct Outage {
-        std::int64_t endsAt = 0;
-        std::string action; ///< what ends with the outage; empty for none
-    };
-
-    void endOutages(std::int64_t nowMs);
-    void endOutage(const std::string &deviceId, const Outage &outage);
     void settleTask(Task &task, std::int64_t nowMs);
     static void wake(Task &task, std::int64_t nowMs);
     bool dropOverdue(Task &task, std::int64_t nowMs) const;
     bool run(Task &task, std::int64_t nowMs);
-    bool fillPlaces(Task &task);
+    std::size_t placesOf(const Task &task) const;
+    bool fillPlaces(Task &task, std::int64_t nowMs);
     void begin(Task &task, std::size_t index, std::int64_t nowMs);
     void advance(const Task &task, TaskDevice &device);
     void succeed(const Task &task, TaskDevice &device);
@@ -89,10 +70,11 @@ private:
     Store &m_store;
     TaskTable &m_tasks;
     DeviceTable &m_devices;
+    const Settings &m_settings;
     LogTable &m_log;
     TaskRules m_rules;
+    DeviceOutages m_outages;
     std::vector<Task *> m_open;
-    std::unordered_map<std::string, Outage> m_outages;
 };
 
 } // namespace emulator

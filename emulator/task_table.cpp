@@ -11,16 +11,6 @@ namespace emulator {
 
 namespace {
 
-std::string identityText(const std::string &id, const Json &record) {
-    std::string text = R"({"id":)" + jsonText(id);
-    for (const char *name : {"d_ip", "d_mac", "d_model"}) {
-        const auto found = record.find(name);
-        const bool isText = found != record.end() && found->is_string();
-        text += std::string(",\"") + name + "\":" + (isText ? jsonText(*found) : R"("")");
-    }
-    return text;
-}
-
 const std::string &devicesText(Task &task) {
     if (task.devicesText.empty()) {
         task.devicesText = "[";
@@ -38,11 +28,16 @@ std::string workText(const Task &task) {
     for (const TaskDevice &device : task.devices) {
         all.push_back({{"parameters", device.parameters},
                        {"there", device.phase != TaskDevice::Phase::WithoutWork},
-                       {"changes", device.changes},
-                       {"failure", device.failure},
-                       {"restarts", device.restarts}});
+                       {"ended", device.phase == TaskDevice::Phase::Ended},
+                       {"work", toJson(device.work)}});
     }
     return jsonText(all);
+}
+
+TaskDevice::Phase phaseOf(const Json &kept) {
+    using Phase = TaskDevice::Phase;
+    // What ran when the program ended is done anew.
+    return kept.value("ended", false) ? Phase::Ended : kept.at("there") ? Phase::Queued : Phase::WithoutWork;
 }
 
 std::vector<TaskDevice> devicesOf(const std::string &entries, const std::string &works) {
@@ -54,11 +49,10 @@ std::vector<TaskDevice> devicesOf(const std::string &entries, const std::string 
         device.id = entry.at("id");
         device.identity = identityText(device.id, entry);
         device.state = entry.at("state");
-        device.phase = its.at("there") ? TaskDevice::Phase::Queued : TaskDevice::Phase::WithoutWork;
+        device.progress = entry.at("progress");
+        device.phase = phaseOf(its);
         device.parameters = its.at("parameters");
-        device.changes = its.at("changes");
-        device.failure = its.at("failure");
-        device.restarts = its.at("restarts");
+        device.work = deviceWorkOf(its.value("work", Json::object()));
         devices.push_back(std::move(device));
     }
     return devices;
@@ -101,6 +95,16 @@ bool isFinal(const std::string &state) {
 
 std::string identityText(const Device &device) {
     return identityText(device.id, Json::parse(device.body));
+}
+
+std::string identityText(const std::string &id, const Json &record) {
+    std::string text = R"({"id":)" + jsonText(id);
+    for (const char *name : {"d_ip", "d_mac", "d_model"}) {
+        const auto found = record.find(name);
+        const bool isText = found != record.end() && found->is_string();
+        text += std::string(",\"") + name + "\":" + (isText ? jsonText(*found) : R"("")");
+    }
+    return text;
 }
 
 void appendEntry(std::string &text, const std::string &identity, const std::string &state, int progress) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "database.h"
+#include "device_work.h"
 #include "json_access.h"
 
 #include <cstdint>
@@ -27,6 +28,12 @@ inline constexpr auto reconnecting = "pTaskDeviceIsReconnecting";
 inline constexpr auto done = "pTaskDone";
 inline constexpr auto failed = "pTaskFailed";
 inline constexpr auto aborted = "pTaskAborted";
+
+// Failures that have nothing to do with what a device was asked for.
+inline constexpr auto noConnection = "pTaskFailedToConnectToDevice";
+inline constexpr auto lostConnection = "pTaskFailedToConnectToDeviceEx";
+inline constexpr auto mismatch = "pTaskMismatchingStatus"; ///< it is not in the state that the work needs
+inline constexpr auto notManaged = "pTaskNotInstalled";
 } // namespace state
 
 bool isFinal(const std::string &state);
@@ -43,10 +50,7 @@ struct TaskDevice {
 
     Json parameters = Json::object(); ///< what the request for the task said of the device
 
-    // What the work is, once it is there.
-    Json changes = Json::object(); ///< members of the device's record when the work succeeds
-    std::string failure;           ///< the code in which the work ends; empty for a success
-    bool restarts = false;
+    DeviceWork work; ///< what it has to do, once that is there
 
     // How the work stands; begun anew after a restart.
     int step = 0;
@@ -75,6 +79,7 @@ struct Task {
 
 /// The beginning of a device's entry in a task: a JSON object that is still open.
 std::string identityText(const Device &device);
+std::string identityText(const std::string &id, const Json &record);
 /// Adds a whole entry to the text of an array of them.
 void appendEntry(std::string &text, const std::string &identity, const std::string &state, int progress);
 

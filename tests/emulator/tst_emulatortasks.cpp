@@ -1,10 +1,9 @@
-#include "emulatorprocess.h"
-#include "servicecaller.h"
+#include "fleettest.h"
 
 #include <QTest>
 
 /// Tasks, and the alarms and log entries that the service writes beside them.
-class EmulatorTasksTest : public QObject {
+class EmulatorTasksTest : public FleetTest {
     Q_OBJECT
 
 private slots:
@@ -105,53 +104,7 @@ private slots:
     }
 
 private:
-    void start(const QStringList &arguments) {
-        QVERIFY(m_emulator->start(arguments));
-        m_caller = ServiceCaller(m_emulator->port());
-        QCOMPARE(m_caller.login("admin", "admin").code, 0);
-    }
-    /// A quick service with forty devices, all of them there.
-    void fresh(const QStringList &more = {}) {
-        m_emulator = std::make_unique<EmulatorProcess>();
-        start(QStringList{"--devices", "40", "--task-pace", "80"} + more);
-        QVERIFY(m_emulator->command("restore all").startsWith("ok"));
-        m_devices = m_caller.list("/v1/dev/list");
-    }
-    int code(const char *path, const Json &body) { return m_caller.call(path, body).code; }
-    int close(const Json &task, const char *state) {
-        return code("/v1/task/updateState", {{"task_id", task.at("tid")}, {"task_state", state}});
-    }
-    Json newTask(const char *type, std::size_t devices) {
-        const Json body = {{"type", type},
-                           {"devices", Json(m_devices.begin(), m_devices.begin() + long(devices))}};
-        return m_caller.call("/v1/task/init", body).data;
-    }
-    Json runUnder(const Json &task) {
-        Json body = {{"cgis", {"/cgi-bin/admin/getparam.cgi"}}, {"devices", task.at("devices")}};
-        for (Json &device : body["devices"]) {
-            device["tid"] = task.at("tid");
-        }
-        return m_caller.call("/v1/cgi/customx", body).data;
-    }
-    Json newest() { return m_caller.list("/v1/task/list", 300).at(0); }
-    Json ended() {
-        for (int i = 0; i < 400 && newest().at("active"); ++i) {
-            QTest::qWait(10);
-        }
-        return newest();
-    }
     Json alarms() { return m_caller.call("/v1/alarm/list", {{"start", 0}, {"count", 1000}}).data; }
-    std::size_t withStatus(const char *name, const char *value) {
-        return count(m_caller.list("/v1/dstatus/list"), name, value);
-    }
-    static std::size_t count(const Json &records, const char *name, const Json &value) {
-        const auto fits = [&](const Json &record) { return record.at(name) == value; };
-        return std::size_t(std::count_if(records.begin(), records.end(), fits));
-    }
-
-    std::unique_ptr<EmulatorProcess> m_emulator;
-    ServiceCaller m_caller{0};
-    Json m_devices;
 };
 
 QTEST_GUILESS_MAIN(EmulatorTasksTest)
