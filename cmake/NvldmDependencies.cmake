@@ -16,3 +16,4 @@ find_package(Threads REQUIRED)
 # cpp-httplib is a compiled library here; its flags decide its layout, so they come from its own file.
 find_package(PkgConfig REQUIRED)
 pkg_check_modules(httplib REQUIRED IMPORTED_TARGET cpp-httplib)
+pkg_check_modules(yamlcpp REQUIRED IMPORTED_TARGET yaml-cpp)

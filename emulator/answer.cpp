@@ -20,6 +20,12 @@ Answer Answer::secret(std::string data) {
     return answer;
 }
 
+Answer Answer::file(std::string bytes) {
+    Answer answer = plain(std::move(bytes));
+    answer.isFile = true;
+    return answer;
+}
+
 Answer Answer::refused(int code, std::string why) {
     Answer answer;
     answer.code = code;

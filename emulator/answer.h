@@ -14,6 +14,7 @@ enum class Code {
     WrongOldPassword = 106,
     EmailTaken = 107,
     NoMoreSessions = 108,
+    NoDeviceAnswer = 111, ///< a device is away or does not let the service in
 };
 
 /// Thrown wherever a request is found wanting; becomes the answer's code.
@@ -33,10 +34,12 @@ struct Answer {
     std::string msg = "ok";
     std::string data;      ///< JSON text; empty for none
     bool ciphered = false; ///< data travels as one ciphered text
+    bool isFile = false;   ///< data are the bytes of a file, which travel alone
     std::string token;     ///< a session token for the "Authorization" header; empty for none
 
     static Answer plain(std::string data);
     static Answer secret(std::string data);
+    static Answer file(std::string bytes);
     static Answer refused(int code, std::string why);
 };
 

@@ -18,8 +18,6 @@ namespace {
 
 using std::chrono::milliseconds;
 
-constexpr auto contentType = "application/json";
-
 int socketOf(const httplib::Request &request) {
     return request.ssl ? SSL_get_fd(request.ssl) : -1;
 }
@@ -45,10 +43,11 @@ void holdUnanswered(const httplib::Request &request, const StopSignal &stop) {
     cutConnection(descriptor);
 }
 
-void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body) {
+void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body,
+                 const char *type) {
     const int descriptor = socketOf(request);
     const auto kept = std::make_shared<std::string>(std::move(body));
-    response.set_content_provider(kept->size(), contentType,
+    response.set_content_provider(kept->size(), type,
                                   [kept, descriptor](std::size_t, std::size_t, httplib::DataSink &sink) {
                                       sink.write(kept->data(), kept->size() / 2);
                                       // What has arrived should be seen before the reset overtakes it.
@@ -58,10 +57,11 @@ void deliverHalf(const httplib::Request &request, httplib::Response &response, s
                                   });
 }
 
-void deliverDripping(httplib::Response &response, std::string body, const StopSignal &stop) {
+void deliverDripping(httplib::Response &response, std::string body, const char *type,
+                     const StopSignal &stop) {
     const auto kept = std::make_shared<std::string>(std::move(body));
     response.set_content_provider(
-        kept->size(), contentType, [kept, &stop](std::size_t offset, std::size_t, httplib::DataSink &sink) {
+        kept->size(), type, [kept, &stop](std::size_t offset, std::size_t, httplib::DataSink &sink) {
             return sink.write(kept->data() + offset, 1) && !stop.waitFor(milliseconds(1000));
         });
 }

@@ -17,9 +17,10 @@ class StopSignal;
 void holdUnanswered(const httplib::Request &request, const StopSignal &stop);
 
 /// Announces the whole body, sends half of it and resets the connection.
-void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body);
+void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body,
+                 const char *type);
 
 /// Sends a byte a second.
-void deliverDripping(httplib::Response &response, std::string body, const StopSignal &stop);
+void deliverDripping(httplib::Response &response, std::string body, const char *type, const StopSignal &stop);
 
 } // namespace emulator

@@ -33,8 +33,8 @@ Json bodyOf(const Incoming &incoming) {
 
 Dispatcher::Dispatcher(Service &service) : m_service(service) {
     for (const auto &family : {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(),
-                               taskEndpoints(), alarmEndpoints(), logEndpoints(), commandEndpoints()
-                               }) {
+                               taskEndpoints(), alarmEndpoints(), logEndpoints(), commandEndpoints(),
+                               operationEndpoints(), configurationEndpoints(), exportEndpoints()}) {
         for (const Endpoint &endpoint : family) {
             m_endpoints.emplace(endpoint.path, endpoint);
         }

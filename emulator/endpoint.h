@@ -43,5 +43,8 @@ Endpoints taskEndpoints();
 Endpoints alarmEndpoints();
 Endpoints logEndpoints();
 Endpoints commandEndpoints();
+Endpoints operationEndpoints();
+Endpoints configurationEndpoints();
+Endpoints exportEndpoints();
 
 } // namespace emulator

@@ -24,6 +24,7 @@ constexpr std::size_t mostBodyBytes = 16U << 20;
 // Requests that are held without an answer keep their thread.
 constexpr std::size_t threads = 64;
 constexpr auto jsonType = "application/json";
+constexpr auto fileType = "application/octet-stream";
 constexpr auto plainType = "text/plain";
 
 void fail(httplib::Response &response, int status, const std::string &why) {
@@ -190,13 +191,16 @@ void HttpsServer::answer(const httplib::Request &request, httplib::Response &res
     if (!answer.token.empty()) {
         response.set_header("Authorization", answer.token);
     }
-    std::string body = plan.main ? spoiledBody(std::move(answer), *plan.main) : envelope(answer);
+    const char *type = answer.isFile ? fileType : jsonType;
+    std::string body = plan.main       ? spoiledBody(std::move(answer), *plan.main)
+                       : answer.isFile ? std::move(answer.data)
+                                       : envelope(answer);
     if (plan.main && plan.main->kind == FaultKind::Reset) {
-        deliverHalf(request, response, std::move(body));
+        deliverHalf(request, response, std::move(body), type);
     } else if (plan.main && plan.main->kind == FaultKind::Drip) {
-        deliverDripping(response, std::move(body), m_stop);
+        deliverDripping(response, std::move(body), type, m_stop);
     } else {
-        response.set_content(std::move(body), jsonType);
+        response.set_content(std::move(body), type);
     }
 }
 

@@ -73,6 +73,9 @@ std::string spoiledBody(Answer answer, const Fault &fault) {
     if (fault.kind == FaultKind::NotJson) {
         return "<html><body>Please sign in to this network.</body></html>";
     }
+    if (answer.isFile) {
+        return std::move(answer.data);
+    }
     if (fault.kind == FaultKind::WrongTypes && fault.where != "code") {
         spoilTypes(answer, fault.where);
     }

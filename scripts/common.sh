@@ -1,7 +1,7 @@
 # What ./run, ./test and ./bench/run share. Sourced from the project's folder.
 
 project_packages="cmake g++ ninja-build pkg-config qt6-base-dev qt6-svg-dev
-    libcpp-httplib-dev libsqlitecpp-dev libsqlite3-dev nlohmann-json3-dev libssl-dev dbus-daemon
+    libcpp-httplib-dev libsqlitecpp-dev libsqlite3-dev nlohmann-json3-dev libyaml-cpp-dev libssl-dev dbus-daemon
     fonts-inter fonts-symbola"
 # For programs on a virtual display, and their pictures.
 display_packages="xvfb openbox xdotool imagemagick x11-utils"

@@ -61,6 +61,8 @@ Reply ServiceCaller::send(const Request &request) const {
     }
     reply.status = result->status;
     reply.token = result->get_header_value("Authorization");
+    reply.contentType = result->get_header_value("Content-Type");
+    reply.bytes = result->body;
     reply.body = Json::parse(result->body, nullptr, false);
     if (reply.body.is_object()) {
         const Json code = reply.body.value("code", Json());

@@ -21,6 +21,8 @@ struct Reply {
     Json body;           ///< the body as JSON, discarded where it is none
     Json data;           ///< "data", deciphered where it was ciphered; null where it does not decipher
     std::string token;   ///< a token in the header
+    std::string contentType;
+    std::string bytes; ///< the body as it came
 };
 
 /// Speaks to the service as any caller may: plain HTTPS and the ciphers.

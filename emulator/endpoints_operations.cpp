@@ -1,0 +1,70 @@
+#include "address_assignment.h"
+#include "address_book.h"
+#include "clock.h"
+#include "endpoint.h"
+#include "quick_setup.h"
+#include "service.h"
+#include "work_orders.h"
+
+namespace emulator {
+
+namespace {
+
+std::vector<Target> underTask(const std::vector<std::string> &ids, const std::string &taskId) {
+    std::vector<Target> targets;
+    for (const std::string &id : ids) {
+        targets.push_back({id, taskId});
+    }
+    return targets;
+}
+
+std::vector<std::string> idsOf(const std::vector<Target> &targets) {
+    std::vector<std::string> ids;
+    for (const Target &target : targets) {
+        ids.push_back(target.id);
+    }
+    return ids;
+}
+
+Answer assignAutomatically(Service &service, const Call &call) {
+    const auto targets = underTask(idsOf(targetsOf(call.body)), filledTextMember(call.body, "tid"));
+    service.withModel([&](Model &model) {
+        model.engine.settle(nowMs());
+        AddressBook addresses(model);
+        startUnderTasks(model, targets, "deviceAssignIPAuto",
+                        [&](const Device &device) { return automaticAddress(device, addresses); });
+    });
+    return {};
+}
+
+Answer assignByHand(Service &service, const Call &call) {
+    const AddressAssignment assignment(call.body);
+    const auto targets = underTask(assignment.deviceIds(), filledTextMember(call.body, "tid"));
+    service.withModel([&](Model &model) {
+        model.engine.settle(nowMs());
+        AddressBook addresses(model);
+        startUnderTasks(model, targets, "deviceAssignIPManual",
+                        [&](const Device &device) { return assignment.workFor(device, addresses); });
+    });
+    return {};
+}
+
+Answer setUpQuickly(Service &service, const Call &call) {
+    const auto targets = targetsOf(call.body);
+    DeviceWork work;
+    work.changes = quickSetupChanges(call.body, nowMs());
+    order(service, targets, "deviceQuickSetup", [&](const Device &) { return work; });
+    return {};
+}
+
+} // namespace
+
+Endpoints operationEndpoints() {
+    return {
+        {"POST", "/v1/assip/auto", Gate::Writer, &assignAutomatically},
+        {"POST", "/v1/assip/manual", Gate::Writer, &assignByHand},
+        {"POST", "/v1/quicksetup", Gate::Writer, &setUpQuickly},
+    };
+}
+
+} // namespace emulator
