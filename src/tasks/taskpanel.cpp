@@ -1,21 +1,18 @@
 #include "taskpanel.h"
 
 #include "confirmdialog.h"
-#include "exetaskmgr.h"
-#include "failedtaskstrip.h"
 #include "icons.h"
 #include "listactions.h"
 #include "notifier.h"
 #include "panelpage.h"
+#include "queuestrips.h"
 #include "taskdelegate.h"
 #include "taskinfopool.h"
 #include "taskmodel.h"
 #include "taskrepeats.h"
 #include "taskstate.h"
 #include "tasktexts.h"
-#include "transferstrip.h"
 #include "transientmessage.h"
-#include "uploadtaskmgr.h"
 
 #include <QAction>
 #include <QButtonGroup>
@@ -113,7 +110,7 @@ TaskPanel::TaskPanel(QWidget *parent)
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
     layout->addWidget(buildFilterRow());
-    layout->addWidget(buildStrips());
+    layout->addWidget(new QueueStrips(this));
     layout->addWidget(m_page, 1);
     layout->addWidget(buildActionBar());
     connectParts();
@@ -185,20 +182,6 @@ void TaskPanel::buildTree() {
     m_tree->setContextMenuPolicy(Qt::ActionsContextMenu);
     m_tree->addActions({m_copy, m_retry, m_cancel, m_remove});
     m_page->setView(m_tree);
-}
-
-/// What the queues of this client have to tell, above the service's list.
-QWidget *TaskPanel::buildStrips() {
-    auto *box = new QWidget(this);
-    auto *failed = new FailedTaskStrip(box);
-    auto *layout = new QVBoxLayout(box);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(0);
-    layout->addWidget(failed);
-    layout->addWidget(new TransferStrip(&UploadTaskMgr::instance(), box));
-    failed->follow(&UploadTaskMgr::instance());
-    failed->follow(&ExeTaskMgr::instance());
-    return box;
 }
 
 QWidget *TaskPanel::buildActionBar() {

@@ -27,7 +27,6 @@ private:
     QWidget *buildFilterRow();
     QToolButton *addFilterButton(QWidget *row, const char *name, const QString &text, TaskFilter::Kind kind);
     void buildTree();
-    QWidget *buildStrips();
     QWidget *buildActionBar();
     QAction *addAction(const char *name, const QString &text, void (TaskPanel::*slot)());
     QToolButton *makeButton(QAction *action, const QString &name);

@@ -23,22 +23,8 @@
 namespace {
 
 constexpr int tickMs = 1000;
-constexpr const char *queuedState = "init";
-/// The member with the session that a record belongs to.
-constexpr const char *sessionMember = "session";
-constexpr const char *secretMember = "pass";
-
 quint64 presentSession() {
     return CLocalStore::instance().loginInfo().generation;
-}
-
-void wipeSecret(JSON &record) {
-    const auto secret = record.find(secretMember);
-    if (secret == record.end() || !secret->is_string())
-        return;
-    auto &text = secret->get_ref<std::string &>();
-    std::fill(text.begin(), text.end(), '\0');
-    record.erase(secret);
 }
 
 /// "%d" in a log line stands for the result.
@@ -55,9 +41,10 @@ void logLine(QtMsgType type, const char *line, unsigned result) {
 /// The addresses that the task list gives for devices of a task.
 QSet<QString> macsOf(const QString &tid, const QStringList &deviceIds) {
     QSet<QString> macs;
+    const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
     if (const TaskRecordPtr task = CTaskInfoPool::instance().taskList()->find(tid)) {
         for (const TaskDevice &device : task->devices) {
-            if (deviceIds.contains(device.target->id))
+            if (wanted.contains(device.target->id))
                 macs.insert(TaskTargets::plainMac(device.target->mac));
         }
     }
@@ -84,11 +71,6 @@ QString nameOf(const TaskFamily &family, const TaskStep &step) {
                            : TaskType::title(QString::fromLatin1(family.serviceType));
 }
 
-std::string newId(const char *prefix) {
-    static std::atomic<unsigned> counter = 0;
-    return prefix + std::to_string(++counter);
-}
-
 } // namespace
 
 /// How a step ended.
@@ -102,6 +84,7 @@ TaskQueue::TaskQueue(std::span<const TaskFamily> families, const char *walkError
     m_timer->setInterval(tickMs);
     connect(m_timer, &QTimer::timeout, this, &TaskQueue::onTimeout);
     connect(&CTaskInfoPool::instance(), &CTaskInfoPool::cleared, this, &TaskQueue::onSessionEnded);
+    connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this, &TaskQueue::onTaskListUpdated);
     connect(qApp, &QCoreApplication::aboutToQuit, this, &TaskQueue::onQuit);
 }
 
@@ -125,18 +108,11 @@ const TaskFamily *TaskQueue::familyOf(std::string_view type) const {
 
 bool TaskQueue::insert(const char *type, JSON record, QString *ctid) {
     const TaskFamily *family = familyOf(type);
-    if (!record.is_object() || !family || !record.emplace("state", queuedState).first->is_string()) {
+    const std::string id =
+        family ? m_records.append(std::move(record), type, family->idPrefix, presentSession()) : "";
+    if (id.empty()) {
         qWarning("Inserting new task with the invalid parameter.");
         return false;
-    }
-    const std::string id = newId(family->idPrefix);
-    record["ctid"] = id;
-    record["type"] = type;
-    record[sessionMember] = presentSession();
-    {
-        const std::lock_guard lock(m_mutex);
-        m_tasks.push_back(std::move(record));
-        m_unwalked = true;
     }
     if (ctid)
         *ctid = QString::fromStdString(id);
@@ -146,7 +122,7 @@ bool TaskQueue::insert(const char *type, JSON record, QString *ctid) {
 }
 
 void TaskQueue::onTimeout() {
-    if (m_ticking || !m_unwalked)
+    if (m_ticking || !m_records.isUnwalked())
         return;
     const QScopedValueRollback ticking(m_ticking, true);
     if (m_worker.isRunning())
@@ -159,7 +135,7 @@ void TaskQueue::handlingTask() {
     try {
         std::size_t place = 0;
         JSON record;
-        while (!m_stopping && takeQueued(place, record))
+        while (!m_stopping && m_records.takeNext(place, record))
             runStep(*familyOf(record.at("type").get<std::string>()), record);
     } catch (const std::exception &error) {
         qWarning("%s%s", m_walkError, error.what());
@@ -168,34 +144,15 @@ void TaskQueue::handlingTask() {
     }
 }
 
-/// Copies the next queued record from the place on. The length is looked at in every step, so records that
-/// were appended meanwhile are reached.
-bool TaskQueue::takeQueued(std::size_t &place, JSON &record) {
-    const std::lock_guard lock(m_mutex);
-    while (place < m_tasks.size()) {
-        const JSON &each = m_tasks[place++];
-        if (each.is_null())
-            continue;
-        const auto state = each.at("state").get<std::string>();
-        const auto type = each.at("type").get<std::string>();
-        if (state == queuedState && familyOf(type)) {
-            record = each;
-            return true;
-        }
-    }
-    m_unwalked = false;
-    return false;
-}
-
 void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
     ServiceSession session(CLocalStore::instance().loginInfo());
     // Queued in a session that has ended: it must not run as somebody else, or on another server.
-    if (record.at(sessionMember) != session.login().generation) {
+    if (QueuedRecords::sessionOf(record) != session.login().generation) {
         setState(family, record, family.failureState());
         return complete(ApiInvalidArgument);
     }
     TaskStep step{session, record, std::make_shared<Transfer>()};
-    setSending({nameOf(family, step), step.transfer});
+    setSending({nameOf(family, step), step.transfer, {}});
     setState(family, record, family.workingState());
     Outcome outcome;
     try {
@@ -225,7 +182,9 @@ TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step) 
         return {result == ApiOk ? unsigned(ApiMissingData) : result, false};
     // The new task is to be seen before its work begins, and a repetition is only kept for tasks in the list.
     CTaskInfoPool::instance().fetchTaskStatuses(step.session);
-    tell([this, &family, ctid = stringMember(step.record, "ctid"), tid = QString::fromStdString(step.tid)] {
+    const QString tid = QString::fromStdString(step.tid);
+    setSending({nameOf(family, step), step.transfer, tid});
+    tell([this, &family, ctid = stringMember(step.record, "ctid"), tid] {
         rememberRepeat(family, ctid, tid);
         emit serviceTaskMade(ctid, tid);
     });
@@ -236,9 +195,8 @@ TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step) 
     else
         logLine(QtWarningMsg, family.lines.failure, result);
     // The service would wait for the rest of it until it gives up.
-    if (result != ApiOk && step.transfer->isCancelled())
-        CTaskInfoPool::instance().updateTaskState(step.session, QString::fromStdString(step.tid),
-                                                  TaskState::aborted);
+    if (result != ApiOk && step.transfer->isCancelled() && step.session.isPresent())
+        CTaskInfoPool::instance().updateTaskState(step.session, tid, TaskState::aborted);
     return {result, true};
 }
 
@@ -272,17 +230,10 @@ void TaskQueue::complete(quint32 error) {
 void TaskQueue::setState(const TaskFamily &family, const JSON &record, const char *state) {
     try {
         const auto ctid = record.at("ctid").get<std::string>();
-        {
-            const std::lock_guard lock(m_mutex);
-            const auto found = std::find_if(m_tasks.begin(), m_tasks.end(), [&](const JSON &each) {
-                return each.at("ctid").get<std::string>() == ctid;
-            });
-            if (found == m_tasks.end() || found->at("state") == state)
-                return;
-            (*found)["state"] = state;
-            if (state != std::string_view(family.workingState()))
-                wipeSecret(*found);
-        }
+        const bool isOver = state != std::string_view(family.workingState());
+        if (!m_records.setState(ctid, state,
+                                isOver ? QueuedRecords::Secret::Wipe : QueuedRecords::Secret::Keep))
+            return;
         tell([this, ctid = QString::fromStdString(ctid), state = QString::fromLatin1(state)] {
             emit recordChanged(ctid, state);
         });
@@ -294,15 +245,7 @@ void TaskQueue::setState(const TaskFamily &family, const JSON &record, const cha
 }
 
 QString TaskQueue::stateOf(const QString &ctid) const {
-    return stringMember(copyOf(ctid), "state");
-}
-
-JSON TaskQueue::copyOf(const QString &ctid) const {
-    const std::string wanted = ctid.toStdString();
-    const std::lock_guard lock(m_mutex);
-    const auto found = std::find_if(m_tasks.begin(), m_tasks.end(),
-                                    [&](const JSON &each) { return textMember(each, "ctid") == wanted; });
-    return found == m_tasks.end() ? JSON() : *found;
+    return stringMember(m_records.find(ctid.toStdString()), "state");
 }
 
 void TaskQueue::rememberRepeat(const TaskFamily &family, const QString &ctid, const QString &tid) {
@@ -314,7 +257,7 @@ void TaskQueue::rememberRepeat(const TaskFamily &family, const QString &ctid, co
 }
 
 void TaskQueue::repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds) {
-    JSON record = copyOf(ctid);
+    JSON record = m_records.find(ctid.toStdString());
     const TaskFamily *family = familyOf(textMember(record, "type"));
     if (!family)
         return;
@@ -324,12 +267,16 @@ void TaskQueue::repeat(const QString &ctid, const QString &tid, const QStringLis
     devices = TaskTargets::only(devices, deviceIds);
     if (const auto files = record.find("cert"); files != record.end())
         *files = TaskTargets::onlyFilesOf(*files, macsOf(tid, deviceIds));
-    record["state"] = queuedState;
-    insert(family->type, std::move(record));
+    insertAgain(*family, std::move(record));
+}
+
+void TaskQueue::insertAgain(const TaskFamily &family, JSON record) {
+    record.erase("state");
+    insert(family.type, std::move(record));
 }
 
 void TaskQueue::startAgain(const QString &ctid) {
-    JSON record = copyOf(ctid);
+    JSON record = m_records.find(ctid.toStdString());
     const TaskFamily *family = familyOf(textMember(record, "type"));
     if (!family)
         return;
@@ -337,38 +284,30 @@ void TaskQueue::startAgain(const QString &ctid) {
     if (family->asksAgain && textMember(record, "state") != family->workingState())
         return emit dialogNeeded(QString::fromLatin1(family->serviceType),
                                  idTexts(record.at(family->targets)));
-    record["state"] = queuedState;
-    insert(family->type, std::move(record));
+    insertAgain(*family, std::move(record));
     dismiss(ctid);
 }
 
 void TaskQueue::dismiss(const QString &ctid) {
-    const std::string wanted = ctid.toStdString();
-    const std::lock_guard lock(m_mutex);
-    for (JSON &each : m_tasks) {
-        if (textMember(each, "ctid") == wanted)
-            wipeSecret(each);
-    }
+    m_records.wipeSecret(ctid.toStdString());
 }
 
 void TaskQueue::onSessionEnded() {
     cancelSending();
-    const quint64 present = presentSession();
-    std::vector<JSON> dropped;
-    {
-        const std::lock_guard lock(m_mutex);
-        for (JSON &each : m_tasks) {
-            if (each.at(sessionMember) == present)
-                continue;
-            wipeSecret(each);
-            if (textMember(each, "state") == queuedState)
-                dropped.push_back({{"ctid", each.at("ctid")}, {"type", each.at("type")}});
-        }
+    for (const JSON &record : m_records.leaveBehind(presentSession())) {
+        const TaskFamily *family = familyOf(textMember(record, "type"));
+        setState(*family, record, family->failureState());
     }
-    for (const JSON &each : dropped) {
-        const TaskFamily *family = familyOf(textMember(each, "type"));
-        setState(*family, each, family->failureState());
-    }
+}
+
+/// A task that was cancelled in the list needs no more bytes.
+void TaskQueue::onTaskListUpdated() {
+    const Sending now = sending();
+    if (!now.transfer || now.tid.isEmpty())
+        return;
+    const TaskRecordPtr task = CTaskInfoPool::instance().taskList()->find(now.tid);
+    if (task && task->status == TaskState::aborted)
+        now.transfer->cancel();
 }
 
 void TaskQueue::onQuit() {

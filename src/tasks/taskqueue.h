@@ -2,6 +2,7 @@
 
 #include "failedhandover.h"
 #include "nettask.h"
+#include "queuedrecords.h"
 #include "taskfamily.h"
 
 #include <QObject>
@@ -11,7 +12,6 @@
 #include <memory>
 #include <mutex>
 #include <span>
-#include <vector>
 
 class QTimer;
 class Transfer;
@@ -44,7 +44,7 @@ public:
     void handlingTask();
 
     /// True while a record is at work or waits for it.
-    bool isBusy() const { return m_unwalked || m_worker.isRunning(); }
+    bool isBusy() const { return m_records.isUnwalked() || m_worker.isRunning(); }
 
     /// Does the work of a failed record again, as a new record.
     void startAgain(const QString &ctid);
@@ -55,6 +55,7 @@ public:
     struct Sending {
         QString name;                       ///< of the file, or of the operation where there are several
         std::shared_ptr<Transfer> transfer; ///< null while no record is at work
+        QString tid;                        ///< of the service task, once it is made
     };
     Sending sending() const;
 
@@ -84,10 +85,10 @@ private:
 
     void onTimeout();
     void onSessionEnded();
+    void onTaskListUpdated();
     void onQuit();
 
     const TaskFamily *familyOf(std::string_view type) const;
-    bool takeQueued(std::size_t &place, JSON &record);
     void runStep(const TaskFamily &family, const JSON &record);
     Outcome perform(const TaskFamily &family, TaskStep &step);
     void finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome);
@@ -97,15 +98,16 @@ private:
     void setState(const TaskFamily &family, const JSON &record, const char *state);
     void rememberRepeat(const TaskFamily &family, const QString &ctid, const QString &tid);
     void repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds);
-    JSON copyOf(const QString &ctid) const;
+    void insertAgain(const TaskFamily &family, JSON record);
     template <typename Told>
     void tell(Told told);
 
     std::span<const TaskFamily> m_families;
     const char *m_walkError;
 
-    mutable std::mutex m_mutex; ///< for the list, the completion callback and what is sent
-    std::vector<JSON> m_tasks;
+    QueuedRecords m_records;
+
+    mutable std::mutex m_mutex; ///< for the completion callback and what is sent
     Completion m_completion;
     quintptr m_completionContext = 0;
     Sending m_sending;
@@ -114,7 +116,6 @@ private:
     Callable m_state;
     QTimer *m_timer;
     bool m_ticking = false;
-    std::atomic<bool> m_unwalked = false; ///< a record may be queued
     std::atomic<bool> m_stopping = false;
     NetTask m_worker{NetTask::Turn::Beside}; ///< last: its job uses the others until it has ended
 };

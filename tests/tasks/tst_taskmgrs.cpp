@@ -16,7 +16,10 @@
 using nlohmann::json;
 using Insert = std::function<bool(QString *)>;
 
+using Cancel = std::function<void()>;
+
 Q_DECLARE_METATYPE(Insert)
+Q_DECLARE_METATYPE(Cancel)
 
 namespace {
 
@@ -71,6 +74,7 @@ private slots:
     void refusals();
     void uploadIsCancelled_data();
     void uploadIsCancelled();
+    void taskAbortedInTheListIsNotSentOn();
     void fileThatIsGoneIsToldByItsName();
 
 private:
@@ -326,13 +330,18 @@ void TestTaskMgrs::refusals() {
 }
 
 void TestTaskMgrs::uploadIsCancelled_data() {
-    QTest::addColumn<bool>("byLogOff");
-    QTest::newRow("by the user") << false;
-    QTest::newRow("by a log-off") << true;
+    QTest::addColumn<Cancel>("cancel");
+    QTest::addColumn<bool>("told"); // to the service, which has to be there
+    QTest::newRow("by the user") << Cancel([] { uploads().sending().transfer->cancel(); }) << true;
+    QTest::newRow("by a log-off") << Cancel([] {
+        CLocalStore::instance().clearLoginInfo();
+        CTaskInfoPool::instance().clear();
+    }) << false;
 }
 
 void TestTaskMgrs::uploadIsCancelled() {
-    QFETCH(bool, byLogOff);
+    QFETCH(Cancel, cancel);
+    QFETCH(bool, told);
     m_service->hold("/v1/fwupl");
     QString ctid;
     QVERIFY(uploads().insertNewFWUploadTask("auto", file("f.bin"), "f.bin", ids, "FW7", "", &ctid));
@@ -341,19 +350,25 @@ void TestTaskMgrs::uploadIsCancelled() {
     QCOMPARE(uploads().sending().name, QString("f.bin"));
     QElapsedTimer clock;
     clock.start();
-    if (byLogOff) {
-        CLocalStore::instance().clearLoginInfo();
-        CTaskInfoPool::instance().clear();
-    } else {
-        uploads().sending().transfer->cancel();
-    }
+    cancel();
     walk.join();
     QVERIFY2(clock.elapsed() < 1000, "ended within a second");
     QCOMPARE(uploads().stateOf(ctid), QString("upload_fail"));
     QVERIFY(!uploads().sending().transfer);
     const std::vector<json> ended = m_service->sentTo("/v1/task/updateState");
-    QCOMPARE(ended.size(), byLogOff ? 0u : 1u);
-    QVERIFY(byLogOff || ended[0]["task_state"] == "pTaskAborted");
+    QCOMPARE(ended.size(), told ? 1u : 0u);
+    QVERIFY(!told || ended[0]["task_state"] == "pTaskAborted");
+}
+
+void TestTaskMgrs::taskAbortedInTheListIsNotSentOn() {
+    m_service->hold("/v1/fwupl");
+    m_service->setTaskMade({{"tid", "T1"}});
+    m_service->setTasks({{{"tid", "T1"}, {"status", "pTaskAborted"}}});
+    QString ctid;
+    QVERIFY(uploads().insertNewFWUploadTask("auto", file("f.bin"), "f.bin", ids, "FW7", "", &ctid));
+    std::thread walk([] { uploads().handlingTask(); });
+    QTRY_COMPARE(uploads().stateOf(ctid), QString("upload_fail"));
+    walk.join();
 }
 
 void TestTaskMgrs::fileThatIsGoneIsToldByItsName() {

@@ -274,34 +274,6 @@ private slots:
         QCOMPARE(m_log->count("walk: "), 0);
     }
 
-    void insertionWhileTheListIsWalked() {
-        // Nobody is logged in, so that every step ends at once.
-        CLocalStore::instance().clearLoginInfo();
-        constexpr int records = 3000;
-        std::atomic<bool> inserting = true;
-        std::atomic<int> steps = 0;
-        m_queue->setCompletionCallback(0, [&](quintptr, quint32) { ++steps; });
-        std::thread walk([&] {
-            while (inserting)
-                m_queue->handlingTask();
-            m_queue->handlingTask();
-        });
-        QStringList ctids;
-        for (int i = 0; i < records; ++i) {
-            ctids += m_queue->add(i % 2 ? "plain" : "secret");
-            if (i % 100 == 0)
-                m_queue->dismiss(ctids[i / 2]);
-            if (i % 500 == 0)
-                CTaskInfoPool::instance().clear();
-        }
-        inserting = false;
-        walk.join();
-        QCOMPARE(steps.load(), records);
-        QCOMPARE(QSet<QString>(ctids.begin(), ctids.end()).size(), records);
-        for (int i = 0; i < records; i += 50)
-            QCOMPARE(m_queue->stateOf(ctids[i]), QString("applying"));
-    }
-
 private:
     IsolatedRoot m_root;
     std::unique_ptr<LogCapture> m_log;
