@@ -66,12 +66,18 @@ std::optional<Parts> pairs(const JSON &certs, const JSON &pkeys) {
     return parts;
 }
 
+/// The answer's "code" for the log; -1 where it has none.
+int loggedCode(const std::string &body) {
+    try {
+        return parseJson(body).at("code").get<int>();
+    } catch (const std::exception &) {
+        return -1;
+    }
+}
+
 void logFirmwareAnswer(const HttpAnswer &answer) {
-    const JSON body = JSON::parse(answer.body, nullptr, false);
-    const auto code = body.is_object() ? body.find("code") : body.end();
-    const bool isCode = code != body.end() && code->is_number_integer();
     qDebug("FW Upload Response -------> Status Code: %d, Code: %d, Body: %s", answer.status,
-           isCode ? code->get<int>() : -1, answer.body.substr(0, loggedBody).c_str());
+           loggedCode(answer.body), answer.body.substr(0, loggedBody).c_str());
 }
 
 } // namespace
