@@ -34,6 +34,21 @@ bool callerHasLeft(int descriptor) {
     return ::poll(&watched, 1, 0) > 0 && (watched.revents & (POLLRDHUP | POLLHUP | POLLERR)) != 0;
 }
 
+/// Announces the whole body, sends a part of it and resets the connection.
+void deliverPart(const httplib::Request &request, httplib::Response &response, std::string body,
+                 std::size_t count, const char *type) {
+    const int descriptor = socketOf(request);
+    const auto kept = std::make_shared<std::string>(std::move(body));
+    response.set_content_provider(
+        kept->size(), type, [kept, count, descriptor](std::size_t, std::size_t, httplib::DataSink &sink) {
+            sink.write(kept->data(), count);
+            // What has arrived should be seen before the reset overtakes it.
+            std::this_thread::sleep_for(milliseconds(50));
+            cutConnection(descriptor);
+            return false;
+        });
+}
+
 } // namespace
 
 void holdUnanswered(const httplib::Request &request, const StopSignal &stop) {
@@ -45,16 +60,18 @@ void holdUnanswered(const httplib::Request &request, const StopSignal &stop) {
 
 void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body,
                  const char *type) {
-    const int descriptor = socketOf(request);
-    const auto kept = std::make_shared<std::string>(std::move(body));
-    response.set_content_provider(kept->size(), type,
-                                  [kept, descriptor](std::size_t, std::size_t, httplib::DataSink &sink) {
-                                      sink.write(kept->data(), kept->size() / 2);
-                                      // What has arrived should be seen before the reset overtakes it.
-                                      std::this_thread::sleep_for(milliseconds(50));
-                                      cutConnection(descriptor);
-                                      return false;
-                                  });
+    const std::size_t half = body.size() / 2;
+    deliverPart(request, response, std::move(body), half, type);
+}
+
+void deliverAndCut(const httplib::Request &request, httplib::Response &response, std::string body,
+                   const char *type) {
+    const std::size_t all = body.size();
+    deliverPart(request, response, std::move(body), all, type);
+}
+
+void cutConnectionOf(const httplib::Request &request) {
+    cutConnection(socketOf(request));
 }
 
 void deliverDripping(httplib::Response &response, std::string body, const char *type,

@@ -20,6 +20,13 @@ void holdUnanswered(const httplib::Request &request, const StopSignal &stop);
 void deliverHalf(const httplib::Request &request, httplib::Response &response, std::string body,
                  const char *type);
 
+/// Sends the whole body and resets the connection, whatever is still to be read from it.
+void deliverAndCut(const httplib::Request &request, httplib::Response &response, std::string body,
+                   const char *type);
+
+/// Resets the connection of a request.
+void cutConnectionOf(const httplib::Request &request);
+
 /// Sends a byte a second.
 void deliverDripping(httplib::Response &response, std::string body, const char *type, const StopSignal &stop);
 

@@ -15,13 +15,20 @@ bool isJsonContentType(const std::string &type) {
            (type.size() == jsonContentType.size() || type[jsonContentType.size()] == ';');
 }
 
-Json bodyOf(const Incoming &incoming) {
+void checkContentType(const Incoming &incoming, Body body) {
+    if (body == Body::Form && !incoming.isForm) {
+        throw Refusal(Code::Malformed, "the body is no form");
+    }
+    if (body == Body::Text && !isJsonContentType(incoming.contentType)) {
+        throw Refusal(Code::Malformed, "the content type is not " + std::string(jsonContentType));
+    }
+}
+
+Json bodyOf(const Endpoint &endpoint, const Incoming &incoming) {
     if (incoming.verb != "POST") {
         return Json::object();
     }
-    if (!isJsonContentType(incoming.contentType)) {
-        throw Refusal(Code::Malformed, "the content type is not " + std::string(jsonContentType));
-    }
+    checkContentType(incoming, endpoint.body);
     Json body = parseJson(incoming.body);
     if (!body.is_object()) {
         throw Refusal(Code::Malformed, "the body is no object");
@@ -32,9 +39,10 @@ Json bodyOf(const Incoming &incoming) {
 } // namespace
 
 Dispatcher::Dispatcher(Service &service) : m_service(service) {
-    for (const auto &family : {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(),
-                               taskEndpoints(), alarmEndpoints(), logEndpoints(), commandEndpoints(),
-                               operationEndpoints(), configurationEndpoints(), exportEndpoints()}) {
+    for (const auto &family :
+         {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(), taskEndpoints(),
+          alarmEndpoints(), logEndpoints(), commandEndpoints(), operationEndpoints(),
+          configurationEndpoints(), exportEndpoints(), uploadEndpoints(), certificateEndpoints()}) {
         for (const Endpoint &endpoint : family) {
             m_endpoints.emplace(endpoint.path, endpoint);
         }
@@ -65,7 +73,8 @@ Answer Dispatcher::granted(const Endpoint &endpoint, const Incoming &incoming, b
 
 Call Dispatcher::callOf(const Endpoint &endpoint, const Incoming &incoming) {
     Call call;
-    call.body = bodyOf(incoming);
+    call.body = bodyOf(endpoint, incoming);
+    call.files = incoming.files;
     if (endpoint.gate != Gate::Anybody) {
         call.session = sessionOf(incoming, call.body, endpoint.gate);
     } else if (!m_service.genericTokens().accepts(incoming.authorization, nowMs())) {

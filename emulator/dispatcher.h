@@ -4,6 +4,7 @@
 
 #include <string>
 #include <unordered_map>
+#include <vector>
 
 namespace emulator {
 
@@ -13,7 +14,9 @@ struct Incoming {
     std::string path;
     std::string authorization;
     std::string contentType;
-    std::string body;
+    std::string body; ///< of a form its parameters
+    bool isForm = false;
+    std::vector<UploadedFile> files;
 };
 
 /// Finds the endpoint of a request, judges the request and lets the endpoint answer it.

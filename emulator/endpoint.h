@@ -3,7 +3,9 @@
 #include "answer.h"
 #include "json_access.h"
 #include "records.h"
+#include "uploaded_file.h"
 
+#include <span>
 #include <string>
 #include <vector>
 
@@ -18,9 +20,16 @@ enum class Gate {
     Writer,  ///< a session whose account may change things
 };
 
+/// How the body of a request comes.
+enum class Body {
+    Text,
+    Form, ///< parameters as JSON in the part "text", and files
+};
+
 /// A request that has passed its gate.
 struct Call {
     Json body;
+    std::span<const UploadedFile> files;
     SessionToken session; ///< empty at the gate for anybody
 };
 
@@ -30,6 +39,7 @@ struct Endpoint {
     const char *path;
     Gate gate;
     Answer (*handle)(Service &, const Call &);
+    Body body = Body::Text;
 };
 
 using Endpoints = std::vector<Endpoint>;
@@ -46,5 +56,7 @@ Endpoints commandEndpoints();
 Endpoints operationEndpoints();
 Endpoints configurationEndpoints();
 Endpoints exportEndpoints();
+Endpoints uploadEndpoints();
+Endpoints certificateEndpoints();
 
 } // namespace emulator

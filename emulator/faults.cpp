@@ -17,7 +17,7 @@ struct KindName {
     Value value;
 };
 
-constexpr std::array<KindName, 12> kinds = {{
+constexpr std::array<KindName, 15> kinds = {{
     {"no-answer", FaultKind::NoAnswer, Value::None},
     {"late", FaultKind::Late, Value::Number},
     {"reset", FaultKind::Reset, Value::None},
@@ -30,6 +30,9 @@ constexpr std::array<KindName, 12> kinds = {{
     {"renew", FaultKind::Renew, Value::None},
     {"expire", FaultKind::Expire, Value::None},
     {"drip", FaultKind::Drip, Value::None},
+    {"early", FaultKind::Early, Value::Number},
+    {"cut-body", FaultKind::CutBody, Value::Number},
+    {"slow-body", FaultKind::SlowBody, Value::Number},
 }};
 
 template <typename Number>
@@ -64,8 +67,8 @@ void readValue(Fault &fault, const KindName &kind, std::string_view value) {
     }
     if (kind.value == Value::Number) {
         fault.number = numberOf<int>(value, name.c_str());
-        if (fault.number < 0 ||
-            (fault.kind == FaultKind::Status && (fault.number < 200 || fault.number > 599))) {
+        const bool isStatus = fault.kind == FaultKind::Status || fault.kind == FaultKind::Early;
+        if (fault.number < 0 || (isStatus && (fault.number < 200 || fault.number > 599))) {
             throw FaultError(name + " takes no such number");
         }
     }
@@ -132,11 +135,12 @@ FaultPlan Faults::planFor(const std::string &path) {
     for (Fault &fault : m_faults) {
         // A fault that loses against an earlier one keeps its turns for later requests.
         const bool adds = fault.kind == FaultKind::Late || fault.kind == FaultKind::Renew ||
-                          fault.kind == FaultKind::Expire;
+                          fault.kind == FaultKind::Expire || fault.kind == FaultKind::SlowBody;
         if ((plan.main && !adds) || !hits(fault, path)) {
             continue;
         }
         plan.lateMs += fault.kind == FaultKind::Late ? fault.number : 0;
+        plan.bodyRate = fault.kind == FaultKind::SlowBody ? fault.number : plan.bodyRate;
         plan.renew |= fault.kind == FaultKind::Renew;
         plan.expire |= fault.kind == FaultKind::Expire;
         if (!adds) {

@@ -24,12 +24,15 @@ enum class FaultKind {
     Renew,
     Expire,
     Drip,
+    Early,
+    CutBody,
+    SlowBody,
 };
 
 /// One way to answer badly, and when.
 struct Fault {
     FaultKind kind = FaultKind::NoAnswer;
-    int number = 0;    ///< of late, status and code
+    int number = 0;    ///< of the kinds that have one
     std::string where; ///< of wrong-types
     std::string path;  ///< beginning of the paths it is for
     std::uint64_t after = 0;
@@ -48,9 +51,11 @@ public:
 /// Reads KIND[=VALUE][@PATH][,after=N][,times=N][,rate=P]; throws FaultError saying what is wrong.
 Fault readFault(const std::string &text);
 
-/// What befalls one request. Delays, renewals and expiries add up; of the other kinds the first wins.
+/// What befalls one request. Delays, slow bodies, renewals and expiries add up; of the other kinds the first
+/// wins.
 struct FaultPlan {
     int lateMs = 0;
+    int bodyRate = 0; ///< KiB a second; 0 for no bound
     bool renew = false;
     bool expire = false;
     std::optional<Fault> main;

@@ -20,7 +20,6 @@ namespace emulator {
 
 namespace {
 
-constexpr std::size_t mostBodyBytes = 16U << 20;
 // Requests that are held without an answer keep their thread.
 constexpr std::size_t threads = 64;
 constexpr auto jsonType = "application/json";
@@ -62,11 +61,12 @@ void logDefect(const httplib::Request &request, const std::exception_ptr &defect
 
 } // namespace
 
-HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &stop, int latencyMs)
+HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &stop, const ServerRules &rules)
     : m_service(service),
       m_faults(faults),
       m_stop(stop),
-      m_latencyMs(latencyMs),
+      m_latencyMs(rules.latencyMs),
+      m_limits(rules.limits),
       m_identity(makeServerIdentity()),
       m_dispatcher(std::make_unique<Dispatcher>(service)),
       m_server(std::make_unique<httplib::SSLServer>(m_identity.certificate.get(), m_identity.key.get())) {
@@ -108,13 +108,13 @@ void HttpsServer::stop() {
 
 void HttpsServer::route() {
     const auto withoutBody = [this](const httplib::Request &request, httplib::Response &response) {
-        handle(request, response, [](const auto &) { return true; });
+        handle(request, response, nullptr);
     };
     // Only a handler that reads the body itself gets a long one: the library holds bodies of this content
     // type to eight kilobytes otherwise.
     const auto withBody = [this](const httplib::Request &request, httplib::Response &response,
                                  const httplib::ContentReader &reader) {
-        handle(request, response, [&](const auto &take) { return reader(take); });
+        handle(request, response, &reader);
     };
     m_server->Get(".*", withoutBody);
     m_server->Options(".*", withoutBody);
@@ -130,33 +130,54 @@ void HttpsServer::route() {
 }
 
 void HttpsServer::handle(const httplib::Request &request, httplib::Response &response,
-                         const BodyReader &readBody) {
-    Incoming incoming{request.method,
-                      request.path,
-                      request.get_header_value("Authorization"),
-                      request.get_header_value("Content-Type"),
-                      {}};
-    bool tooLong = false;
-    // A body that is too long is still read to its end, or its sender would see a broken connection.
-    const bool whole = readBody([&](const char *bytes, std::size_t count) {
-        tooLong = tooLong || incoming.body.size() + count > mostBodyBytes;
-        if (!tooLong) {
-            incoming.body.append(bytes, count);
-        }
-        return true;
-    });
-    if (tooLong) {
-        fail(response, 413, "the body is too long");
-    } else if (!whole) {
-        fail(response, 400, "the body is incomplete");
-    } else {
-        judge(request, response, incoming);
+                         const httplib::ContentReader *reader) {
+    Incoming incoming;
+    incoming.verb = request.method;
+    incoming.path = request.path;
+    incoming.authorization = request.get_header_value("Authorization");
+    incoming.contentType = request.get_header_value("Content-Type");
+    const FaultPlan plan = m_faults.planFor(incoming.path);
+    if (plan.main && plan.main->kind == FaultKind::Early) {
+        response.status = plan.main->number;
+        return deliverAndCut(request, response, envelope({}), jsonType);
+    }
+    switch (reader ? readBody(request, *reader, incoming, plan) : BodyIntake::Result::Whole) {
+    case BodyIntake::Result::TooLong:
+        return fail(response, 413, "the body is too long");
+    case BodyIntake::Result::Broken:
+        return fail(response, 400, "the body is incomplete");
+    case BodyIntake::Result::Whole:
+        judge(request, response, incoming, plan);
     }
 }
 
+BodyIntake::Result HttpsServer::readBody(const httplib::Request &request,
+                                         const httplib::ContentReader &reader, Incoming &incoming,
+                                         const FaultPlan &plan) {
+    using Clock = std::chrono::steady_clock;
+    const auto start = Clock::now();
+    const bool cuts = plan.main && plan.main->kind == FaultKind::CutBody;
+    const auto most = cuts ? static_cast<std::uint64_t>(plan.main->number) : UINT64_MAX;
+    std::uint64_t size = 0;
+    const auto watch = [&](std::size_t count) {
+        size += count;
+        if (size >= most) {
+            cutConnectionOf(request);
+            return false;
+        }
+        const auto due =
+            std::chrono::milliseconds(plan.bodyRate == 0 ? 0 : size / 1024 * 1000 / plan.bodyRate);
+        const auto early = std::chrono::ceil<std::chrono::milliseconds>(start + due - Clock::now());
+        return early.count() <= 0 || !m_stop.waitFor(early);
+    };
+    const Endpoint *endpoint = m_dispatcher->find(incoming.path);
+    const bool isForm = endpoint && endpoint->body == Body::Form && request.is_multipart_form_data();
+    BodyIntake intake(incoming, m_limits, watch);
+    return isForm ? intake.readForm(reader) : intake.readText(reader);
+}
+
 void HttpsServer::judge(const httplib::Request &request, httplib::Response &response,
-                        const Incoming &incoming) {
-    const FaultPlan plan = m_faults.planFor(incoming.path);
+                        const Incoming &incoming, const FaultPlan &plan) {
     const int delay = m_latencyMs + plan.lateMs;
     if (delay > 0 && m_stop.waitFor(std::chrono::milliseconds(delay))) {
         return fail(response, 503, "the service stops");

@@ -1,12 +1,13 @@
 #pragma once
 
+#include "body_intake.h"
 #include "certificate.h"
 
-#include <functional>
 #include <memory>
 #include <string>
 
 namespace httplib {
+class ContentReader;
 class SSLServer;
 struct Request;
 struct Response;
@@ -21,10 +22,16 @@ class StopSignal;
 struct FaultPlan;
 struct Incoming;
 
+/// What the server does beside what its requests ask for.
+struct ServerRules {
+    int latencyMs = 0; ///< added to each answer
+    BodyLimits limits;
+};
+
 /// Takes requests over HTTPS and answers them, badly where a fault says so.
 class HttpsServer {
 public:
-    HttpsServer(Service &service, Faults &faults, const StopSignal &stop, int latencyMs);
+    HttpsServer(Service &service, Faults &faults, const StopSignal &stop, const ServerRules &rules);
     ~HttpsServer();
 
     /// Listens on the port; for 0 on the last one if it is still free, or on any. Gives the port; throws
@@ -37,11 +44,14 @@ public:
     void stop();
 
 private:
-    using BodyReader = std::function<bool(const std::function<bool(const char *, std::size_t)> &)>;
-
     void route();
-    void handle(const httplib::Request &request, httplib::Response &response, const BodyReader &readBody);
-    void judge(const httplib::Request &request, httplib::Response &response, const Incoming &incoming);
+    /// A request without a body comes without a reader.
+    void handle(const httplib::Request &request, httplib::Response &response,
+                const httplib::ContentReader *reader);
+    BodyIntake::Result readBody(const httplib::Request &request, const httplib::ContentReader &reader,
+                                Incoming &incoming, const FaultPlan &plan);
+    void judge(const httplib::Request &request, httplib::Response &response, const Incoming &incoming,
+               const FaultPlan &plan);
     void answer(const httplib::Request &request, httplib::Response &response, const Incoming &incoming,
                 const FaultPlan &plan);
 
@@ -49,6 +59,7 @@ private:
     Faults &m_faults;
     const StopSignal &m_stop;
     int m_latencyMs;
+    BodyLimits m_limits;
     ServerIdentity m_identity;
     std::unique_ptr<Dispatcher> m_dispatcher;
     std::unique_ptr<httplib::SSLServer> m_server;

@@ -74,7 +74,10 @@ int serve(const emulator::Options &options) {
     }
     emulator::Service service(options, files.storePath());
     emulator::StopSignal stop;
-    emulator::HttpsServer server(service, faults, stop, options.latencyMs);
+    emulator::ServerRules rules;
+    rules.latencyMs = options.latencyMs;
+    rules.limits.upload = options.uploadLimit;
+    emulator::HttpsServer server(service, faults, stop, rules);
     const int port = server.bind(options.host, options.port, files.lastPort());
     files.writePort(port);
     files.writeRunning();

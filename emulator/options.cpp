@@ -42,6 +42,7 @@ Accounts
   --session-limit N     sessions at a time; a login beyond answers 108; 0 is no limit (0)
 Behaviour
   --latency MS          added to each answer
+  --upload-limit BYTES  longest form; one that is longer is answered with 413 (8 GiB)
   --batch-timeout MS    life of a commit that was started and not ended (60000)
   --token-grace MS      how long a token stays good after its renewal (60000)
   --block-time MS       how long a device blocks its account after five wrong passwords (60000)
@@ -62,6 +63,9 @@ when left out), not the first N of them (after), N times at most (times), each w
   renew                 renew the session token on every answer
   expire                forget every session before the request is judged
   drip                  send the body one byte a second
+  early=N               answer with this HTTP status before the body is read, then reset the connection
+  cut-body=N            read N bytes of the request's body, then reset the connection
+  slow-body=N           read the request's body with N KiB a second
 
 Commands on standard input, one a line, each answered by one line "ok ..." or "error ..." on standard error:
   fault FAULT           faults clear          expire-sessions       counts           stop
@@ -80,8 +84,13 @@ and five wrong passwords block the account for a minute. A device in "Set Passwo
 anything else. Each device has the accounts "root" and "admin"; a new password of "root" shuts the service out.
 
 Tasks run on 20 devices at a time; devices that have not let the service in fail. A device that is ordered to
-restart or restore is away for three steps, which raises no alarm. The network is 255.255.0.0; its DHCP server
+restart or restore, or gets firmware, is away for three steps, which raises no alarm. The network is 255.255.0.0; its DHCP server
 gives addresses from x.y.192.1 on.
+
+Uploads are hashed while they arrive and not kept. A firmware image may begin with the line
+  NVLFW1 MODEL[,MODEL...] VERSION
+and fits the models that begin with one of these then, unless their firmware has a higher first number; other
+files fit every model. A device has four slots for packages.
 )";
 
 template <typename Number>
@@ -137,6 +146,7 @@ Setters valueSetters(Options &options) {
         {"--seed", numberInto<std::uint64_t>("--seed", options.seed, UINT64_MAX)},
         {"--root", [&](const std::string &text) { options.root = text; }},
         {"--latency", numberInto("--latency", options.latencyMs, longestMs)},
+        {"--upload-limit", numberInto<std::uint64_t>("--upload-limit", options.uploadLimit, UINT64_MAX)},
         {"--life", numberInto("--life", options.lifeMs, longestMs)},
         {"--session-limit", numberInto<std::size_t>("--session-limit", options.sessionLimit, 1000000)},
         {"--batch-timeout", numberInto("--batch-timeout", options.batchTimeoutMs, longestHold)},

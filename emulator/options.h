@@ -24,6 +24,7 @@ struct Options {
     std::uint64_t seed = 1;
     std::filesystem::path root;
     int latencyMs = 0;
+    std::uint64_t uploadLimit = 8ULL << 30;
     int lifeMs = 1000;
     std::size_t sessionLimit = 0;
     std::int64_t batchTimeoutMs = 60000;

@@ -17,6 +17,7 @@ public:
     /// listens.
     bool start(const QStringList &arguments = {});
     int port() const { return m_port; }
+    qint64 processId() const { return m_process.processId(); }
     QString readyLine() const { return m_readyLine; }
     /// What it has written to standard error and was no answer to a command.
     QString diagnostics() const { return m_diagnostics; }

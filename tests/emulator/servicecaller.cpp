@@ -43,16 +43,40 @@ std::string ServiceCaller::cipheredPassword(const std::string &password) {
 }
 
 Reply ServiceCaller::send(const Request &request) const {
-    httplib::SSLClient client("127.0.0.1", m_port);
-    client.enable_server_certificate_verification(false);
-    client.set_read_timeout(m_readTimeout);
-    // The library sends head and body apart; without this each request waits for a delayed acknowledgement.
-    client.set_tcp_nodelay(true);
     httplib::Request raw;
     raw.method = request.verb;
     raw.path = request.path;
     raw.body = request.body;
     raw.headers = {{"Authorization", request.token}, {"Content-Type", request.contentType}};
+    return send(std::move(raw));
+}
+
+Reply ServiceCaller::sendForm(const std::string &path, Json parameters,
+                              const std::vector<File> &files) const {
+    const std::string boundary = "a-line-that-no-file-holds";
+    parameters["id"] = m_account;
+    httplib::Request raw;
+    raw.method = "POST";
+    raw.path = path;
+    const auto add = [&](const std::string &name, const std::string &fileName, const std::string &content) {
+        raw.body += "--" + boundary + "\r\nContent-Disposition: form-data; name=\"" + name +
+                    "\"; filename=\"" + fileName + "\"\r\n\r\n" + content + "\r\n";
+    };
+    add("text", "data", parameters.dump());
+    for (const File &file : files) {
+        add(file.part, file.name, file.content);
+    }
+    raw.body += "--" + boundary + "--\r\n";
+    raw.headers = {{"Authorization", m_token}, {"Content-Type", "multipart/form-data; boundary=" + boundary}};
+    return send(std::move(raw));
+}
+
+Reply ServiceCaller::send(httplib::Request raw) const {
+    httplib::SSLClient client("127.0.0.1", m_port);
+    client.enable_server_certificate_verification(false);
+    client.set_read_timeout(m_readTimeout);
+    // The library sends head and body apart; without this each request waits for a delayed acknowledgement.
+    client.set_tcp_nodelay(true);
     const httplib::Result result = client.send(raw);
     Reply reply;
     if (!result) {

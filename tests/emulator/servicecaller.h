@@ -5,8 +5,13 @@
 #include <cstddef>
 #include <optional>
 #include <string>
+#include <vector>
 
 using Json = nlohmann::json;
+
+namespace httplib {
+struct Request;
+}
 
 /// Compares JSON values by their texts: the test library cannot print them, and its comparisons do not
 /// compile with a type that converts to everything.
@@ -50,6 +55,15 @@ public:
     /// A request of the session, with its "id" added; a renewed token is taken over.
     Reply call(const std::string &path, Json body = Json::object());
 
+    /// A file of a form.
+    struct File {
+        std::string part;
+        std::string name;
+        std::string content;
+    };
+    /// A form of the session, with its "id" added to the parameters.
+    Reply sendForm(const std::string &path, Json parameters, const std::vector<File> &files) const;
+
     /// All pages of a list.
     Json list(const std::string &path, int pageSize = 500);
 
@@ -58,6 +72,8 @@ public:
     void setReadTimeout(int seconds) { m_readTimeout = seconds; }
 
 private:
+    Reply send(httplib::Request raw) const;
+
     int m_port;
     int m_readTimeout = 30;
     std::string m_account;

@@ -1,0 +1,55 @@
+#pragma once
+
+#include "uploaded_file.h"
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace httplib {
+class ContentReader;
+}
+
+namespace emulator {
+
+struct Incoming;
+
+/// Bounds of a request's body, in bytes.
+struct BodyLimits {
+    std::uint64_t text = 16U << 20;
+    std::uint64_t upload = 8ULL << 30;
+};
+
+/// Takes the body of a request in while it arrives: a text whole, of a form's files what an UploadedFile
+/// keeps.
+class BodyIntake {
+public:
+    enum class Result { Whole, Broken, TooLong };
+    /// Is told of each piece; false ends the reading.
+    using Watch = std::function<bool(std::size_t)>;
+
+    BodyIntake(Incoming &incoming, const BodyLimits &limits, Watch watch);
+
+    Result readText(const httplib::ContentReader &reader);
+    Result readForm(const httplib::ContentReader &reader);
+
+private:
+    bool takeText(std::string_view bytes);
+    void beginPart(const std::string &name, const std::string &fileName);
+    bool takePart(std::string_view bytes);
+    void endPart();
+    Result resultOf(bool whole) const;
+
+    Incoming &m_incoming;
+    BodyLimits m_limits;
+    Watch m_watch;
+    std::optional<FileIntake> m_file; ///< none while the parameters arrive
+    std::uint64_t m_size = 0;
+    std::uint64_t m_headSize = 0;
+    bool m_tooLong = false;
+};
+
+} // namespace emulator
