@@ -107,7 +107,9 @@ qint64 count(const QString &pattern) {
         if (part == QLatin1String("*"))
             product *= largestPart + 1;
         else if (part.contains(u'-'))
-            product *= ends.size() == 2 ? std::abs(ends[0].toInt() - ends[1].toInt()) + 1 : 0;
+            product *= ends.size() == 2 && !ends.contains(QString())
+                           ? std::abs(ends[0].toInt() - ends[1].toInt()) + 1
+                           : 0;
     }
     return product;
 }

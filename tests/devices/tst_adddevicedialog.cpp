@@ -1,17 +1,13 @@
 #include "adddevicedialog.h"
 #include "adddevicemanualdialog.h"
 #include "apiclient.h"
+#include "checktable.h"
 #include "devicemaker.h"
 #include "discoveredmodel.h"
-#include "checktable.h"
-#include "emulatorprocess.h"
 #include "invaliddevicedialog.h"
 #include "iplineedit.h"
-#include "isolatedroot.h"
-#include "localstore.h"
 #include "logcapture.h"
-#include "nettask.h"
-#include "servicesession.h"
+#include "signedinservice.h"
 #include "storewriter.h"
 
 #include <QCheckBox>
@@ -28,8 +24,6 @@
 
 namespace {
 
-const char *account = "admin@norvell.example";
-const char *password = "Passw0rd!";
 /// A search takes five seconds.
 constexpr int patienceMs = 12000;
 
@@ -43,7 +37,7 @@ private slots:
         delete m_dialog;
         CLocalStore::instance().clearLoginInfo();
         QVERIFY(NetTask::waitForAll(patienceMs));
-        m_service.kill();
+        m_service.process().kill();
     }
 
     void addressesAreTypedAndPasted() {
@@ -159,7 +153,7 @@ private slots:
         search->setText("nothing");
         QCOMPARE(text("emptyTitleLabel"), QStringLiteral("No device matches"));
 
-        QVERIFY(m_service.command("fault code=3@/v1/dev/commit,times=1").startsWith("ok"));
+        m_service.tell("fault code=3@/v1/dev/commit,times=1");
         button("addButton")->click();
         QCOMPARE(text("waitLabel"), QStringLiteral("Adding..."));
         QVERIFY(!button("addButton")->isEnabled() && !button("refreshButton")->isEnabled());
@@ -205,11 +199,12 @@ private slots:
         QFETCH(QStringList, arguments);
         QFETCH(int, taken);
         workOn(arguments);
-        QVERIFY(m_root.write("cams.csv", "Model,IP,MAC,HTTP Port,HTTPS Port\n"
-                                         "N-1,10.0.0.1,02:00:00:00:00:01,80,443\n"
-                                         "N-2,10.0.0.2,bad,80,443\n"
-                                         "N-3,10.0.0.3,02:00:00:00:00:03,80,443\n"));
-        m_dialog->setAskOpenPath([this](const auto &chosen) { chosen(m_root.filePath("cams.csv")); });
+        QVERIFY(m_service.root().write("cams.csv", "Model,IP,MAC,HTTP Port,HTTPS Port\n"
+                                                   "N-1,10.0.0.1,02:00:00:00:00:01,80,443\n"
+                                                   "N-2,10.0.0.2,bad,80,443\n"
+                                                   "N-3,10.0.0.3,02:00:00:00:00:03,80,443\n"));
+        m_dialog->setAskOpenPath(
+            [this](const auto &chosen) { chosen(m_service.root().filePath("cams.csv")); });
         button("importCsvButton")->click();
         QTRY_COMPARE(table()->model()->rowCount(), 2);
         auto *invalid = m_dialog->findChild<InvalidDeviceDialog *>();
@@ -220,7 +215,7 @@ private slots:
         QCOMPARE(list->item(0, 1)->text(), QStringLiteral("\"bad\" is no MAC address."));
         invalid->accept();
         StoreWriter::flush();
-        QCOMPARE(CLocalStore::instance().defaultFilePath(), m_root.path());
+        QCOMPARE(CLocalStore::instance().defaultFilePath(), m_service.root().path());
 
         QSignalSpy added(m_dialog, &AddDeviceDialog::devicesAdded);
         m_dialog->findChild<QCheckBox *>("selectAllCheckBox")->click();
@@ -240,15 +235,7 @@ private slots:
 
 private:
     void workOn(const QStringList &arguments) {
-        QVERIFY(m_service.start(QStringList{"--fresh", "--devices", "20", "--account",
-                                            QString::fromLatin1(account) + u':' + password} +
-                                arguments));
-        unsigned result = ApiException;
-        NetTask::runAndWait(
-            [&] { result = CApiClient("127.0.0.1", m_service.port()).loginServer(account, password); });
-        QCOMPARE(result, unsigned(ApiOk));
-        CLocalStore &store = CLocalStore::instance();
-        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access());
+        m_service.start(QStringList{"--devices", "20"} + arguments);
         const JSON devices = managed();
         m_dialog = new AddDeviceDialog(DeviceMaker::snapshot({devices.begin(), devices.end()}));
         m_dialog->open();
@@ -256,19 +243,14 @@ private:
     }
     static JSON managed() {
         JSON devices;
-        NetTask::runAndWait([&] {
-            ServiceSession(CLocalStore::instance().loginInfo()).call([&](CApiClient &client) {
-                return client.listDevices(0, 500, devices);
-            });
-        });
+        SignedInService::call([&](CApiClient &client) { return client.listDevices(0, 500, devices); });
         return devices;
     }
     QPushButton *button(const char *name) const { return m_dialog->findChild<QPushButton *>(name); }
     QString text(const char *name) const { return m_dialog->findChild<QLabel *>(name)->text(); }
     CheckTable *table() const { return m_dialog->findChild<CheckTable *>("discoveredTable"); }
 
-    IsolatedRoot m_root;
-    EmulatorProcess m_service{m_root.path()};
+    SignedInService m_service;
     QPointer<AddDeviceDialog> m_dialog;
 };
 

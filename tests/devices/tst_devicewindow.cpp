@@ -1,18 +1,14 @@
 #include "apiclient.h"
 #include "countedtabwidget.h"
 #include "devicewindow.h"
-#include "emulatorprocess.h"
-#include "isolatedroot.h"
-#include "localstore.h"
 #include "logcapture.h"
 #include "mainconsolemenu.h"
 #include "mainconsoletable.h"
-#include "nettask.h"
 #include "noticebar.h"
 #include "reconnectingdialog.h"
 #include "refreshdevicedialog.h"
-#include "servicesession.h"
 #include "sessionevents.h"
+#include "signedinservice.h"
 #include "sitetree.h"
 #include "storewriter.h"
 #include "taskinfopool.h"
@@ -39,8 +35,6 @@
 
 namespace {
 
-const char *account = "admin@norvell.example";
-const char *password = "Passw0rd!";
 /// The monitor's slowest beat is six seconds.
 constexpr int patienceMs = 12000;
 
@@ -65,7 +59,7 @@ private slots:
         QVERIFY(NetTask::waitForAll(patienceMs));
         QCoreApplication::processEvents();
         QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-        m_service.kill();
+        m_service.process().kill();
     }
 
     void showsTheInventory() {
@@ -158,8 +152,7 @@ private slots:
     }
 
     void failedReadingRecovers() {
-        startEmulator({"--fault", "status=500@/v1/dev/list,times=1"});
-        logIn();
+        m_service.start({"--fault", "status=500@/v1/dev/list,times=1"});
         const LogCapture log;
         m_window->startWork();
         QTRY_COMPARE(shownPage(), QStringLiteral("failedPage"));
@@ -178,8 +171,8 @@ private slots:
 
     void lostServerComesBack() {
         workOn(20);
-        const QString port = QString::number(m_service.port());
-        m_service.kill();
+        const QString port = QString::number(m_service.process().port());
+        m_service.process().kill();
         QTRY_VERIFY_WITH_TIMEOUT(visible<ReconnectingDialog>(), 8000);
         QVERIFY(visible<ReconnectingDialog>()->findChild<QWidget *>("statusWidget")->isVisible());
         QCOMPARE(rowsOfAllTables(), 20);
@@ -188,7 +181,7 @@ private slots:
                           Qt::LeftButton);
         QCOMPARE(disconnects.size(), 1);
 
-        restartEmulator({"--port", port});
+        m_service.restart({"--port", port});
         tell("add 1");
         QTRY_VERIFY_WITH_TIMEOUT(visible<RefreshDeviceDialog>(), patienceMs);
         QVERIFY(!visible<ReconnectingDialog>());
@@ -208,7 +201,7 @@ private slots:
         QCoreApplication::processEvents();
         QCOMPARE(lost.size(), 1);
         // A new session has an end of its own.
-        logIn();
+        m_service.logIn();
         tell("expire-sessions");
         m_window->reload();
         QTRY_COMPARE(lost.size(), 2);
@@ -322,12 +315,14 @@ private slots:
         auto *dialog = m_window->findChild<QFileDialog *>("saveFileDialog");
         QVERIFY(dialog);
         QCOMPARE(dialog->windowTitle(), QStringLiteral("Save as"));
-        dialog->selectFile(m_root.filePath("list"));
+        dialog->selectFile(m_service.root().filePath("list"));
         QMetaObject::invokeMethod(dialog, "accept");
-        const auto lines = [this] { return QString::fromUtf8(m_root.read("list.csv")).split('\n'); };
+        const auto lines = [this] {
+            return QString::fromUtf8(m_service.root().read("list.csv")).split('\n');
+        };
         QTRY_COMPARE(lines().size(), cameras->rowCount() + 2);
         QCOMPARE(lines()[1].section(',', 2, 2), cameras->item(0, 3)->text());
-        QTRY_COMPARE(CLocalStore::instance().defaultFilePath(), m_root.path());
+        QTRY_COMPARE(CLocalStore::instance().defaultFilePath(), m_service.root().path());
     }
 
     void siteChangesAreSentWhenApplied() {
@@ -396,21 +391,20 @@ private slots:
         QCoreApplication::processEvents();
         QCOMPARE(rowsOfAllTables(), 0);
         // The next session begins while the last answer to the old one is still on its way.
-        logIn();
+        m_service.logIn();
         tell("fault late=1000@/v1/dev/list,times=1");
         m_window->startWork();
         m_window->stopWork();
         CLocalStore::instance().clearLoginInfo();
         tell("add 2");
-        logIn();
+        m_service.logIn();
         m_window->startWork();
         QTRY_COMPARE(rowsOfAllTables(), 22);
         QCOMPARE(shownPage(), QStringLiteral("cameraTable"));
     }
 
     void mayBeDestroyedWhileJobsRun() {
-        startEmulator({"--fault", "late=1000@/v1/site/list,times=1"});
-        logIn();
+        m_service.start({"--fault", "late=1000@/v1/site/list,times=1"});
         const LogCapture log;
         m_window->startWork();
         QTest::mouseClick(m_window->findChild<QToolButton *>("refreshButton"), Qt::LeftButton);
@@ -427,40 +421,14 @@ private slots:
     }
 
 private:
-    static void onService(const std::function<unsigned(CApiClient &)> &call) {
-        unsigned result = ApiException;
-        NetTask::runAndWait([&] { result = ServiceSession(CLocalStore::instance().loginInfo()).call(call); });
-        QCOMPARE(result, unsigned(ApiOk));
-    }
-    void tell(const QString &command) {
-        const QString answer = m_service.command(command);
-        QVERIFY2(answer.startsWith("ok"), qPrintable(answer));
-    }
+    static void onService(const std::function<unsigned(CApiClient &)> &call) { SignedInService::call(call); }
+    void tell(const QString &command) { m_service.tell(command); }
     /// A window at work on a service with so many devices.
     void workOn(int devices) {
-        startEmulator({"--devices", QString::number(devices)});
-        logIn();
+        m_service.start({"--devices", QString::number(devices)});
         m_window->startWork();
         QTRY_COMPARE(rowsOfAllTables(), devices);
     }
-    void logIn() {
-        unsigned result = ApiException;
-        NetTask::runAndWait(
-            [&] { result = CApiClient("127.0.0.1", m_service.port()).loginServer(account, password); });
-        QCOMPARE(result, unsigned(ApiOk));
-        CLocalStore &store = CLocalStore::instance();
-        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access());
-    }
-
-    void startEmulator(const QStringList &arguments = {}) {
-        restartEmulator(arguments + QStringList{"--fresh"});
-    }
-    /// With the fleet and the sessions that it had.
-    void restartEmulator(const QStringList &arguments) {
-        QVERIFY(m_service.start(QStringList{"--account", QString::fromLatin1(account) + u':' + password} +
-                                arguments));
-    }
-
     QPushButton *visibleButton(const char *name) const {
         for (auto *button : m_window->findChildren<QPushButton *>(name)) {
             if (button->isVisible())
@@ -498,8 +466,7 @@ private:
         return dialog && dialog->isVisible() ? dialog : nullptr;
     }
 
-    IsolatedRoot m_root;
-    EmulatorProcess m_service{m_root.path()};
+    SignedInService m_service;
     std::unique_ptr<DeviceWindow> m_window;
 };
 
