@@ -11,6 +11,8 @@
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
+#include <chrono>
+#include <thread>
 
 struct DeviceActions::Change {
     JSON records = JSON::array();
@@ -35,11 +37,8 @@ int countOf(const std::vector<SiteMembership::DeviceOutcome> &outcomes, Outcome 
         }));
 }
 
-/// How many devices take the credentials, and what became of the others.
+/// How many devices take the credentials, and what the others say.
 QString authorizationText(const std::map<DeviceStatusCode, int> &states, int asked) {
-    if (states.empty())
-        return DeviceActions::tr(
-            "The credentials were taken. What the devices say shows with the next poll.");
     int good = 0;
     QStringList others;
     for (const auto &[code, count] : states) {
@@ -48,9 +47,13 @@ QString authorizationText(const std::map<DeviceStatusCode, int> &states, int ask
         else
             others += DeviceActions::tr("%1: %2").arg(DeviceStatus::text(code).trimmed()).arg(count);
     }
-    const QString summary = DeviceActions::tr("%1 of %2 devices are authorized.").arg(good).arg(asked);
-    return others.isEmpty() ? summary : summary + u' ' + others.join(QStringLiteral(", "));
+    if (others.isEmpty())
+        return DeviceActions::tr("%1 of %2 devices are authorized.").arg(good).arg(asked);
+    return DeviceActions::tr("%1 of %2 devices are authorized so far. %3.")
+        .arg(QString::number(good), QString::number(asked), others.join(QStringLiteral(", ")));
 }
+
+constexpr std::chrono::seconds authorizationTime{2};
 
 QString busyText(const QString &name) {
     return DeviceActions::tr("%1 could not be started: the client is busy, try again.").arg(name);
@@ -98,12 +101,15 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
         [deviceIds, name, password](ServiceSession &session) {
             return DeviceOperations::authorize(session, deviceIds, name, password);
         },
-        [this, title, asked = deviceIds.size()](const DeviceOperations::Authorization &outcome) {
-            emit statesChanged();
+        [this, title, deviceIds](const DeviceOperations::Outcome &outcome) {
             tellVanished(outcome.vanished);
             if (outcome.result != ApiOk)
                 return emit failed(tr("%1 failed: %2.").arg(title, apiResultText(outcome.result)));
-            emit done(authorizationText(outcome.states, static_cast<int>(asked - outcome.vanished.size())));
+            QStringList asked = deviceIds;
+            asked.removeIf([&](const QString &id) { return outcome.vanished.contains(id); });
+            emit done(tr("The credentials are on their way to %n device(s).", nullptr,
+                         static_cast<int>(asked.size())));
+            tellAuthorized(asked);
         },
         [this, title](JobEnd end) {
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
@@ -111,6 +117,19 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
         });
     if (!started)
         emit failed(busyText(title));
+}
+
+/// The devices need a moment to look at the credentials.
+void DeviceActions::tellAuthorized(const QStringList &deviceIds) {
+    ServiceRequest::post(
+        NetJob::createRunner("reading the states after an authorization", NetTask::Turn::Beside), this,
+        [deviceIds](ServiceSession &session) { return DeviceOperations::readStates(session, deviceIds); },
+        [this, asked = static_cast<int>(deviceIds.size())](const std::map<DeviceStatusCode, int> &states) {
+            emit statesChanged();
+            if (!states.empty())
+                emit done(authorizationText(states, asked));
+        },
+        {}, [] { std::this_thread::sleep_for(authorizationTime); });
 }
 
 void DeviceActions::deleteDevices(const std::vector<DeviceRecordPtr> &devices) {

@@ -70,5 +70,6 @@ private:
     void start(const Errand &errand);
     void start(const Errand &errand, NetTask *runner, const std::function<void()> &begun);
     void remember(const QString &tid, const Errand &errand);
+    void tellAuthorized(const QStringList &deviceIds);
     void tellVanished(const QStringList &deviceIds);
 };

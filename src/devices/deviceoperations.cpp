@@ -61,8 +61,8 @@ QStringList takeVanished(ServiceSession &session, QStringList &deviceIds) {
 /// Does something for devices, and once more for the rest when the service refuses because some of them are
 /// gone meanwhile: nobody wants a thousand devices left alone for one that was removed.
 template <typename Attempt>
-auto withoutVanished(ServiceSession &session, QStringList &deviceIds, Attempt attempt) {
-    auto outcome = attempt();
+Outcome withoutVanished(ServiceSession &session, QStringList &deviceIds, Attempt attempt) {
+    Outcome outcome = attempt();
     if (outcome.result != ApiServerError)
         return outcome;
     const QStringList vanished = takeVanished(session, deviceIds);
@@ -111,21 +111,6 @@ QByteArray formatted(const char *format, Values... values) {
     std::array<char, commandSize> buffer{};
     std::snprintf(buffer.data(), buffer.size(), format, values...);
     return buffer.data();
-}
-
-std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStringList &deviceIds) {
-    const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
-    std::map<DeviceStatusCode, int> states;
-    const unsigned result =
-        PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](const JSON &page) {
-            for (const JSON &status : page) {
-                if (wanted.contains(stringMember(status, "id")))
-                    ++states[DeviceStatus::codeOf(textMember(status, "connect_status"),
-                                                  textMember(status, "auth_status"),
-                                                  textMember(status, "action_status"))];
-            }
-        });
-    return result == ApiOk ? states : std::map<DeviceStatusCode, int>();
 }
 
 } // namespace
@@ -177,23 +162,36 @@ Outcome setPasswordPolicy(ServiceSession &session, const QStringList &deviceIds,
     return outcome;
 }
 
-Authorization authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
-                        const QString &password) {
+Outcome authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
+                  const QString &password) {
     qDebug("authorize device: device id count[%d], dump[%s], name[%s], password[%s]", countOf(deviceIds),
            dumpOf(deviceIds).constData(), qUtf8Printable(name), MessageLog::secret(password).constData());
     QStringList ids = deviceIds;
-    Authorization outcome = withoutVanished(session, ids, [&] {
-        return Authorization{session.call([&](CApiClient &client) {
-                                 return client.authDevices(idsOf(ids), name.toUtf8().constData(),
-                                                           password.toUtf8().constData());
-                             }),
-                             {},
-                             {}};
+    const Outcome outcome = withoutVanished(session, ids, [&] {
+        return Outcome{session.call([&](CApiClient &client) {
+                           return client.authDevices(idsOf(ids), name.toUtf8().constData(),
+                                                     password.toUtf8().constData());
+                       }),
+                       {},
+                       {}};
     });
     qDebug(outcome.result == ApiOk ? "http api(authDevices) successfully!" : "http api(authDevices) failed!");
-    if (outcome.result == ApiOk)
-        outcome.states = readStates(session, ids);
     return outcome;
+}
+
+std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStringList &deviceIds) {
+    const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
+    std::map<DeviceStatusCode, int> states;
+    const unsigned result =
+        PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](const JSON &page) {
+            for (const JSON &status : page) {
+                if (wanted.contains(stringMember(status, "id")))
+                    ++states[DeviceStatus::codeOf(textMember(status, "connect_status"),
+                                                  textMember(status, "auth_status"),
+                                                  textMember(status, "action_status"))];
+            }
+        });
+    return result == ApiOk ? states : std::map<DeviceStatusCode, int>();
 }
 
 } // namespace DeviceOperations

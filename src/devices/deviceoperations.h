@@ -45,16 +45,13 @@ Outcome changePassword(ServiceSession &session, const QStringList &deviceIds, co
 Outcome setPasswordPolicy(ServiceSession &session, const QStringList &deviceIds,
                           const PasswordPolicy &policy);
 
-/// What came of giving the service the credentials of devices.
-struct Authorization {
-    unsigned result = ApiOk;
-    QStringList vanished;
-    std::map<DeviceStatusCode, int> states; ///< of the devices right after it; empty where not readable
-};
+/// Gives the service the credentials for the devices. There is no task for it; what the devices say to the
+/// credentials shows in their states, some time later.
+Outcome authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
+                  const QString &password);
 
-/// Gives the service the credentials for the devices. There is no task for it.
-Authorization authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
-                        const QString &password);
+/// How many of the devices are in which state; nothing where it could not be read.
+std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStringList &deviceIds);
 
 /// The command that changes an account's password, cut to what a device takes.
 QByteArray passwordCommand(const QString &name, const QString &password);
