@@ -1,9 +1,6 @@
 #include "address_book.h"
 
 #include "model.h"
-#include "random.h"
-
-#include <functional>
 
 namespace emulator {
 
@@ -42,11 +39,10 @@ std::string AddressBook::lease(const Device &device) {
     if (!present || isLeased(device, *present)) {
         return device.ip;
     }
-    const auto first = static_cast<std::uint32_t>(mixed(std::hash<std::string>()(device.id)) % leases);
-    for (std::uint32_t i = 0; i < leases; ++i) {
-        const std::uint32_t address = leasedAddress(*present, (first + i) % leases);
-        if (!m_holders.contains(address)) {
-            m_holders[address] = device.id;
+    // What is passed over once stays taken; a whole fleet asks at a time.
+    for (std::uint32_t &next = m_next[*present & networkMask]; next < leases; ++next) {
+        const std::uint32_t address = leasedAddress(*present, next);
+        if (m_holders.try_emplace(address, device.id).second) {
             return addressText(address);
         }
     }

@@ -32,6 +32,7 @@ private:
     const Model &m_model;
     bool m_isRead = false;
     std::unordered_map<std::uint32_t, std::string> m_holders;
+    std::unordered_map<std::uint32_t, std::uint32_t> m_next; ///< the lease to try next, by network
 };
 
 } // namespace emulator

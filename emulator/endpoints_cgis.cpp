@@ -109,11 +109,13 @@ Json runCommands(Service &service, const Call &call) {
         startUnderTasks(model, targets, {},
                         [&](const Device &device) { return series.workFor(device, addresses); });
         Json answers = Json::array();
+        Transaction transaction(model.store.database());
         for (const Target &target : targets) {
             answers.push_back(target.taskId.empty()
                                   ? answerAtOnce(model, model.devices.get(target.id), series, addresses)
                                   : Json{{"id", target.id}, {"status", 0}, {"body", ""}});
         }
+        transaction.commit();
         return answers;
     });
 }

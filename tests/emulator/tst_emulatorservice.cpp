@@ -191,10 +191,12 @@ void EmulatorServiceTest::permission_data() {
     QTest::addColumn<QString>("path");
     QTest::addColumn<bool>("writes");
     for (const char *path :
-         {"/v1/config/set", "/v1/site/new", "/v1/site/update", "/v1/site/rms", "/v1/site/commit",
-          "/v1/dev/commit", "/v1/dev/scan", "/v1/dev/scanip", "/v1/dev/scanips", "/v1/dev/setpolicy",
-          "/v1/dev/auth", "/v1/task/init", "/v1/task/rm", "/v1/task/updateState", "/v1/alarm/rm",
-          "/v1/cgi/commit", "/v1/cgi/custom", "/v1/cgi/customx"}) {
+         {"/v1/config/set",  "/v1/site/new",         "/v1/site/update",  "/v1/site/rms",
+          "/v1/site/commit", "/v1/dev/commit",       "/v1/dev/scan",     "/v1/dev/scanip",
+          "/v1/dev/scanips", "/v1/dev/setpolicy",    "/v1/dev/auth",     "/v1/task/init",
+          "/v1/task/rm",     "/v1/task/updateState", "/v1/alarm/rm",     "/v1/cgi/commit",
+          "/v1/cgi/custom",  "/v1/cgi/customx",      "/v1/assip/auto",   "/v1/assip/manual",
+          "/v1/quicksetup",  "/v1/config/config",    "/v1/export/debif", "/v1/gencert"}) {
         QTest::newRow(path) << path << true;
     }
     for (const char *path : {"/v1/config/get", "/v1/site/list", "/v1/dev/list", "/v1/dev/scanout",
