@@ -84,8 +84,8 @@ and five wrong passwords block the account for a minute. A device in "Set Passwo
 anything else. Each device has the accounts "root" and "admin"; a new password of "root" shuts the service out.
 
 Tasks run on 20 devices at a time; devices that have not let the service in fail. A device that is ordered to
-restart or restore, or gets firmware, is away for three steps, which raises no alarm. The network is 255.255.0.0; its DHCP server
-gives addresses from x.y.192.1 on.
+restart or restore, or gets a configuration or firmware, is away for three steps, which raises no alarm. The
+network is 255.255.0.0; its DHCP server gives addresses from x.y.192.1 on.
 
 Uploads are hashed while they arrive and not kept. A firmware image may begin with the line
   NVLFW1 MODEL[,MODEL...] VERSION

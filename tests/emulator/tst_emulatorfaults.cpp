@@ -195,9 +195,10 @@ void EmulatorFaultsTest::limits() {
 
 void EmulatorFaultsTest::badSpec_data() {
     QTest::addColumn<QString>("spec");
-    for (const char *spec : {"nonsense", "", "late", "late=", "late=soon", "late=-1", "status=99", "status",
-                             "reset=1", "wrong-types=colour", "code=1@v1", "code=1,often=2", "code=1,times=x",
-                             "code=1,rate=2", "code=1,rate=-0.5", "code=1,rate=nan"}) {
+    for (const char *spec :
+         {"nonsense", "", "late", "late=", "late=soon", "late=-1", "status=99", "status", "early=99",
+          "cut-body", "slow-body=fast", "reset=1", "wrong-types=colour", "code=1@v1", "code=1,often=2",
+          "code=1,times=x", "code=1,rate=2", "code=1,rate=-0.5", "code=1,rate=nan"}) {
         QTest::newRow(spec) << spec;
     }
 }

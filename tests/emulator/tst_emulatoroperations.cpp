@@ -255,6 +255,7 @@ private slots:
         COMPARE_JSON(record(0).at("d_audio"), "mute");
         COMPARE_JSON(record(0).at("d_fw"), m_devices[0].at("d_fw"));
         QVERIFY(apply("System: [") == 3 && apply("just a text") == 3 && apply("Network: {http: 70000}") == 3);
+        QCOMPARE(apply(std::string(100000, '[').c_str()), 3);
         setStatus(0, "-", "Unreachable");
         QCOMPARE(code("/v1/config/query", device), 111);
         QCOMPARE(code("/v1/config/query", {{"deviceid", "DV404"}}), 4);
