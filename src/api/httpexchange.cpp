@@ -167,7 +167,8 @@ private:
         if (m_sender && m_sender->refusal() != 0)
             return arrived(m_sender->refusal());
         if (!result || !m_receiver.isWhole())
-            return failed(m_request, m_deadline.isOver(), httplib::to_string(result.error()));
+            return failed(m_request, m_deadline.isOver(),
+                          result ? "No length" : httplib::to_string(result.error()));
         m_answer.authorization = result->get_header_value("Authorization");
         return arrived(result->status);
     }
