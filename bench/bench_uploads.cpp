@@ -68,7 +68,7 @@ Figures run(const QString &program, const QStringList &arguments, const QByteArr
     const qint64 id = process.waitForStarted() ? process.processId() : 0;
     while (process.state() != QProcess::NotRunning && !process.waitForFinished(2))
         figures.peakMegabytes = std::max(figures.peakMegabytes, peakOf(id));
-    figures.megabytesPerSecond = mebibytes * 1.048576e9 / static_cast<double>(timer.nsecsElapsed()) * 1e3;
+    figures.megabytesPerSecond = mebibytes * 1.048576 / (static_cast<double>(timer.nsecsElapsed()) / 1e9);
     const QByteArray output = process.readAllStandardOutput();
     if (!output.contains(success))
         qFatal("%s has not uploaded: %s", qPrintable(program), output.constData());

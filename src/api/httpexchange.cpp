@@ -14,6 +14,7 @@ namespace {
 
 constexpr std::size_t bodyLimit = 64u << 20;
 constexpr int tooLarge = 413;
+constexpr std::chrono::seconds transportGrace{5};
 constexpr const char *clientCertificate = "./client.cer";
 constexpr const char *clientKey = "./client.key";
 
@@ -51,9 +52,10 @@ void configure(httplib::SSLClient &client, const HttpRequest &request, RequestDe
     if (own)
         client.set_read_timeout(request.waitTimeout);
     if (request.transfer) {
-        // A service may need a while to store what it gets; the deadline sees to it that it ends.
-        client.set_read_timeout(request.totalTimeout);
-        client.set_write_timeout(request.totalTimeout);
+        // A service may need a while to store what it gets; it is the deadline that ends a standstill.
+        client.set_connection_timeout(request.totalTimeout + transportGrace);
+        client.set_read_timeout(request.totalTimeout + transportGrace);
+        client.set_write_timeout(request.totalTimeout + transportGrace);
     }
 }
 
