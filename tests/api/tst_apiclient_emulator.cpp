@@ -1,4 +1,5 @@
 #include "apiclient.h"
+#include "clientstore.h"
 #include "configstore.h"
 #include "emulatorprocess.h"
 #include "isolatedroot.h"
@@ -60,6 +61,7 @@ private slots:
     void sites();
     void commitOfDevices();
     void discoveryAndAuthorization();
+    void uploads();
     void settings();
     void renewedTokenIsGood();
     void faults_data();
@@ -206,6 +208,28 @@ void TestApiClientEmulator::discoveryAndAuthorization() {
     QCOMPARE(client()->authDevices(ids, "root", "Passw0rd!"), unsigned(ApiOk));
     QCOMPARE(client()->authDevices(JSON::array({"DVffffffffffff"}), "root", "Passw0rd!"),
              unsigned(ApiServerError));
+}
+
+void TestApiClientEmulator::uploads() {
+    QVERIFY(m_root.write("a.bin", QByteArray(3u << 20, 'x')));
+    const QByteArray path = m_root.filePath("a.bin").toUtf8();
+    const JSON one = JSON::array({devices()[0].at("id")});
+    const auto taskOf = [&](const char *type) {
+        JSON task;
+        return client()->newTaskState(type, one, task) == ApiOk ? task.value("tid", "") : std::string();
+    };
+    const std::string config = taskOf("deviceConfigFileUpload");
+    QCOMPARE(client()->uploadConfigFile(config.c_str(), path, "a.bin", one), unsigned(ApiOk));
+    QCOMPARE(client()->uploadConfigFile(config.c_str(), path, "a.bin", one), unsigned(ApiServerError));
+    QCOMPARE(client()->uploadPackage(taskOf("devicePackageUpload").c_str(), path, "a.bin", one, false),
+             unsigned(ApiOk));
+    for (const bool isHere : {false, true}) {
+        QVERIFY(CClientStore::instance().setThisComputer(isHere));
+        QCOMPARE(client()->uploadFWFile(taskOf("deviceFWUpgrade").c_str(), path, "a.bin"), unsigned(ApiOk));
+    }
+    QCOMPARE(client()->exportFile(config.c_str(), m_root.filePath("a.zip").toUtf8()),
+             unsigned(ApiServerError));
+    QVERIFY(!QFile::exists(m_root.filePath("a.zip")));
 }
 
 void TestApiClientEmulator::settings() {
