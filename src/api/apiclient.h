@@ -8,6 +8,7 @@
 #include <string>
 
 struct HttpAnswer;
+struct OrbServiceStatus;
 
 /// One request to the device manager service.
 ///
@@ -107,6 +108,21 @@ public:
     /// Sends those members of the object that are settings of the service, nothing else.
     virtual unsigned saveServerSettings(const JSON &settings);
 
+    // Remote access; what is signed in to, listed and added lives with the service, not with this client
+
+    virtual unsigned addService(const char *szOrgId, const char *szSiteId);
+    /// szPassword: plain; ciphered on its way. ApiCode105: wrong e-mail or password, or no session here;
+    /// ApiCode108: the password has expired; ApiServerError: unknown user.
+    virtual unsigned authenticateWithOrb(const char *szEmail, const char *szPassword);
+    /// organizations: array of objects with "organizationID", "organizationName", "enableRemoteAccess" and
+    /// "sites", an array of objects with "id" and "name".
+    virtual unsigned browseOrbOrgs(JSON &organizations);
+    virtual unsigned disconnectOrbService();
+    virtual unsigned getOrbServiceCachedStatus(OrbServiceStatus &status);
+    virtual unsigned isOrbServiceAdded(bool &bAdded);
+    /// bState: what holds from now on.
+    virtual unsigned toggleRemoteAccess(bool bEnable, bool &bState);
+
 protected:
     enum class Payload { None, Plain, Ciphered };
 
@@ -133,6 +149,7 @@ protected:
     static bool isEmpty(const char *szText) { return !szText || !*szText; }
 
 private:
+    unsigned postAboutOrb(const char *method, const char *path, JSON body, JSON *cipheredData = nullptr);
     unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
     static void logException(const Call &call, const std::string &error);
     void renewToken(const Call &call, const std::string &token);
