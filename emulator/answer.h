@@ -13,7 +13,8 @@ enum class Code {
     NotAccepted = 105,
     WrongOldPassword = 106,
     EmailTaken = 107,
-    NoMoreSessions = 108,
+    NoMoreSessions = 108, ///< of the remote-access login: the password has expired
+    UnknownRemoteUser = 110,
 };
 
 /// Thrown wherever a request is found wanting; becomes the answer's code.

@@ -16,6 +16,7 @@ enum class Gate {
     Anybody, ///< with a generic token
     Reader,  ///< any session
     Writer,  ///< a session whose account may change things
+    Administrator,
 };
 
 /// A request that has passed its gate.
@@ -43,5 +44,6 @@ Endpoints taskEndpoints();
 Endpoints alarmEndpoints();
 Endpoints logEndpoints();
 Endpoints commandEndpoints();
+Endpoints orbEndpoints();
 
 } // namespace emulator
