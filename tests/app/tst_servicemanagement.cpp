@@ -1,0 +1,446 @@
+#include "clientstore.h"
+#include "confirmdialog.h"
+#include "emulatorprocess.h"
+#include "form.h"
+#include "isolatedroot.h"
+#include "localstore.h"
+#include "nettask.h"
+#include "servicemanagement.h"
+#include "servicemanagementaddservicedialog.h"
+#include "servicemanagementstatusdialog.h"
+#include "servicesession.h"
+#include "sessionevents.h"
+#include "toggleswitch.h"
+#include "transientmessage.h"
+
+#include <QComboBox>
+#include <QDesktopServices>
+#include <QLabel>
+#include <QSignalSpy>
+#include <QTextDocumentFragment>
+
+#include <memory>
+
+using AddDialog = ServiceManagementAddServiceDialog;
+using StatusDialog = ServiceManagementStatusDialog;
+
+namespace {
+
+constexpr int patienceMs = 20000;
+const QString password = QStringLiteral("Passw0rd!");
+const QString partner = QStringLiteral("partner@norvell.example");
+const QString partnerPassword = QStringLiteral("Partner-1");
+const QString unable =
+    QStringLiteral("Unable to connect to this service. Check connection information, then retry.");
+const QString unknown = QStringLiteral(
+    "Oops! An unknown error happened. Try again or contact Norvell technical support for further "
+    "assistance.");
+const QString expired =
+    QStringLiteral("Session expired. Click 'Back' to go to the previous step and try again.");
+const QString noPlace =
+    QStringLiteral("No organization or site exist. Create an organization first or site.");
+const QString noAccess = QStringLiteral("One or more customers do not have remote access permission.");
+
+/// What a label shows, without its markup.
+QString shown(const QWidget *form, const char *name) {
+    return QTextDocumentFragment::fromHtml(Form::text(form, name)).toPlainText();
+}
+
+} // namespace
+
+/// Takes the place of the user's browser.
+class Browser : public QObject {
+    Q_OBJECT
+
+public:
+    Browser() { QDesktopServices::setUrlHandler("https", this, "open"); }
+    ~Browser() override { QDesktopServices::unsetUrlHandler("https"); }
+    QList<QUrl> opened;
+
+public slots:
+    void open(const QUrl &url) { opened << url; }
+};
+
+class TestServiceManagement : public QObject {
+    Q_OBJECT
+
+private slots:
+    void initTestCase() {
+        QVERIFY(m_service.start(
+            {"--account", "boss@x:" + password, "--account", "op@x:" + password + ":operator"}));
+        CClientStore::instance().setThisComputer(true);
+    }
+
+    void init() {
+        m_service.command("faults clear");
+        m_service.command("orb disconnect");
+        QCOMPARE(m_service.command("orb orgs usual"), QStringLiteral("ok"));
+        logIn("boss@x");
+        m_frame = std::make_unique<QWidget>();
+        m_frame->resize(900, 600);
+        m_management = new ServiceManagement(m_frame.get());
+        m_frame->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_frame.get()));
+    }
+
+    void cleanup() {
+        m_frame.reset();
+        CLocalStore::instance().clearLoginInfo();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+    }
+
+    void fromTheFirstStepToTheLinkAndBack() {
+        QSignalSpy asked(m_management, &ServiceManagement::connectToOrbMessage);
+        QSignalSpy answered(m_management, &ServiceManagement::connectToOrbFinished);
+        QSignalSpy added(m_management, &ServiceManagement::serviceAdded);
+        m_management->validateOrbServiceAdded();
+        m_management->validateOrbServiceAdded();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<AddDialog>(), patienceMs);
+        QCOMPARE(asked.size(), 1);
+        QCOMPARE(asked[0][0].toString(), QStringLiteral("connecting to ORB..."));
+        QCOMPARE(answered.size(), 1);
+        auto *add = Form::visible<AddDialog>();
+        QCOMPARE(add->windowTitle(), QStringLiteral("Norvell Service Management"));
+
+        // With the keyboard alone.
+        QVERIFY(QTest::qWaitForWindowActive(add));
+        QCOMPARE(add->focusWidget()->objectName(), QStringLiteral("serviceComboBox"));
+        QTest::keyClick(add->focusWidget(), Qt::Key_Down);
+        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
+        QTest::keyClicks(add->focusWidget(), partner);
+        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
+        QTest::keyClicks(add->focusWidget(), partnerPassword);
+        QTest::keyClick(add->focusWidget(), Qt::Key_Return);
+        QTRY_VERIFY_WITH_TIMEOUT(atLocation(add), patienceMs);
+        QCOMPARE(errorOf(add), noAccess);
+        QTRY_COMPARE(add->focusWidget()->objectName(), QStringLiteral("organizationComboBox"));
+        auto *organizations = Form::part<QComboBox>(add, "organizationComboBox");
+        QStringList names;
+        for (int i = 0; i < organizations->count(); ++i)
+            names << organizations->itemText(i);
+        QCOMPARE(names, QStringList({"Alder Retail", "Harbour Logistics", "Riverside Schools"}));
+        QTest::keyClicks(organizations, "har");
+        QCOMPARE(errorOf(add), QString());
+        QVERIFY(!Form::part(add, "applyButton")->isEnabled());
+        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
+        QTest::keyClicks(add->focusWidget(), "ware");
+        QTest::mouseDClick(Form::part(add, "applyButton"), Qt::LeftButton);
+        QCOMPARE(message(add), QStringLiteral("Applying..."));
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<StatusDialog>(), patienceMs);
+        QCOMPARE(message(m_frame.get()), QStringLiteral("Applied successfully"));
+        QVERIFY(!Form::visible<AddDialog>());
+        QVERIFY(m_service.command("orb status").contains("\"connected\":true"));
+
+        auto *status = Form::visible<StatusDialog>();
+        auto *toggle = Form::part<ToggleSwitch>(status, "remoteAccessSwitch");
+        QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
+        QVERIFY(!toggle->isChecked());
+        QCOMPARE(Form::text(status, "linkStateLabel"), QStringLiteral("Connected"));
+        toggle->setFocus();
+        QTest::keyClick(toggle, Qt::Key_Space);
+        QCOMPARE(message(status), QStringLiteral("Set Remote Access..."));
+        QVERIFY(!toggle->isEnabled() && !Form::part(status, "disconnectButton")->isEnabled());
+        QTRY_COMPARE_WITH_TIMEOUT(message(status), QStringLiteral("Set remote access successfully!"),
+                                  patienceMs);
+        QVERIFY(toggle->isChecked() && toggle->isEnabled());
+        QVERIFY(m_service.command("orb status").contains("\"enable\":true"));
+
+        for (const char *answer : {"cancelButton", "acceptButton"}) {
+            Form::click(status, "disconnectButton");
+            QTRY_VERIFY(Form::visible<ConfirmDialog>());
+            QCOMPARE(
+                Form::text(Form::visible<ConfirmDialog>(), "messageLabel"),
+                QStringLiteral("Are you sure you want to disconnect from this service?\n\nDisconnecting will "
+                               "stop the synchronization of all devices managed by this Device Manager. You "
+                               "will need to set up the connection again to restore synchronization."));
+            Form::click(Form::visible<ConfirmDialog>(), answer);
+            QTRY_VERIFY(!Form::visible<ConfirmDialog>());
+        }
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<AddDialog>(), patienceMs);
+        QCOMPARE(message(m_frame.get()), QStringLiteral("Disconnected successfully!"));
+        QVERIFY(m_service.command("orb status").contains("added=0"));
+        QCOMPARE(added.size(), 3);
+        QCOMPARE(added.last()[0].toBool(), false);
+    }
+
+    void signInFails_data() {
+        QTest::addColumn<QString>("fault");
+        QTest::addColumn<QString>("email");
+        QTest::addColumn<QString>("secret");
+        QTest::addColumn<QString>("expected");
+        const QString empty = QStringLiteral("The field can't be empty.");
+        QTest::newRow("no e-mail") << ""
+                                   << ""
+                                   << "x" << empty;
+        QTest::newRow("no password") << "" << partner << "" << empty;
+        QTest::newRow("wrong password")
+            << "" << partner << "wrong"
+            << "Incorrect email or password. Check account information via Norvell Partner Desk.";
+        QTest::newRow("expired password")
+            << ""
+            << "expired@norvell.example" << partnerPassword
+            << "Invalid password: Password reset required or password expired. Check account information via "
+               "Norvell Partner Desk.";
+        QTest::newRow("unknown user") << ""
+                                      << "nobody@x"
+                                      << "x"
+                                      << "User does not exist. Become a Partner via Norvell Partner Desk.";
+        QTest::newRow("no answer") << "fault reset@/v1/orb/login" << partner << partnerPassword << unable;
+        QTest::newRow("no JSON") << "fault not-json@/v1/orb/login" << partner << partnerPassword << unknown;
+        QTest::newRow("status 500") << "fault status=500@/v1/orb/login" << partner << partnerPassword
+                                    << unknown;
+    }
+    void signInFails() {
+        QFETCH(QString, fault);
+        QFETCH(QString, email);
+        QFETCH(QString, secret);
+        QFETCH(QString, expected);
+        AddDialog *add = openAddDialog();
+        if (!fault.isEmpty())
+            QCOMPARE(m_service.command(fault), QStringLiteral("ok"));
+        signIn(add, email, secret);
+        QTRY_COMPARE_WITH_TIMEOUT(errorOf(add), expected, patienceMs);
+        QVERIFY(Form::part(add, "nextButton")->isEnabled() && !atLocation(add));
+        // A link in it can be followed with the keyboard.
+        const Browser browser;
+        auto *error = Form::part<QLabel>(add, "errMsg");
+        const bool linked = error->textFormat() == Qt::RichText;
+        QCOMPARE(linked, expected.contains("Norvell Partner Desk"));
+        QCOMPARE(error->focusPolicy() != Qt::NoFocus, linked);
+        if (linked) {
+            error->setFocus(Qt::TabFocusReason);
+            QTest::keyClick(error, Qt::Key_Return);
+            QCOMPARE(browser.opened.size(), 1);
+        }
+    }
+
+    void locationsThatCannotBeChosen_data() {
+        QTest::addColumn<QString>("command");
+        QTest::addColumn<QString>("organization");
+        QTest::addColumn<QString>("expected");
+        QTest::newRow("none") << "orb orgs 0"
+                              << "" << noPlace;
+        QTest::newRow("no sites") << ""
+                                  << "Alder Retail" << noPlace;
+        QTest::newRow("no remote access") << ""
+                                          << "Riverside Schools" << noAccess;
+        QTest::newRow("the list is not answered") << "fault reset@/v1/orb/orgs"
+                                                  << "" << unable;
+        QTest::newRow("the list is no list") << "fault wrong-types=data@/v1/orb/orgs"
+                                             << "" << unknown;
+        QTest::newRow("the sign-in has ended") << "fault code=105@/v1/orb/orgs"
+                                               << "" << expired;
+    }
+    void locationsThatCannotBeChosen() {
+        QFETCH(QString, command);
+        QFETCH(QString, organization);
+        QFETCH(QString, expected);
+        AddDialog *add = openAddDialog();
+        if (!command.isEmpty())
+            QCOMPARE(m_service.command(command), QStringLiteral("ok"));
+        signIn(add, partner, partnerPassword);
+        QTRY_VERIFY_WITH_TIMEOUT(atLocation(add), patienceMs);
+        if (!organization.isEmpty())
+            Form::part<QComboBox>(add, "organizationComboBox")->setCurrentText(organization);
+        QCOMPARE(errorOf(add), expected);
+        QVERIFY(!Form::part(add, "applyButton")->isEnabled());
+        Form::click(add, "backButton");
+        QVERIFY(!atLocation(add));
+        QCOMPARE(errorOf(add), QString());
+        QCOMPARE(Form::text(add, "passwordInput"), partnerPassword);
+    }
+
+    void applyFails_data() {
+        QTest::addColumn<QString>("command");
+        QTest::addColumn<QString>("error");
+        QTest::addColumn<QString>("transient");
+        QTest::newRow("sign-in ended") << "orb expire" << expired << "";
+        QTest::newRow("no answer") << "fault reset@/v1/orb/add_service" << unable << "";
+        QTest::newRow("refused") << "fault code=4@/v1/orb/add_service"
+                                 << "" << unknown;
+    }
+    void applyFails() {
+        QFETCH(QString, command);
+        QFETCH(QString, error);
+        QFETCH(QString, transient);
+        AddDialog *add = openAddDialog();
+        signIn(add, partner, partnerPassword);
+        QTRY_VERIFY_WITH_TIMEOUT(atLocation(add), patienceMs);
+        QCOMPARE(m_service.command(command), QStringLiteral("ok"));
+        Form::part<QComboBox>(add, "organizationComboBox")->setCurrentIndex(1);
+        Form::part<QComboBox>(add, "siteComboBox")->setCurrentIndex(0);
+        Form::click(add, "applyButton");
+        QTRY_VERIFY_WITH_TIMEOUT(Form::part(add, "applyButton")->isEnabled(), patienceMs);
+        QCOMPARE(errorOf(add), error);
+        QCOMPARE(message(add), transient);
+        QVERIFY(add->isVisible());
+    }
+
+    void statusDialogTellsFailures_data() {
+        QTest::addColumn<QString>("command");
+        QTest::addColumn<bool>("disconnect");
+        QTest::addColumn<QString>("error");
+        QTest::addColumn<QString>("transient");
+        const QString failed = QStringLiteral("Failed to set remote access.");
+        QTest::newRow("switch refused") << "fault code=5@/v1/orb/remote_access" << false << "" << failed;
+        QTest::newRow("switch unanswered") << "fault reset@/v1/orb/remote_access" << false << unable << "";
+        QTest::newRow("switch, no data") << "fault no-data@/v1/orb/remote_access" << false << unknown << "";
+        QTest::newRow("disconnection refused") << "orb disconnect" << true << unknown << "";
+        QTest::newRow("disconnection unanswered")
+            << "fault reset@/v1/orb/logout_service" << true << unable << "";
+    }
+    void statusDialogTellsFailures() {
+        QFETCH(QString, command);
+        QFETCH(bool, disconnect);
+        QFETCH(QString, error);
+        QFETCH(QString, transient);
+        StatusDialog *status = openStatusDialog();
+        auto *toggle = Form::part<ToggleSwitch>(status, "remoteAccessSwitch");
+        QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
+        QSignalSpy changed(status, &StatusDialog::statusChanged);
+        QCOMPARE(m_service.command(command), QStringLiteral("ok"));
+        if (disconnect) {
+            Form::click(status, "disconnectButton");
+            QTRY_VERIFY(Form::visible<ConfirmDialog>());
+            QTest::keyClick(Form::visible<ConfirmDialog>(), Qt::Key_Return);
+            QCOMPARE(message(status), QStringLiteral("Disconnecting..."));
+        } else {
+            QTest::mouseClick(toggle, Qt::LeftButton);
+        }
+        QVERIFY(!toggle->isEnabled());
+        QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
+        QVERIFY(!toggle->isChecked());
+        QCOMPARE(shown(status, "errorMessage"), error);
+        QCOMPARE(message(status), transient);
+        QCOMPARE(changed.size(), 0);
+        QVERIFY(status->isVisible());
+    }
+
+    void statusThatIsNotKnown_data() {
+        QTest::addColumn<QString>("command");
+        QTest::addColumn<QString>("state");
+        QTest::addColumn<QString>("error");
+        QTest::newRow("no answer") << "fault reset@/v1/orb/cache/status"
+                                   << "The status is not known." << unable;
+        QTest::newRow("bad cipher") << "fault bad-cipher@/v1/orb/cache/status"
+                                    << "The status is not known." << unknown;
+        QTest::newRow("interrupted") << "orb connected off"
+                                     << "Not connected at the moment"
+                                     << "";
+    }
+    void statusThatIsNotKnown() {
+        QFETCH(QString, command);
+        QFETCH(QString, state);
+        QFETCH(QString, error);
+        link();
+        QCOMPARE(m_service.command(command), QStringLiteral("ok"));
+        StatusDialog *status = openStatusDialog();
+        QTRY_COMPARE_WITH_TIMEOUT(Form::text(status, "linkStateLabel"), state, patienceMs);
+        QCOMPARE(shown(status, "errorMessage"), error);
+        QCOMPARE(Form::part(status, "remoteAccessSwitch")->isEnabled(), error.isEmpty());
+        QVERIFY(Form::part(status, "disconnectButton")->isEnabled());
+    }
+
+    void permissionDecidesWhatIsOffered() {
+        link();
+        logIn("op@x");
+        StatusDialog *status = openStatusDialog();
+        QTRY_COMPARE_WITH_TIMEOUT(shown(status, "errorMessage"),
+                                  QStringLiteral("Only an administrator can change this."), patienceMs);
+        QVERIFY(!Form::part(status, "remoteAccessSwitch")->isEnabled());
+        QVERIFY(!Form::part(status, "disconnectButton")->isEnabled());
+        QTest::keyClick(status, Qt::Key_Escape);
+        QCOMPARE(m_service.command("orb disconnect"), QStringLiteral("ok"));
+        m_management->validateOrbServiceAdded();
+        QTRY_COMPARE_WITH_TIMEOUT(message(m_frame.get()),
+                                  QStringLiteral("Only an administrator can connect the service."),
+                                  patienceMs);
+        QVERIFY(!Form::visible<AddDialog>() && !Form::visible<StatusDialog>());
+    }
+
+    void closingWhileARequestRuns() {
+        AddDialog *add = openAddDialog();
+        QCOMPARE(m_service.command("fault late=500@/v1/orb/login,times=1"), QStringLiteral("ok"));
+        signIn(add, partner, partnerPassword);
+        QTest::keyClick(add, Qt::Key_Escape);
+        QTRY_VERIFY(!m_frame->findChild<AddDialog *>());
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        openAddDialog();
+    }
+
+    void unansweredQuestionEndsOnce() {
+        QSignalSpy answered(m_management, &ServiceManagement::connectToOrbFinished);
+        QCOMPARE(m_service.command("fault reset@/v1/orb/cache,times=1"), QStringLiteral("ok"));
+        m_management->validateOrbServiceAdded();
+        QTRY_COMPARE_WITH_TIMEOUT(message(m_frame.get()), unable, patienceMs);
+        QCOMPARE(answered.size(), 1);
+        // The session may end as well; then there is nothing to be told.
+        QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
+        QCOMPARE(m_service.command("expire-sessions"), QStringLiteral("ok"));
+        m_management->validateOrbServiceAdded();
+        QTRY_COMPARE_WITH_TIMEOUT(answered.size(), 2, patienceMs);
+        QCOMPARE(lost.size(), 1);
+        QVERIFY(!Form::visible<AddDialog>());
+    }
+
+private:
+    void logIn(const char *account) {
+        CApiClient client("127.0.0.1", m_service.port());
+        QCOMPARE(client.loginServer(account, qPrintable(password)), unsigned(ApiOk));
+        CLocalStore &store = CLocalStore::instance();
+        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access());
+    }
+
+    /// Links the service as its dialog would.
+    void link() {
+        ServiceSession session(CLocalStore::instance().loginInfo());
+        const auto call = [&](auto endpoint) { QCOMPARE(session.call(endpoint), unsigned(ApiOk)); };
+        call([](CApiClient &c) {
+            return c.authenticateWithOrb(qPrintable(partner), qPrintable(partnerPassword));
+        });
+        call([](CApiClient &c) { return c.addService("ORG1", "ORG1-S1"); });
+    }
+
+    template <typename Dialog>
+    Dialog *openDialog() {
+        m_management->validateOrbServiceAdded();
+        (void)QTest::qWaitFor([] { return Form::visible<Dialog>() != nullptr; }, patienceMs);
+        auto *dialog = Form::visible<Dialog>();
+        if (!dialog || !QTest::qWaitForWindowActive(dialog))
+            qFatal("the dialog did not come");
+        return dialog;
+    }
+    AddDialog *openAddDialog() { return openDialog<AddDialog>(); }
+    StatusDialog *openStatusDialog() {
+        if (m_service.command("orb status").contains("added=0"))
+            link();
+        return openDialog<StatusDialog>();
+    }
+
+    static void signIn(AddDialog *add, const QString &email, const QString &secret) {
+        Form::part<QComboBox>(add, "serviceComboBox")->setCurrentIndex(0);
+        Form::type(add, "emailInput", email);
+        Form::type(add, "passwordInput", secret);
+        Form::click(add, "nextButton");
+    }
+
+    static bool atLocation(const AddDialog *add) { return Form::part(add, "locationPage")->isVisible(); }
+    static QString errorOf(const AddDialog *add) { return shown(add, "errMsg"); }
+    static QString message(const QWidget *window) {
+        for (const auto *message : window->findChildren<TransientMessage *>()) {
+            if (message->isVisible())
+                return message->text();
+        }
+        return {};
+    }
+
+    IsolatedRoot m_root;
+    EmulatorProcess m_service{m_root.path()};
+    std::unique_ptr<QWidget> m_frame;
+    ServiceManagement *m_management = nullptr;
+};
+
+QTEST_MAIN(TestServiceManagement)
+#include "tst_servicemanagement.moc"
