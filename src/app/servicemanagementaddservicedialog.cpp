@@ -10,6 +10,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <algorithm>
+
 struct ServiceManagementAddServiceDialog::SignIn {
     unsigned result = ApiException;
     unsigned listed = ApiException;
@@ -23,11 +25,11 @@ void addChoice(QComboBox *combo, const QString &name) {
     combo->setItemData(combo->count() - 1, PlainText::toolTip(name), Qt::ToolTipRole);
 }
 
-/// The style sheet shows the step that is current apart from the other.
-void markStep(QLabel *label, bool current) {
-    label->setProperty("current", current);
-    label->style()->unpolish(label);
-    label->style()->polish(label);
+/// Sets a property that the style sheet asks for.
+void mark(QWidget *widget, const char *property, bool on) {
+    widget->setProperty(property, on);
+    widget->style()->unpolish(widget);
+    widget->style()->polish(widget);
 }
 
 } // namespace
@@ -56,6 +58,11 @@ void ServiceManagementAddServiceDialog::connectParts() {
     connect(m_ui->nextButton, &QPushButton::clicked, this, &ServiceManagementAddServiceDialog::onNext);
     connect(m_ui->backButton, &QPushButton::clicked, this, [this] { showStep(Step::Service); });
     connect(m_ui->applyButton, &QPushButton::clicked, this, &ServiceManagementAddServiceDialog::onApply);
+    for (QComboBox *combo : {m_ui->serviceComboBox, m_ui->organizationComboBox, m_ui->siteComboBox}) {
+        mark(combo, "unchosen", true);
+        connect(combo, &QComboBox::currentIndexChanged, this,
+                [combo](int index) { mark(combo, "unchosen", index < 0); });
+    }
     connect(m_ui->organizationComboBox, &QComboBox::currentIndexChanged, this,
             &ServiceManagementAddServiceDialog::offerSites);
     connect(m_ui->siteComboBox, &QComboBox::currentIndexChanged, this,
@@ -66,8 +73,8 @@ void ServiceManagementAddServiceDialog::showStep(Step step) {
     const bool first = step == Step::Service;
     m_error.setText({});
     m_ui->stepStack->setCurrentWidget(first ? m_ui->servicePage : m_ui->locationPage);
-    markStep(m_ui->stepOneLabel, first);
-    markStep(m_ui->stepTwoLabel, !first);
+    mark(m_ui->stepOneLabel, "current", first);
+    mark(m_ui->stepTwoLabel, "current", !first);
     m_ui->backButton->setVisible(!first);
     m_ui->applyButton->setVisible(!first);
     m_ui->nextButton->setVisible(first);
@@ -134,7 +141,6 @@ void ServiceManagementAddServiceDialog::onSignedIn(const SignIn &outcome) {
 
 void ServiceManagementAddServiceDialog::offerOrganizations(std::vector<OrbOrganization> organizations) {
     m_organizations = std::move(organizations);
-    const QSignalBlocker blocker(m_ui->organizationComboBox);
     m_ui->organizationComboBox->clear();
     for (const OrbOrganization &organization : m_organizations)
         addChoice(m_ui->organizationComboBox, organization.name);

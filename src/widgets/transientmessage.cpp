@@ -12,7 +12,7 @@ namespace {
 
 constexpr int shownMs = 4000;
 constexpr int errorShownMs = 10000;
-constexpr int bottomDistance = 56;
+constexpr int bottomDistance = 72;
 constexpr int sideDistance = 24;
 constexpr int markSize = 16;
 constexpr int markLeft = 14;

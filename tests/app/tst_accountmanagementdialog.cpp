@@ -72,7 +72,6 @@ private slots:
         QTest::newRow("no confirmation") << QStringList{email, "a", secondPassword, ""} << empty;
         QTest::newRow("mismatch") << QStringList{email, "a", "weak", "Weak"} << "Passwords do not match.";
         QTest::newRow("weak") << QStringList{email, "a", "Passw0rd", "Passw0rd"} << weak;
-        QTest::newRow("other letters") << QStringList{email, "a", "Pässw0rd!", "Pässw0rd!"} << weak;
     }
     void tellsWhatIsWrong() {
         QFETCH(QStringList, fields);
@@ -102,7 +101,8 @@ private slots:
         if (!fault.isEmpty())
             QCOMPARE(m_service.command(fault), QStringLiteral("ok"));
         fill(fields[0], fields[1], fields[2], fields[3]);
-        QTest::mouseDClick(Form::part(m_dialog.get(), "applyButton"), Qt::LeftButton);
+        for (int clicks = 0; clicks < 2; ++clicks)
+            Form::click(m_dialog.get(), "applyButton");
         QTRY_VERIFY_WITH_TIMEOUT(Form::part(m_dialog.get(), "applyButton")->isEnabled(), patienceMs);
         QCOMPARE(Form::text(m_dialog.get(), "msgWarningLabel"), QStringLiteral("Change password failed."));
         QCOMPARE(log.count("account management change password failed!"), 1);

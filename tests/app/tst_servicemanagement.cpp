@@ -125,7 +125,8 @@ private slots:
         QVERIFY(!Form::part(add, "applyButton")->isEnabled());
         QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
         QTest::keyClicks(add->focusWidget(), "ware");
-        QTest::mouseDClick(Form::part(add, "applyButton"), Qt::LeftButton);
+        for (int clicks = 0; clicks < 2; ++clicks)
+            Form::click(add, "applyButton");
         QCOMPARE(message(add), QStringLiteral("Applying..."));
         QTRY_VERIFY_WITH_TIMEOUT(Form::visible<StatusDialog>(), patienceMs);
         QCOMPARE(message(m_frame.get()), QStringLiteral("Applied successfully"));
@@ -345,6 +346,10 @@ private slots:
     void permissionDecidesWhatIsOffered() {
         link();
         logIn("op@x");
+        QSignalSpy added(m_management, &ServiceManagement::serviceAdded);
+        m_management->lookUp();
+        QTRY_COMPARE_WITH_TIMEOUT(added.size(), 1, patienceMs);
+        QVERIFY(added[0][0].toBool());
         StatusDialog *status = openStatusDialog();
         QTRY_COMPARE_WITH_TIMEOUT(shown(status, "errorMessage"),
                                   QStringLiteral("Only an administrator can change this."), patienceMs);
