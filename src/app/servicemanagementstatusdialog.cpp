@@ -116,7 +116,7 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
 void ServiceManagementStatusDialog::displayServiceDisconnectDialog(bool) {
     if (m_busy)
         return;
-    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::DisconnectService, this);
+    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::UnlinkService, this);
     confirm->setAttribute(Qt::WA_DeleteOnClose);
     connect(confirm, &QDialog::accepted, this, &ServiceManagementStatusDialog::disconnectService);
     confirm->open();

@@ -68,7 +68,7 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
             ConfirmDialog::tr("Are you sure you want to delete the site? This action will also delete the "
                               "sub-site(s) and the copy of selected device(s) of each site and sub-site."),
             ConfirmDialog::tr("Delete")};
-    case ConfirmDialog::Kind::DisconnectService:
+    case ConfirmDialog::Kind::UnlinkService:
         return {ConfirmDialog::tr("Norvell Service Management"),
                 ConfirmDialog::tr("Are you sure you want to disconnect from this service?") +
                     QStringLiteral("\n\n") +

@@ -14,17 +14,17 @@ class ConfirmDialog : public FramelessDialog {
 
 public:
     enum class Kind {
-        SwitchServer,     ///< ends the present session for one with another server
-        UnfinishedTask,   ///< ends the session while a task is still being requested
-        UnsavedSites,     ///< ends the session with changes of sites that were not sent
-        CancelTask,       ///< ends tasks, as many as the count says
-        RemoveTasks,      ///< takes as many finished tasks off the list
-        DeleteAlarms,     ///< as many as the count says
-        DeleteDevices,    ///< from the service for good
-        RemoveFromSite,   ///< devices, which the overview keeps
-        RestartDevices,   ///< as many as the count says
-        DeleteSite,       ///< with its sub-sites
-        DisconnectService ///< from the remote-access service
+        SwitchServer,   ///< ends the present session for one with another server
+        UnfinishedTask, ///< ends the session while a task is still being requested
+        UnsavedSites,   ///< ends the session with changes of sites that were not sent
+        CancelTask,     ///< ends tasks, as many as the count says
+        RemoveTasks,    ///< takes as many finished tasks off the list
+        DeleteAlarms,   ///< as many as the count says
+        DeleteDevices,  ///< from the service for good
+        RemoveFromSite, ///< devices, which the overview keeps
+        RestartDevices, ///< as many as the count says
+        DeleteSite,     ///< with its sub-sites
+        UnlinkService   ///< from the remote-access service
     };
 
     explicit ConfirmDialog(Kind kind, QWidget *parent = nullptr, int count = 1);
