@@ -68,15 +68,34 @@ void Accounts::add(Account account) {
     m_accounts.push_back(std::move(account));
 }
 
-void Accounts::setPassword(const std::string &email, PasswordHash password) {
+Account &Accounts::get(const std::string &email) {
     for (Account &account : m_accounts) {
         if (sameEmail(account.email, email)) {
-            account.password = std::move(password);
-            m_store.saveAccount(account);
-            return;
+            return account;
         }
     }
     throw Refusal(Code::UnknownId, "no such account");
+}
+
+void Accounts::setPassword(const std::string &email, PasswordHash password) {
+    Account &account = get(email);
+    account.password = std::move(password);
+    m_store.saveAccount(account);
+}
+
+void Accounts::setPermission(const std::string &email, const std::string &permission) {
+    Account &account = get(email);
+    if (!isPermission(permission)) {
+        throw Refusal(Code::Malformed, "unknown permission");
+    }
+    const bool anotherAdministrator =
+        std::any_of(m_accounts.begin(), m_accounts.end(),
+                    [&](const Account &other) { return &other != &account && other.permission == "admin"; });
+    if (permission != "admin" && !anotherAdministrator) {
+        throw Refusal(Code::NotAllowed, "an administrator has to remain");
+    }
+    account.permission = permission;
+    m_store.saveAccount(account);
 }
 
 } // namespace emulator

@@ -26,8 +26,12 @@ public:
     /// e-mail, an unknown permission and a first account that is no administrator.
     void add(Account account);
     void setPassword(const std::string &email, PasswordHash password);
+    /// Throws Refusal for an unknown account or permission, and when no administrator would be left.
+    void setPermission(const std::string &email, const std::string &permission);
 
 private:
+    Account &get(const std::string &email);
+
     Store &m_store;
     std::vector<Account> m_accounts;
 };

@@ -13,7 +13,8 @@ enum class Code {
     NotAccepted = 105,
     WrongOldPassword = 106,
     EmailTaken = 107,
-    NoMoreSessions = 108,
+    NoMoreSessions = 108, ///< of the remote-access login: the password has expired
+    UnknownRemoteUser = 110,
     NoDeviceAnswer = 111, ///< a device is away or does not let the service in
 };
 

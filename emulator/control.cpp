@@ -224,7 +224,7 @@ std::string Control::runOnTasks(const Words &words) {
     if (command == "alarm" && (words.size() == 2 || words.size() == 3)) {
         return alarm(words);
     }
-    throw std::runtime_error("no such command");
+    return runOnAccounts(words);
 }
 
 std::string Control::fault(const std::string &text) {

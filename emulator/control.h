@@ -25,6 +25,7 @@ private:
     std::string run(const Words &words);
     std::string runOnDevices(const Words &words);
     std::string runOnTasks(const Words &words);
+    std::string runOnAccounts(const Words &words);
 
     std::string fault(const std::string &text);
     std::string drop(const std::string &what);
@@ -38,6 +39,7 @@ private:
     std::string task(const Words &words);
     std::string taskRule(const std::string &rule, const std::string &value);
     std::string alarm(const Words &words);
+    std::string orb(const Words &words);
 
     Service &m_service;
     Faults &m_faults;

@@ -42,7 +42,8 @@ Dispatcher::Dispatcher(Service &service) : m_service(service) {
     for (const auto &family :
          {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(), taskEndpoints(),
           alarmEndpoints(), logEndpoints(), commandEndpoints(), operationEndpoints(),
-          configurationEndpoints(), exportEndpoints(), uploadEndpoints(), certificateEndpoints()}) {
+          configurationEndpoints(), exportEndpoints(), uploadEndpoints(), certificateEndpoints(),
+          orbEndpoints()}) {
         for (const Endpoint &endpoint : family) {
             m_endpoints.emplace(endpoint.path, endpoint);
         }
@@ -93,6 +94,9 @@ SessionToken Dispatcher::sessionOf(const Incoming &incoming, const Json &body, G
         }
         if (gate == Gate::Writer && account->permission == "viewer") {
             throw Refusal(Code::NotAllowed, "a viewer changes nothing");
+        }
+        if (gate == Gate::Administrator && account->permission != "admin") {
+            throw Refusal(Code::NotAllowed, "only an administrator may do this");
         }
         return *session;
     });

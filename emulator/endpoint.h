@@ -18,6 +18,7 @@ enum class Gate {
     Anybody, ///< with a generic token
     Reader,  ///< any session
     Writer,  ///< a session whose account may change things
+    Administrator,
 };
 
 /// How the body of a request comes.
@@ -58,5 +59,6 @@ Endpoints configurationEndpoints();
 Endpoints exportEndpoints();
 Endpoints uploadEndpoints();
 Endpoints certificateEndpoints();
+Endpoints orbEndpoints();
 
 } // namespace emulator

@@ -1,3 +1,4 @@
+#include "clock.h"
 #include "credentials.h"
 #include "endpoint.h"
 #include "service.h"
@@ -44,6 +45,7 @@ Answer newAccount(Service &service, const Call &call) {
             // Those sessions belong to the factory account, which is gone.
             model.sessions.closeAll();
         }
+        model.log.add(nowMs(), "System", "Audit", "Account created", account.email);
     });
     return {};
 }
@@ -59,7 +61,10 @@ Answer changePassword(Service &service, const Call &call) {
     if (!old || !passwordMatches(*old, account->password)) {
         throw Refusal(Code::WrongOldPassword, "the old password is wrong");
     }
-    service.withModel([&](Model &model) { model.accounts.setPassword(email, replacement); });
+    service.withModel([&](Model &model) {
+        model.accounts.setPassword(email, replacement);
+        model.log.add(nowMs(), "System", "Audit", "Password changed", account->email);
+    });
     return {};
 }
 

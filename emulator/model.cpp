@@ -26,7 +26,8 @@ Model::Model(const std::filesystem::path &storePath, const ModelLimits &limits)
       log(store),
       alarms(store, log),
       tasks(store),
-      engine(store, tasks, devices, settings, log) {}
+      engine(store, tasks, devices, settings, log),
+      orb(store, limits.orbSignInMs) {}
 
 bool Model::hasFleet() {
     return !store.value(seedKey).empty();

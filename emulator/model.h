@@ -6,6 +6,7 @@
 #include "device_authorization.h"
 #include "device_table.h"
 #include "log_table.h"
+#include "orb.h"
 #include "scans.h"
 #include "sessions.h"
 #include "settings.h"
@@ -21,6 +22,7 @@ struct ModelLimits {
     SessionLimits sessions;
     std::int64_t batchTimeoutMs = 60000;
     std::int64_t blockMs = 60000;
+    std::int64_t orbSignInMs = 600000;
 };
 
 /// Everything that the service knows. Not thread-safe: the service hands it out under its lock.
@@ -47,6 +49,7 @@ struct Model {
     AlarmTable alarms;
     TaskTable tasks;
     TaskEngine engine;
+    Orb orb;
 };
 
 /// Drops sites from the tree and from the devices in one step.

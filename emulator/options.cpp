@@ -40,6 +40,11 @@ Accounts
                         have this account (admin, operator or viewer; admin when left out); repeatable.
                         Without one a new store holds the factory account "admin", password "admin"
   --session-limit N     sessions at a time; a login beyond answers 108; 0 is no limit (0)
+Remote-access service
+  --orb-user EMAIL:PASSWORD[:expired]
+                        a user who can sign in there; repeatable. Without one: partner@norvell.example with
+                        the password "Partner-1", and expired@norvell.example, whose same password is expired
+  --orb-sign-in MS      how long a sign-in there lasts (600000)
 Behaviour
   --latency MS          added to each answer
   --upload-limit BYTES  longest form; one that is longer is answered with 413 (8 GiB)
@@ -77,6 +82,14 @@ Commands on standard input, one a line, each answered by one line "ok ..." or "e
   task-pace MS          task-failures P       as the options
   touch-tasks N         show another progress for the newest N tasks
   alarm DESPID [COUNT]  raise alarms; nothing happens to the devices
+  permission EMAIL PERMISSION      from now on, for the account's open sessions too
+  orb status            the link with the remote-access service
+  orb expire            end the sign-in there          orb disconnect        end the link from there
+  orb orgs N|usual      N organizations, or the three of a new store
+  orb connected on|off             orb remote-access on|off
+
+An account may do what its permission grants: a viewer changes nothing, an operator all but the link with the
+remote-access service, which is the administrators'; anything else answers 5.
 
 Devices that nobody manages yet answer to scans at 10.99.0.10 to 10.99.0.49. A device lets the account "root" in
 with any password of 8 characters or more until one is set, then with that one alone; it denies other accounts,
@@ -133,6 +146,20 @@ StartAccount accountOf(const std::string &text) {
     return account;
 }
 
+OrbUser orbUserOf(const std::string &text) {
+    const auto afterEmail = text.find(':');
+    OrbUser user{text.substr(0, afterEmail),
+                 afterEmail == std::string::npos ? "" : text.substr(afterEmail + 1)};
+    if (const std::string suffix = ":expired"; user.password.ends_with(suffix)) {
+        user.password.erase(user.password.size() - suffix.size());
+        user.expired = true;
+    }
+    if (user.email.empty() || user.password.empty()) {
+        throw UsageError("--orb-user takes EMAIL:PASSWORD[:expired]");
+    }
+    return user;
+}
+
 using Setters = std::map<std::string, std::function<void(const std::string &)>>;
 
 Setters valueSetters(Options &options) {
@@ -160,6 +187,8 @@ Setters valueSetters(Options &options) {
         {"--alarms", numberInto<std::size_t>("--alarms", options.alarms, 5000)},
         {"--log-entries", numberInto<std::size_t>("--log-entries", options.logEntries, 20000)},
         {"--fault", [&](const std::string &text) { options.faults.push_back(text); }},
+        {"--orb-sign-in", numberInto("--orb-sign-in", options.orbSignInMs, longestHold)},
+        {"--orb-user", [&](const std::string &text) { options.orbUsers.push_back(orbUserOf(text)); }},
         {"--account", [&](const std::string &text) { options.accounts.push_back(accountOf(text)); }},
     };
 }

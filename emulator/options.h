@@ -15,6 +15,13 @@ struct StartAccount {
     std::string permission;
 };
 
+/// A user of the remote-access service.
+struct OrbUser {
+    std::string email;
+    std::string password;
+    bool expired = false;
+};
+
 /// What the command line says.
 struct Options {
     std::string host = "127.0.0.1";
@@ -39,6 +46,8 @@ struct Options {
     std::size_t logEntries = 0;
     std::vector<std::string> faults;
     std::vector<StartAccount> accounts;
+    std::vector<OrbUser> orbUsers;
+    std::int64_t orbSignInMs = 600000;
     bool fresh = false;
     bool oddRecords = false;
     bool help = false;

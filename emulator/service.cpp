@@ -13,7 +13,10 @@ namespace emulator {
 namespace {
 
 ModelLimits limitsOf(const Options &options) {
-    return {{options.sessionLimit, options.tokenGraceMs}, options.batchTimeoutMs, options.blockMs};
+    return {{options.sessionLimit, options.tokenGraceMs},
+            options.batchTimeoutMs,
+            options.blockMs,
+            options.orbSignInMs};
 }
 
 using Clock = std::chrono::steady_clock;
@@ -28,6 +31,7 @@ Service::Service(const Options &options, const std::filesystem::path &storePath)
       m_nextTick(Clock::now() + m_tickLength) {
     const bool isNew = prepareFleet(options);
     prepareAccounts(options);
+    prepareOrb(options);
     if (isNew) {
         makeHistory(m_model, {options.tasks, options.taskDevices, options.alarms, options.logEntries});
     }
@@ -95,6 +99,17 @@ void Service::prepareAccounts(const Options &options) {
             m_model.accounts.add(
                 {wanted.email, wanted.email, wanted.permission, {}, hashPassword(wanted.password)});
         }
+    }
+}
+
+void Service::prepareOrb(const Options &options) {
+    for (const OrbUser &user : options.orbUsers) {
+        m_model.orb.setUser(user.email, {hashPassword(user.password), user.expired});
+    }
+    if (!m_model.orb.hasUsers()) {
+        const PasswordHash password = hashPassword("Partner-1");
+        m_model.orb.setUser("partner@norvell.example", {password, false});
+        m_model.orb.setUser("expired@norvell.example", {password, true});
     }
 }
 

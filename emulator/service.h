@@ -43,6 +43,7 @@ public:
 private:
     bool prepareFleet(const Options &options);
     void prepareAccounts(const Options &options);
+    void prepareOrb(const Options &options);
 
     GenericTokenJudge m_genericTokens;
     std::mutex m_mutex;

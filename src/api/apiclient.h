@@ -14,6 +14,7 @@ struct HttpAnswer;
 struct HttpRequest;
 struct UploadPart;
 class Transfer;
+struct OrbServiceStatus;
 
 /// One request to the device manager service.
 ///
@@ -171,6 +172,21 @@ public:
     /// whose members are named like the columns of the log page; ApiException when an entry lacks a value.
     virtual unsigned browseLogs(const char *szStart, const char *szEnd, JSON &table);
 
+    // Remote access; what is signed in to, listed and added lives with the service, not with this client
+
+    virtual unsigned addService(const char *szOrgId, const char *szSiteId);
+    /// szPassword: plain; ciphered on its way. ApiCode105: wrong e-mail or password, or no session here;
+    /// ApiCode108: the password has expired; ApiServerError: unknown user.
+    virtual unsigned authenticateWithOrb(const char *szEmail, const char *szPassword);
+    /// organizations: array of objects with "organizationID", "organizationName", "enableRemoteAccess" and
+    /// "sites", an array of objects with "id" and "name".
+    virtual unsigned browseOrbOrgs(JSON &organizations);
+    virtual unsigned disconnectOrbService();
+    virtual unsigned getOrbServiceCachedStatus(OrbServiceStatus &status);
+    virtual unsigned isOrbServiceAdded(bool &bAdded);
+    /// bState: what holds from now on.
+    virtual unsigned toggleRemoteAccess(bool bEnable, bool &bState);
+
 protected:
     enum class Payload { None, Plain, Ciphered, File };
 
@@ -217,6 +233,7 @@ private:
                     const std::vector<UploadPart> &files);
     std::shared_ptr<Transfer> transferOrOwn() const;
 
+    unsigned postAboutOrb(const char *method, const char *path, JSON body, JSON *cipheredData = nullptr);
     unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
     static void logException(const Call &call, const std::string &error);
     void renewToken(const Call &call, const std::string &token);

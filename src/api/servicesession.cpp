@@ -11,6 +11,21 @@ bool ServiceSession::isPresent() const {
 }
 
 unsigned ServiceSession::call(const std::function<unsigned(CApiClient &)> &endpoint) {
+    const unsigned result = send(endpoint);
+    if (result == ApiCode105)
+        m_lost = true;
+    return result;
+}
+
+unsigned ServiceSession::callWithSignIn(const std::function<unsigned(CApiClient &)> &endpoint) {
+    const unsigned result = send(endpoint);
+    bool added = false;
+    if (result == ApiCode105)
+        call([&](CApiClient &client) { return client.isOrbServiceAdded(added); });
+    return result;
+}
+
+unsigned ServiceSession::send(const std::function<unsigned(CApiClient &)> &endpoint) {
     const LoginInfo present = CLocalStore::instance().loginInfo();
     if (present.generation != m_login.generation)
         return ApiInvalidArgument;
@@ -25,7 +40,5 @@ unsigned ServiceSession::call(const std::function<unsigned(CApiClient &)> &endpo
     if (client.accessToken() != before)
         CLocalStore::instance().renewAccess(QByteArray::fromStdString(client.accessToken()),
                                             m_login.generation);
-    if (result == ApiCode105)
-        m_lost = true;
     return result;
 }

@@ -15,6 +15,10 @@ public:
     /// session was ended meanwhile.
     unsigned call(const std::function<unsigned(CApiClient &)> &endpoint);
 
+    /// The same for a call that works with a sign-in of the service elsewhere, of which ApiCode105 may speak
+    /// as well: the session is lost only when the service does not know it when asked once more.
+    unsigned callWithSignIn(const std::function<unsigned(CApiClient &)> &endpoint);
+
     /// True when the service has told that it does not know the session any more.
     bool isLost() const { return m_lost; }
 
@@ -24,6 +28,8 @@ public:
     const LoginInfo &login() const { return m_login; }
 
 private:
+    unsigned send(const std::function<unsigned(CApiClient &)> &endpoint);
+
     LoginInfo m_login;
     bool m_lost = false;
 };

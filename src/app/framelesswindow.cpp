@@ -1,6 +1,7 @@
 #include "framelesswindow.h"
 
 #include "aboutdialog.h"
+#include "accountmanagementdialog.h"
 #include "accountsetupdialog.h"
 #include "confirmdialog.h"
 #include "devicewindow.h"
@@ -10,23 +11,24 @@
 #include "mainwindow.h"
 #include "notifier.h"
 #include "popupmenu.h"
+#include "resizeedges.h"
 #include "servicecontrol.h"
+#include "servicemanagement.h"
 #include "servicerequest.h"
 #include "sidepanel.h"
 #include "startcheck.h"
 #include "taskinfopool.h"
 #include "titlebar.h"
+#include "transientmessage.h"
 #include "welcomepage.h"
 
 #include <QApplication>
 #include <QCloseEvent>
 #include <QDebug>
-#include <QMouseEvent>
 #include <QStackedWidget>
 #include <QTimer>
 #include <QToolButton>
 #include <QVBoxLayout>
-#include <QWindow>
 
 #include <chrono>
 
@@ -34,7 +36,6 @@ using namespace std::chrono_literals;
 
 namespace {
 
-constexpr int resizeMargin = 4;
 constexpr QSize startSize{1280, 720};
 constexpr QSize smallestSize{1100, 640};
 constexpr auto finalLogOffTime = 3000ms;
@@ -53,6 +54,7 @@ FramelessWindow::FramelessWindow(QWidget *parent)
       m_stack(new QStackedWidget),
       m_welcome(new WelcomePage),
       m_startCheck(new StartCheck(this)),
+      m_serviceManagement(new ServiceManagement(this)),
       m_idle(new IdleWatch(this)) {
     setObjectName(QStringLiteral("FramelessWindow"));
     setWindowTitle(QCoreApplication::applicationName());
@@ -94,7 +96,8 @@ void FramelessWindow::buildLayout() {
     frameLayout->addWidget(m_titleBar);
     frameLayout->addWidget(content, 1);
     auto *layout = new QVBoxLayout(this);
-    layout->setContentsMargins(resizeMargin, resizeMargin, resizeMargin, resizeMargin);
+    layout->setContentsMargins(ResizeEdges::margin, ResizeEdges::margin, ResizeEdges::margin,
+                               ResizeEdges::margin);
     layout->addWidget(frame);
     setMinimumSize(smallestSize);
     resize(startSize);
@@ -105,8 +108,7 @@ void FramelessWindow::buildLayout() {
 void FramelessWindow::probeLocalService() {
     const bool installed = ServiceControl::queryLocalService() != LocalServiceState::NotInstalled;
     CLocalStore::instance().setLocalServiceInstalled(installed);
-    if (!installed)
-        m_titleBar->accountManagementAction()->setEnabled(false);
+    m_titleBar->accountManagementAction()->setEnabled(installed);
 }
 
 void FramelessWindow::connectParts() {
@@ -121,6 +123,10 @@ void FramelessWindow::connectParts() {
     connect(m_titleBar->restoreButton(), &QToolButton::clicked, this,
             &FramelessWindow::on_restoreButton_clicked);
     connect(m_titleBar->closeButton(), &QToolButton::clicked, this, &FramelessWindow::on_closeButton_clicked);
+    connect(m_titleBar->accountManagementAction(), &QAction::triggered, this,
+            &FramelessWindow::onAccontManagement);
+    connect(m_titleBar->serviceManagementAction(), &QAction::triggered, this,
+            &FramelessWindow::validateOrbServiceAdded);
     connect(m_titleBar->aboutAction(), &QAction::triggered, this, &FramelessWindow::onAbout);
     connect(m_titleBar->logOffAction(), &QAction::triggered, this, &FramelessWindow::onLogOff);
     connect(m_startCheck, &StartCheck::accountSetupNeeded, this, &FramelessWindow::openAccountSetupDialog);
@@ -130,6 +136,22 @@ void FramelessWindow::connectParts() {
     connect(&Notifier::instance(), &Notifier::notificationClicked, this,
             &FramelessWindow::onNotificationClicked);
     connect(&SessionEvents::instance(), &SessionEvents::sessionLost, this, &FramelessWindow::onSessionLost);
+    connectServiceManagement();
+}
+
+void FramelessWindow::connectServiceManagement() {
+    connect(m_serviceManagement, &ServiceManagement::connectToOrbMessage, this,
+            &FramelessWindow::connectToOrbMessage);
+    connect(m_serviceManagement, &ServiceManagement::connectToOrbFinished, this,
+            &FramelessWindow::connectToOrbFinished);
+    connect(this, &FramelessWindow::connectToOrbMessage, this,
+            [this](const QString &message, const QString &type) {
+                TransientMessage::show(this, message,
+                                       type == QLatin1String("loading") ? TransientMessage::Kind::Loading
+                                                                        : TransientMessage::Kind::Plain);
+            });
+    connect(this, &FramelessWindow::connectToOrbFinished, this, [this] { TransientMessage::clear(this); });
+    connect(m_serviceManagement, &ServiceManagement::serviceAdded, m_titleBar, &TitleBar::setServiceAdded);
 }
 
 QWidget *FramelessWindow::contentParent() const {
@@ -143,50 +165,6 @@ void FramelessWindow::setContent(MainWindow *content) {
     connect(content->deviceWindow(), &DeviceWindow::remoteServerChosen, this,
             &FramelessWindow::onRemoteServerChosen);
     connect(content->deviceWindow(), &DeviceWindow::allTasksDone, this, &FramelessWindow::logoutIfIdle);
-}
-
-void FramelessWindow::setWindowTitle(const QString &title) {
-    QWidget::setWindowTitle(title);
-}
-
-void FramelessWindow::setWindowIcon(const QIcon &icon) {
-    QWidget::setWindowIcon(icon);
-}
-
-void FramelessWindow::topWindow() {
-    setWindowState(windowState() & ~Qt::WindowMinimized);
-    show();
-    raise();
-    activateWindow();
-}
-
-void FramelessWindow::on_applicationStateChanged(Qt::ApplicationState state) {
-    // A dialog of a minimised program may come back below its window.
-    if (state == Qt::ApplicationActive && m_dialog)
-        m_dialog->raise();
-}
-
-void FramelessWindow::on_minimizeButton_clicked() {
-    setWindowState((windowState() & ~Qt::WindowFullScreen) | Qt::WindowMinimized);
-}
-
-void FramelessWindow::on_maximizeButton_clicked() {
-    setWindowState(Qt::WindowMaximized);
-}
-
-void FramelessWindow::on_restoreButton_clicked() {
-    setWindowState(Qt::WindowNoState);
-}
-
-void FramelessWindow::on_closeButton_clicked() {
-    close();
-}
-
-void FramelessWindow::on_windowTitlebar_doubleClicked() {
-    if (isMaximized())
-        on_restoreButton_clicked();
-    else
-        on_maximizeButton_clicked();
 }
 
 void FramelessWindow::checkLoginDialog() {
@@ -235,6 +213,21 @@ void FramelessWindow::onLoginSuccess() {
         m_dialog->close();
     m_dialog = nullptr;
     m_idle->start();
+    m_serviceManagement->lookUp();
+}
+
+void FramelessWindow::onAccontManagement() {
+    auto *dialog = new AccountManagementDialog(this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    connect(dialog, &QDialog::finished, this, [](int result) {
+        qDebug(result == QDialog::Accepted ? "account management successfully!"
+                                           : "account management failed!");
+    });
+    dialog->open();
+}
+
+void FramelessWindow::validateOrbServiceAdded() {
+    m_serviceManagement->validateOrbServiceAdded();
 }
 
 void FramelessWindow::onAbout() {
@@ -332,6 +325,7 @@ void FramelessWindow::endSession(Notice notice) {
     m_idle->stop();
     m_titleBar->accountButton()->hide();
     m_titleBar->helpButton()->hide();
+    m_titleBar->setServiceAdded(false);
     m_stack->setCurrentWidget(m_welcome);
     emit didLogOff();
 }
@@ -357,46 +351,4 @@ bool FramelessWindow::eventFilter(QObject *watched, QEvent *event) {
     if (event->type() == QEvent::MouseButtonPress && m_loggedIn)
         m_idle->noteActivity();
     return QWidget::eventFilter(watched, event);
-}
-
-void FramelessWindow::changeEvent(QEvent *event) {
-    QWidget::changeEvent(event);
-    if (event->type() != QEvent::WindowStateChange)
-        return;
-    const int margin = isMaximized() || isFullScreen() ? 0 : resizeMargin;
-    layout()->setContentsMargins(margin, margin, margin, margin);
-    m_titleBar->setMaximized(isMaximized());
-    if (m_dialog)
-        QTimer::singleShot(0, m_dialog, &FramelessDialog::centreOverParent);
-}
-
-Qt::Edges FramelessWindow::edgesAt(const QPoint &position) const {
-    if (isMaximized() || isFullScreen())
-        return {};
-    Qt::Edges edges;
-    edges.setFlag(Qt::LeftEdge, position.x() < resizeMargin);
-    edges.setFlag(Qt::RightEdge, position.x() >= width() - resizeMargin);
-    edges.setFlag(Qt::TopEdge, position.y() < resizeMargin);
-    edges.setFlag(Qt::BottomEdge, position.y() >= height() - resizeMargin);
-    return edges;
-}
-
-void FramelessWindow::mousePressEvent(QMouseEvent *event) {
-    const Qt::Edges edges = edgesAt(event->position().toPoint());
-    if (event->button() == Qt::LeftButton && edges && windowHandle())
-        windowHandle()->startSystemResize(edges);
-}
-
-void FramelessWindow::mouseMoveEvent(QMouseEvent *event) {
-    const Qt::Edges edges = edgesAt(event->position().toPoint());
-    if (edges == (Qt::LeftEdge | Qt::TopEdge) || edges == (Qt::RightEdge | Qt::BottomEdge))
-        setCursor(Qt::SizeFDiagCursor);
-    else if (edges == (Qt::RightEdge | Qt::TopEdge) || edges == (Qt::LeftEdge | Qt::BottomEdge))
-        setCursor(Qt::SizeBDiagCursor);
-    else if (edges & (Qt::LeftEdge | Qt::RightEdge))
-        setCursor(Qt::SizeHorCursor);
-    else if (edges)
-        setCursor(Qt::SizeVerCursor);
-    else
-        unsetCursor();
 }

@@ -12,6 +12,7 @@ class FramelessDialog;
 class LoginDialog;
 class MainWindow;
 class QStackedWidget;
+class ServiceManagement;
 class StartCheck;
 class TitleBar;
 class WelcomePage;
@@ -51,6 +52,9 @@ public slots:
     void openLoginDialog(const QString &loginTip);
     void onLoginSuccess();
     void onAccountCreated();
+    void onAccontManagement();
+    /// Opens the dialog about the remote-access service that fits.
+    void validateOrbServiceAdded();
     void onAbout();
     /// Ends the session and shows the login dialog.
     void onLogOff();
@@ -58,6 +62,10 @@ public slots:
     void logoutIfIdle();
 
 signals:
+    /// A transient message to be shown until connectToOrbFinished; 0 stands for the usual time and width.
+    void connectToOrbMessage(const QString &i_message, const QString &i_dialog_type, int i_timeout,
+                             int i_dialog_width);
+    void connectToOrbFinished();
     void didLogOff();
 
 protected:
@@ -72,6 +80,7 @@ private:
 
     void buildLayout();
     void connectParts();
+    void connectServiceManagement();
     void probeLocalService();
     bool hasUnfinishedWork() const;
     void confirmUnfinished(std::function<void()> goOn);
@@ -91,6 +100,7 @@ private:
     QPointer<FramelessDialog> m_unfinishedConfirm;
     QPointer<FramelessDialog> m_dialog; ///< the login or account set-up dialog that is shown
     StartCheck *m_startCheck;
+    ServiceManagement *m_serviceManagement;
     IdleWatch *m_idle;
     bool m_loggedIn = false;
     bool m_closeConfirmed = false;

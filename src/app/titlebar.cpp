@@ -58,10 +58,14 @@ void TitleBar::buildMenu() {
     m_serviceManagement = m_menu->addAction(tr("Norvell Service Management"));
     m_about = m_menu->addAction(tr("About"));
     m_logOff = m_menu->addAction(tr("Log off"));
-    m_accountManagement->setEnabled(false);
-    m_serviceManagement->setEnabled(false);
     m_account->setMenu(m_menu);
     m_account->setPopupMode(QToolButton::InstantPopup);
+}
+
+void TitleBar::setServiceAdded(bool added) {
+    const QString picture = QStringLiteral(":/images/icon_general_success_solid_green.svg");
+    m_serviceManagement->setIcon(added ? Icons::plainIcon(picture, pictureSize) : QIcon());
+    m_serviceManagement->setToolTip(added ? tr("The service is connected.") : QString());
 }
 
 void TitleBar::setMaximized(bool maximized) {

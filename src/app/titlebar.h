@@ -26,6 +26,8 @@ public:
 
     /// Shows the button that leads out of the present state.
     void setMaximized(bool maximized);
+    /// Marks the menu's entry for the remote-access service while this service is linked with it.
+    void setServiceAdded(bool added);
 
 private:
     QToolButton *addButton(const char *name, const QString &icon, const QString &text);

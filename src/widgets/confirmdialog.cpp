@@ -68,6 +68,15 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
             ConfirmDialog::tr("Are you sure you want to delete the site? This action will also delete the "
                               "sub-site(s) and the copy of selected device(s) of each site and sub-site."),
             ConfirmDialog::tr("Delete")};
+    case ConfirmDialog::Kind::UnlinkService:
+        return {ConfirmDialog::tr("Norvell Service Management"),
+                ConfirmDialog::tr("Are you sure you want to disconnect from this service?") +
+                    QStringLiteral("\n\n") +
+                    ConfirmDialog::tr(
+                        "Disconnecting will stop the synchronization of all devices managed by this "
+                        "Device Manager. You will need to set up the connection again to restore "
+                        "synchronization."),
+                ConfirmDialog::tr("Disconnect")};
     }
     return {};
 }

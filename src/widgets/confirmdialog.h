@@ -23,7 +23,8 @@ public:
         DeleteDevices,  ///< from the service for good
         RemoveFromSite, ///< devices, which the overview keeps
         RestartDevices, ///< as many as the count says
-        DeleteSite      ///< with its sub-sites
+        DeleteSite,     ///< with its sub-sites
+        UnlinkService   ///< from the remote-access service
     };
 
     explicit ConfirmDialog(Kind kind, QWidget *parent = nullptr, int count = 1);

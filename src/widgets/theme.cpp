@@ -66,6 +66,8 @@ QPalette palette() {
     palette.setColor(QPalette::Base, background);
     palette.setColor(QPalette::AlternateBase, raised);
     palette.setColor(QPalette::Highlight, accent);
+    palette.setColor(QPalette::Link, accent);
+    palette.setColor(QPalette::LinkVisited, accent);
     for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText,
                             QPalette::HighlightedText, QPalette::ToolTipText})
         palette.setColor(role, text);

@@ -18,6 +18,7 @@ inline const QColor textStrong{255, 255, 255, 219};
 inline const QColor textDim{255, 255, 255, 191};
 inline const QColor textQuiet{255, 255, 255, 140};
 inline const QColor textOff{255, 255, 255, 64};
+inline const QColor switchOff{0x4A, 0x4A, 0x4A};
 inline const QColor accent{0x29, 0x86, 0xFF};
 inline const QColor selection{0x29, 0x86, 0xFF, 38};
 inline const QColor success{0x3F, 0xB9, 0x50};

@@ -3,22 +3,34 @@
 #include "icons.h"
 
 #include <QLabel>
+#include <QTextDocumentFragment>
 
 namespace {
 constexpr QSize iconSize{12, 12};
 } // namespace
 
 WarningLine::WarningLine(QLabel *icon, QLabel *text) : m_icon(icon), m_text(text) {
-    m_text->setTextFormat(Qt::PlainText);
     m_text->setWordWrap(true);
     setText({});
 }
 
 void WarningLine::setText(const QString &text) {
+    show(text, Qt::PlainText);
+}
+
+void WarningLine::setLinkedText(const QString &html) {
+    show(html, Qt::RichText);
+}
+
+void WarningLine::show(const QString &text, Qt::TextFormat format) {
+    const bool linked = format == Qt::RichText;
+    m_text->setTextFormat(format);
+    m_text->setTextInteractionFlags(linked ? Qt::LinksAccessibleByMouse | Qt::LinksAccessibleByKeyboard
+                                           : Qt::NoTextInteraction);
     m_icon->setPixmap(text.isEmpty()
                           ? QPixmap()
                           : Icons::pixmap(QStringLiteral(":/images/icon_general_warning_solid.svg"), iconSize,
                                           m_icon->devicePixelRatioF()));
     m_text->setText(text);
-    m_text->setAccessibleDescription(text);
+    m_text->setAccessibleDescription(linked ? QTextDocumentFragment::fromHtml(text).toPlainText() : text);
 }

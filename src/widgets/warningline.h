@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QString>
+#include <Qt>
 
 class QLabel;
 
@@ -12,8 +13,13 @@ public:
 
     /// Shows the text; an empty one clears the line.
     void setText(const QString &text);
+    /// The same for a text of the program's own with a link in it, which the keyboard reaches too. Where the
+    /// link leads is told by the label's linkActivated.
+    void setLinkedText(const QString &html);
 
 private:
+    void show(const QString &text, Qt::TextFormat format);
+
     QLabel *m_icon;
     QLabel *m_text;
 };

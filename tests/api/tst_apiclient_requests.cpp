@@ -1,5 +1,6 @@
 #include "isolatedroot.h"
 #include "logcapture.h"
+#include "orbservicestatus.h"
 #include "scriptedpeer.h"
 #include "testsession.h"
 
@@ -28,6 +29,7 @@ struct Method {
 std::vector<Method> sessionMethods() {
     static JSON out;
     static std::string id;
+    static bool flag;
     const JSON page = {{"start", 500}, {"count", 250}};
     return {
         {"logoutServe", [](CApiClient &c) { return c.logoutServer("any"); }, "/v1/logout", JSON::object()},
@@ -110,13 +112,38 @@ std::vector<Method> sessionMethods() {
          },
          "/v1/config/set",
          {{"ui_lang", "de"}}},
+        {"addService",
+         [](CApiClient &c) { return c.addService("ORG1", "S1"); },
+         "/v1/orb/add_service",
+         {{"org_id", "ORG1"}, {"site_id", "S1"}}},
+        {"authenticateWithOrb",
+         [](CApiClient &c) { return c.authenticateWithOrb("a@x", "Passw0rd!"); },
+         "/v1/orb/login",
+         {{"email", "a@x"}, {"login", "opened: Passw0rd!"}}},
+        {"browseOrbOrgs", [](CApiClient &c) { return c.browseOrbOrgs(out); }, "/v1/orb/orgs", JSON::object()},
+        {"disconnectOrbService", [](CApiClient &c) { return c.disconnectOrbService(); },
+         "/v1/orb/logout_service", JSON::object()},
+        {"getOrbServiceCachedStatus",
+         [](CApiClient &c) {
+             OrbServiceStatus status;
+             return c.getOrbServiceCachedStatus(status);
+         },
+         "/v1/orb/cache/status", JSON::object()},
+        {"isOrbServiceAdded", [](CApiClient &c) { return c.isOrbServiceAdded(flag); },
+         "/v1/orb/cache/is_service_added", JSON::object()},
+        {"toggleRemoteAccess",
+         [](CApiClient &c) { return c.toggleRemoteAccess(false, flag); },
+         "/v1/orb/remote_access",
+         {{"enable", false}}},
     };
 }
 
 /// The body with its password in the clear, so that it can be compared.
 JSON opened(JSON body) {
-    if (body.contains("pass"))
-        body["pass"] = "opened: " + Ciphers::openSecret(body.value("pass", "")).value_or("nothing");
+    for (const char *secret : {"pass", "login"}) {
+        if (body.contains(secret))
+            body[secret] = "opened: " + Ciphers::openSecret(body.value(secret, "")).value_or("nothing");
+    }
     return body;
 }
 
@@ -143,7 +170,8 @@ private:
 };
 
 void TestApiClientRequests::initTestCase() {
-    const std::string data = TestSession::sealed(R"({"siteid":"SR1"})");
+    const std::string data =
+        TestSession::sealed(R"({"siteid":"SR1","is_orb_service_added":true,"enable":false})");
     m_peer.answer(ScriptedPeer::json({{"code", 0}, {"data", data}}));
 }
 
@@ -218,6 +246,11 @@ void TestApiClientRequests::preconditions_data() {
     refused("policy without a task", [](CApiClient &c) { return c.setPassPolicy(ids, "7", 8, ""); });
     refused("authorization of no list", [](CApiClient &c) { return c.authDevices("DV1", "root", "p"); });
     refused("authorization, no account", [](CApiClient &c) { return c.authDevices(ids, "", "p"); });
+    refused("service to no organization", [](CApiClient &c) { return c.addService("", "S1"); });
+    refused("service to no site", [](CApiClient &c) { return c.addService("ORG1", nullptr); });
+    refused("sign-in without an e-mail", [](CApiClient &c) { return c.authenticateWithOrb("", "p"); });
+    refused("sign-in without a password",
+            [](CApiClient &c) { return c.authenticateWithOrb("a@x", nullptr); });
     refused(
         "authorization, no password", [](CApiClient &c) { return c.authDevices(ids, "root", ""); },
         ApiCipherFailure);

@@ -1,4 +1,5 @@
 #include "aboutdialog.h"
+#include "accountmanagementdialog.h"
 #include "accountsetupdialog.h"
 #include "badgebutton.h"
 #include "clientstore.h"
@@ -9,10 +10,12 @@
 #include "idlewatch.h"
 #include "isolatedroot.h"
 #include "localstore.h"
+#include "logcapture.h"
 #include "logindialog.h"
 #include "mainconsoletable.h"
 #include "mainwindow.h"
 #include "notifier.h"
+#include "servicemanagementaddservicedialog.h"
 #include "servicesession.h"
 #include "sidepanel.h"
 #include "taskinfopool.h"
@@ -132,6 +135,34 @@ private slots:
         emit m_window->findChild<DeviceWindow *>()->disconnectRequested();
         QVERIFY(!m_window->isLoggedIn());
         QCOMPARE(loggedOff.size(), 2);
+    }
+
+    void accountMenuLeadsToItsDialogs() {
+        logIn();
+        const LogCapture log;
+        titleBar()->accountManagementAction()->trigger();
+        QTRY_VERIFY(Form::visible<AccountManagementDialog>());
+        QTest::keyClick(Form::visible<AccountManagementDialog>(), Qt::Key_Escape);
+        QCOMPARE(log.count("account management failed!"), 1);
+        titleBar()->accountManagementAction()->trigger();
+        QTRY_VERIFY(Form::visible<AccountManagementDialog>());
+        const QWidget *account = Form::visible<AccountManagementDialog>();
+        QCOMPARE(Form::text(account, "emailEdit"), email);
+        Form::type(account, "oldPassEdit", password);
+        Form::type(account, "newPassEdit", "N3w-Passw0rd");
+        Form::type(account, "confirmEdit", "N3w-Passw0rd");
+        Form::click(account, "applyButton");
+        QTRY_COMPARE_WITH_TIMEOUT(log.count("account management successfully!"), 1, patienceMs);
+
+        QSignalSpy asked(m_window.get(), &FramelessWindow::connectToOrbMessage);
+        QSignalSpy answered(m_window.get(), &FramelessWindow::connectToOrbFinished);
+        titleBar()->serviceManagementAction()->trigger();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<ServiceManagementAddServiceDialog>(), patienceMs);
+        QCOMPARE(asked.size(), 1);
+        QCOMPARE(answered.size(), 1);
+        QCOMPARE(m_service.command("expire-sessions"), QStringLiteral("ok"));
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QVERIFY(!Form::visible<ServiceManagementAddServiceDialog>());
     }
 
     void onlyClicksKeepTheSession() {

@@ -1,0 +1,81 @@
+// The frame as a window: its states, its buttons and the edges that resize it.
+
+#include "framelesswindow.h"
+
+#include "framelessdialog.h"
+#include "resizeedges.h"
+#include "titlebar.h"
+
+#include <QLayout>
+#include <QMouseEvent>
+#include <QTimer>
+#include <QWindow>
+
+void FramelessWindow::setWindowTitle(const QString &title) {
+    QWidget::setWindowTitle(title);
+}
+
+void FramelessWindow::setWindowIcon(const QIcon &icon) {
+    QWidget::setWindowIcon(icon);
+}
+
+void FramelessWindow::topWindow() {
+    setWindowState(windowState() & ~Qt::WindowMinimized);
+    show();
+    raise();
+    activateWindow();
+}
+
+void FramelessWindow::on_applicationStateChanged(Qt::ApplicationState state) {
+    // A dialog of a minimised program may come back below its window.
+    if (state == Qt::ApplicationActive && m_dialog)
+        m_dialog->raise();
+}
+
+void FramelessWindow::on_minimizeButton_clicked() {
+    setWindowState((windowState() & ~Qt::WindowFullScreen) | Qt::WindowMinimized);
+}
+
+void FramelessWindow::on_maximizeButton_clicked() {
+    setWindowState(Qt::WindowMaximized);
+}
+
+void FramelessWindow::on_restoreButton_clicked() {
+    setWindowState(Qt::WindowNoState);
+}
+
+void FramelessWindow::on_closeButton_clicked() {
+    close();
+}
+
+void FramelessWindow::on_windowTitlebar_doubleClicked() {
+    if (isMaximized())
+        on_restoreButton_clicked();
+    else
+        on_maximizeButton_clicked();
+}
+
+void FramelessWindow::changeEvent(QEvent *event) {
+    QWidget::changeEvent(event);
+    if (event->type() != QEvent::WindowStateChange)
+        return;
+    const int margin = isMaximized() || isFullScreen() ? 0 : ResizeEdges::margin;
+    layout()->setContentsMargins(margin, margin, margin, margin);
+    m_titleBar->setMaximized(isMaximized());
+    if (m_dialog)
+        QTimer::singleShot(0, m_dialog, &FramelessDialog::centreOverParent);
+}
+
+Qt::Edges FramelessWindow::edgesAt(const QPoint &position) const {
+    return isMaximized() || isFullScreen() ? Qt::Edges() : ResizeEdges::at(position, size());
+}
+
+void FramelessWindow::mousePressEvent(QMouseEvent *event) {
+    const Qt::Edges edges = edgesAt(event->position().toPoint());
+    if (event->button() == Qt::LeftButton && edges && windowHandle())
+        windowHandle()->startSystemResize(edges);
+}
+
+void FramelessWindow::mouseMoveEvent(QMouseEvent *event) {
+    setCursor(ResizeEdges::cursorOf(edgesAt(event->position().toPoint())));
+}

@@ -1,0 +1,113 @@
+#include "servicemanagement.h"
+
+#include "clientstore.h"
+#include "orbtexts.h"
+#include "servicemanagementaddservicedialog.h"
+#include "servicemanagementstatusdialog.h"
+#include "servicerequest.h"
+#include "transientmessage.h"
+
+struct ServiceManagement::Answer {
+    unsigned result = ApiException;
+    bool added = false;
+    AccountPermission permission = AccountPermission::Unknown;
+};
+
+ServiceManagement::ServiceManagement(QWidget *frame) : QObject(frame) {}
+
+QWidget *ServiceManagement::frame() const {
+    return qobject_cast<QWidget *>(parent());
+}
+
+void ServiceManagement::validateOrbServiceAdded() {
+    if (m_asking)
+        return;
+    if (m_dialog && m_dialog->isVisible()) {
+        m_dialog->raise();
+        return m_dialog->activateWindow();
+    }
+    m_asking = true;
+    emit connectToOrbMessage(tr("connecting to ORB..."), QStringLiteral("loading"), 0, 0);
+    const auto work = [](ServiceSession &session) {
+        Answer answer;
+        answer.result =
+            session.call([&](CApiClient &client) { return client.isOrbServiceAdded(answer.added); });
+        if (answer.result == ApiOk && CClientStore::instance().isThisComputer())
+            answer.permission = permissionOnThisComputer(session.login().account);
+        return answer;
+    };
+    const bool started = ServiceRequest::post(
+        NetJob::createRunner("validateOrbServiceAdded in FramelessWindow"), this, work,
+        [this](const Answer &answer) {
+            finishAsking();
+            onAnswer(answer);
+        },
+        [this](JobEnd end) {
+            if (end == JobEnd::Delivered)
+                return;
+            finishAsking();
+            if (end != JobEnd::SessionGone)
+                showError(OrbTexts::unknownError());
+        });
+    if (!started)
+        finishAsking();
+}
+
+void ServiceManagement::finishAsking() {
+    m_asking = false;
+    emit connectToOrbFinished();
+}
+
+void ServiceManagement::onAnswer(const Answer &answer) {
+    if (answer.result != ApiOk)
+        return showError(OrbTexts::failure(answer.result));
+    emit serviceAdded(answer.added);
+    m_permission = answer.permission;
+    if (answer.added)
+        openStatusDialog();
+    else if (mayManageService(m_permission))
+        openAddDialog();
+    else
+        showError(tr("Only an administrator can connect the service."));
+}
+
+void ServiceManagement::lookUp() {
+    ServiceRequest::post(
+        NetJob::createRunner("lookUp in ServiceManagement", NetTask::Turn::Beside), this,
+        [](ServiceSession &session) {
+            Answer answer;
+            answer.result =
+                session.call([&](CApiClient &client) { return client.isOrbServiceAdded(answer.added); });
+            return answer;
+        },
+        [this](const Answer &answer) {
+            if (answer.result == ApiOk)
+                emit serviceAdded(answer.added);
+        });
+}
+
+void ServiceManagement::openAddDialog() {
+    auto *dialog = new ServiceManagementAddServiceDialog(frame());
+    connect(dialog, &QDialog::accepted, this, [this] {
+        emit serviceAdded(true);
+        openStatusDialog();
+    });
+    open(dialog);
+}
+
+void ServiceManagement::openStatusDialog() {
+    auto *dialog = new ServiceManagementStatusDialog(m_permission, frame());
+    connect(dialog, &ServiceManagementStatusDialog::statusChanged, this, &ServiceManagement::serviceAdded);
+    connect(dialog, &QDialog::accepted, this, &ServiceManagement::openAddDialog);
+    open(dialog);
+}
+
+void ServiceManagement::open(FramelessDialog *dialog) {
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    m_dialog = dialog;
+    dialog->open();
+}
+
+void ServiceManagement::showError(const QString &text) {
+    TransientMessage::show(frame(), text, TransientMessage::Kind::Error);
+}

@@ -1,0 +1,41 @@
+#pragma once
+
+#include "framelessdialog.h"
+#include "orborganization.h"
+#include "warningline.h"
+
+#include <memory>
+
+namespace Ui {
+class ServiceManagementAddServiceDialog;
+}
+
+/// Links the service with a site of the remote-access service: the user signs in there, then chooses where.
+class ServiceManagementAddServiceDialog : public FramelessDialog {
+    Q_OBJECT
+
+public:
+    explicit ServiceManagementAddServiceDialog(QWidget *parent = nullptr);
+    ~ServiceManagementAddServiceDialog() override;
+
+private:
+    enum class Step { Service, Location };
+    struct SignIn;
+
+    void connectParts();
+    void showStep(Step step);
+    void onNext();
+    void signIn(const QString &email, const QString &password);
+    void onSignedIn(const SignIn &outcome);
+    void offerOrganizations(std::vector<OrbOrganization> organizations);
+    void offerSites();
+    void updateApply();
+    void onApply();
+    void onApplied(unsigned result);
+    void setBusy(bool busy);
+
+    std::unique_ptr<Ui::ServiceManagementAddServiceDialog> m_ui;
+    WarningLine m_error;
+    std::vector<OrbOrganization> m_organizations;
+    bool m_busy = false;
+};
