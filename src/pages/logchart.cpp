@@ -21,6 +21,7 @@ constexpr int axisHeight = 18;
 constexpr int scaleWidth = 44;
 constexpr int labelGap = 16;
 constexpr qreal widestBar = 26;
+constexpr qreal asideOpacity = 0.35;
 
 // From the foot of a bar upwards.
 constexpr LogEntry::Type stacked[] = {LogEntry::Type::Alarm, LogEntry::Type::Event, LogEntry::Type::Audit,
@@ -95,7 +96,7 @@ int LogChart::binAt(qreal x) const {
 
 std::optional<std::pair<int, int>> LogChart::markedBins() const {
     if (m_anchor >= 0 && m_cursor >= 0)
-        return std::minmax(m_anchor, m_cursor);
+        return std::minmax({m_anchor, m_cursor});
     return m_span ? m_bins.binsOf(*m_span) : std::nullopt;
 }
 
@@ -111,7 +112,7 @@ void LogChart::mouseMoveEvent(QMouseEvent *event) {
     if (!m_dragging)
         return;
     m_cursor = binAt(event->position().x());
-    const auto [first, last] = std::minmax(m_anchor, m_cursor);
+    const auto [first, last] = std::minmax({m_anchor, m_cursor});
     QToolTip::showText(event->globalPosition().toPoint(), PlainText::toolTip(binText(first, last)), this);
     update();
 }
@@ -126,7 +127,7 @@ void LogChart::choose() {
     m_dragging = false;
     if (m_cursor < 0)
         return;
-    const auto [first, last] = std::minmax(m_anchor < 0 ? m_cursor : m_anchor, m_cursor);
+    const auto [first, last] = std::minmax({m_anchor < 0 ? m_cursor : m_anchor, m_cursor});
     m_anchor = -1;
     update();
     emit spanChosen(m_bins.frame(first, last));
@@ -173,7 +174,7 @@ void LogChart::moveCursor(int bin, bool extends) {
 }
 
 void LogChart::tellCursor() {
-    const auto [first, last] = std::minmax(m_anchor < 0 ? m_cursor : m_anchor, m_cursor);
+    const auto [first, last] = std::minmax({m_anchor < 0 ? m_cursor : m_anchor, m_cursor});
     setAccessibleDescription(binText(first, last));
     QAccessibleEvent change(this, QAccessible::DescriptionChanged);
     QAccessible::updateAccessibility(&change);
@@ -259,11 +260,14 @@ void LogChart::paintMark(QPainter &painter) const {
 
 void LogChart::paintBars(QPainter &painter) const {
     const int highest = std::max(m_bins.highest(), 1);
+    const auto marked = markedBins();
     for (int bin = 0; bin < m_bins.size(); ++bin) {
         QRectF bar = binRect(bin);
         const qreal width = std::clamp(bar.width() - 2, 1.0, widestBar);
         bar = QRectF(bar.center().x() - width / 2, bar.top(), width, bar.height());
         qreal foot = bar.bottom();
+        const bool aside = marked && (bin < marked->first || bin > marked->second);
+        painter.setOpacity(aside ? asideOpacity : 1);
         for (const LogEntry::Type type : stacked) {
             const int count = countOf(m_bins.counts(bin), type);
             // A single entry beside thousands is still to be seen.
@@ -272,6 +276,7 @@ void LogChart::paintBars(QPainter &painter) const {
             foot -= height;
         }
     }
+    painter.setOpacity(1);
 }
 
 void LogChart::paintAxis(QPainter &painter) const {

@@ -2,6 +2,7 @@
 
 #include <QCoreApplication>
 #include <QDateTime>
+#include <QHash>
 #include <QSet>
 #include <QStringMatcher>
 
@@ -98,11 +99,51 @@ std::vector<int> turned(const std::vector<int> &order, Alike alike) {
     return result;
 }
 
-std::vector<QStringMatcher> matchersOf(const QString &search) {
-    std::vector<QStringMatcher> matchers;
+/// Numbers in the order of the entries' texts, case apart. Most texts stand in many entries, so each one is
+/// compared with others once only.
+std::vector<int> ranksOf(const std::vector<LogEntry> &entries, LogColumn column) {
+    QHash<QString, int> numbers;
+    std::vector<int> ranks;
+    ranks.reserve(entries.size());
+    for (const LogEntry &entry : entries) {
+        const auto found = numbers.constFind(entry.text(column));
+        ranks.push_back(found != numbers.cend() ? *found
+                                                : *numbers.insert(entry.text(column), int(numbers.size())));
+    }
+    std::vector<std::pair<QString, int>> texts;
+    for (auto number = numbers.cbegin(); number != numbers.cend(); ++number)
+        texts.emplace_back(number.key().toCaseFolded(), number.value());
+    std::sort(texts.begin(), texts.end());
+    std::vector<int> rankOfNumber(texts.size());
+    for (std::size_t i = 0, rank = 0; i < texts.size(); ++i) {
+        if (i > 0 && texts[i].first != texts[i - 1].first)
+            rank = i;
+        rankOfNumber[static_cast<std::size_t>(texts[i].second)] = static_cast<int>(rank);
+    }
+    for (int &rank : ranks)
+        rank = rankOfNumber[static_cast<std::size_t>(rank)];
+    return ranks;
+}
+
+/// A word of a search. A single letter is found faster without a table to leap by.
+class SearchWord {
+public:
+    explicit SearchWord(const QString &word) : m_word(word), m_matcher(word) {}
+
+    bool isIn(const QString &text) const {
+        return m_word.size() == 1 ? text.contains(m_word.front()) : m_matcher.indexIn(text) >= 0;
+    }
+
+private:
+    QString m_word;
+    QStringMatcher m_matcher;
+};
+
+std::vector<SearchWord> wordsOf(const QString &search) {
+    std::vector<SearchWord> words;
     for (const QString &word : search.toCaseFolded().split(QLatin1Char(' '), Qt::SkipEmptyParts))
-        matchers.emplace_back(word);
-    return matchers;
+        words.emplace_back(word);
+    return words;
 }
 
 } // namespace
@@ -176,15 +217,12 @@ void LogList::sortByTime() {
 }
 
 void LogList::sortByText(LogColumn column) {
-    std::vector<QString> keys;
-    keys.reserve(m_entries.size());
-    for (const LogEntry &entry : m_entries)
-        keys.push_back(entry.text(column).toCaseFolded());
-    const auto key = [&](int place) -> const QString & { return keys[static_cast<std::size_t>(place)]; };
+    const std::vector<int> ranks = ranksOf(m_entries, column);
+    const auto rank = [&](int place) { return ranks[static_cast<std::size_t>(place)]; };
     auto &[ascending, descending] = m_orders[static_cast<std::size_t>(column)];
     ascending = order(LogColumn::Time, Qt::DescendingOrder);
-    std::stable_sort(ascending.begin(), ascending.end(), [&](int a, int b) { return key(a) < key(b); });
-    descending = turned(ascending, [&](int a, int b) { return key(a) == key(b); });
+    std::stable_sort(ascending.begin(), ascending.end(), [&](int a, int b) { return rank(a) < rank(b); });
+    descending = turned(ascending, [&](int a, int b) { return rank(a) == rank(b); });
 }
 
 std::vector<int> LogList::order(LogColumn column, Qt::SortOrder direction, const std::vector<char> &matches,
@@ -199,15 +237,14 @@ std::vector<int> LogList::order(LogColumn column, Qt::SortOrder direction, const
 }
 
 std::vector<char> LogFilter::matches(const LogList &list) const {
-    const std::vector<QStringMatcher> words = matchersOf(search);
+    const std::vector<SearchWord> words = wordsOf(search);
     std::vector<char> result(static_cast<std::size_t>(list.size()));
     for (int place = 0; place < list.size(); ++place) {
         const LogEntry &entry = list.at(place);
         result[static_cast<std::size_t>(place)] =
             (!source || entry.source == *source) && (!type || entry.type == *type) &&
-            std::all_of(words.begin(), words.end(), [&](const QStringMatcher &word) {
-                return word.indexIn(list.searchText(place)) >= 0;
-            });
+            std::all_of(words.begin(), words.end(),
+                        [&](const SearchWord &word) { return word.isIn(list.searchText(place)); });
     }
     return result;
 }

@@ -1,5 +1,8 @@
 #include "logsidebar.h"
 
+#include "theme.h"
+
+#include <QCalendarWidget>
 #include <QComboBox>
 #include <QDateEdit>
 #include <QDateTime>
@@ -7,6 +10,7 @@
 #include <QLabel>
 #include <QPushButton>
 #include <QSignalBlocker>
+#include <QTextCharFormat>
 #include <QTimeEdit>
 #include <QToolButton>
 #include <QVBoxLayout>
@@ -95,7 +99,7 @@ void LogSidebar::addQuickFrames(QVBoxLayout *layout) {
         button->setObjectName(QLatin1String(name));
         button->setText(text);
         button->setCheckable(true);
-        button->setProperty("role", QStringLiteral("filter"));
+        button->setProperty("role", QStringLiteral("quick"));
         button->setFocusPolicy(Qt::StrongFocus);
         connect(button, &QToolButton::clicked, this, [this, quick = quick] {
             chooseQuick(quick);
@@ -115,6 +119,10 @@ void LogSidebar::addTimes(QVBoxLayout *layout, const QString &caption, const cha
     date->setObjectName(QLatin1String(dateName));
     date->setDisplayFormat(QStringLiteral("yyyy/MM/dd"));
     date->setCalendarPopup(true);
+    QTextCharFormat plain;
+    plain.setForeground(Theme::text);
+    for (const Qt::DayOfWeek day : {Qt::Saturday, Qt::Sunday})
+        date->calendarWidget()->setWeekdayTextFormat(day, plain);
     // The service counts from there, and knows no time before it.
     date->setMinimumDate(QDate(1970, 1, 1));
     date->setAccessibleName(tr("%1, date").arg(caption));

@@ -13,7 +13,8 @@
 
 namespace {
 
-constexpr int columnWidths[logColumnCount] = {160, 80, 80, 170, 300};
+/// The last column takes what is left.
+constexpr int columnWidths[logColumnCount - 1] = {160, 76, 70, 170};
 
 /// An item that knows its place and asks the table for what stands there.
 class LogItem : public QTableWidgetItem {
@@ -38,7 +39,7 @@ LogTable::LogTable(QWidget *parent) : CustomTable(parent) {
     for (int column = 0; column < logColumnCount; ++column)
         titles += logColumnTitle(static_cast<LogColumn>(column));
     setHorizontalHeaderLabels(titles);
-    for (int column = 0; column < logColumnCount; ++column)
+    for (int column = 0; column + 1 < logColumnCount; ++column)
         setColumnWidth(column, columnWidths[column]);
     // The whole result is sorted, not the rows of the page, so the header only says how.
     horizontalHeader()->setSectionsClickable(true);

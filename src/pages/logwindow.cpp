@@ -22,6 +22,7 @@
 #include <QSignalBlocker>
 #include <QSplitter>
 #include <QStackedWidget>
+#include <QThreadPool>
 #include <QToolButton>
 #include <QVBoxLayout>
 
@@ -46,7 +47,8 @@ LogListPtr noEntries() {
 
 LogWindow::LogWindow(QWidget *parent)
     : QWidget(parent),
-      m_runner(new (std::nothrow) NetTask),
+      // A long log takes its time, which no other request should wait for.
+      m_runner(new (std::nothrow) NetTask(NetTask::Turn::Beside)),
       m_list(noEntries()),
       m_sidebar(new LogSidebar(this)) {
     setObjectName(QStringLiteral("LogWindow"));
@@ -263,12 +265,18 @@ LogWindow::Answer LogWindow::browse(ServiceSession &session, const LogFrame &fra
 void LogWindow::onAnswer(const LogFrame &frame, const Answer &answer) {
     if (answer.result != ApiOk)
         return fail(apiResultText(answer.result));
-    m_list = answer.list;
+    showResult(frame, answer.list);
+}
+
+void LogWindow::showResult(const LogFrame &frame, const LogListPtr &list) {
+    LogListPtr last = std::exchange(m_list, list);
     m_frame = frame;
     m_span.reset();
     m_content = Content::Read;
     m_bins = LogBins(frame, *m_list);
     emit logsUpdated();
+    // Freeing a long list takes longer than a frame.
+    QThreadPool::globalInstance()->start([last = std::move(last)] {});
 }
 
 /// The entries of another frame would only look like an answer.

@@ -31,6 +31,9 @@ public:
     /// Forgets the result and the filters, as at the end of a session.
     void reset();
 
+    /// Shows the entries of a time frame as if they were just read.
+    void showResult(const LogFrame &frame, const LogListPtr &list);
+
     /// Lets tests stand in for the file dialog.
     using AskSavePath = std::function<void(const std::function<void(const QString &path)> &chosen)>;
     void setAskSavePath(AskSavePath ask) { m_askSavePath = std::move(ask); }

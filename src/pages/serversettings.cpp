@@ -89,6 +89,13 @@ JSON jsonValue(const QVariant &value, Kind kind) {
     return value.toString().toStdString();
 }
 
+/// True where the page shows the very value that the service has.
+bool isAsSent(const JSON &raw, const QVariant &shown, Kind kind) {
+    // 30 and 30.0 are the same number and not the same type.
+    return shown.isValid() && jsonValue(shown, kind) == raw &&
+           (kind != Kind::Number || raw.is_number_integer());
+}
+
 QString remark(const Setting &setting, const JSON &raw, const QVariant &shown) {
     const QString name = tr(setting.name);
     if (!shown.isValid())
@@ -138,8 +145,7 @@ Reading read(const JSON &object) {
         const QVariant shown = shownValue(*raw, each);
         if (shown.isValid())
             reading.values[QLatin1String(each.key)] = shown;
-        if (!shown.isValid() || jsonValue(shown, each.kind) != *raw ||
-            jsonValue(shown, each.kind).type() != raw->type())
+        if (!isAsSent(*raw, shown, each.kind))
             reading.remarks += remark(each, *raw, shown);
     }
     return reading;

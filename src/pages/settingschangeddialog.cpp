@@ -74,9 +74,9 @@ QWidget *SettingsChangedDialog::buildFooter() {
     footer->setObjectName(QStringLiteral("dialogFooter"));
     auto *cancel = new QPushButton(tr("Cancel"));
     cancel->setObjectName(QStringLiteral("cancelButton"));
-    auto *page = new QPushButton(tr("Save this page's"));
+    auto *page = new QPushButton(tr("Save this page's values"));
     page->setObjectName(QStringLiteral("keepPageButton"));
-    auto *server = new QPushButton(tr("Keep the server's"));
+    auto *server = new QPushButton(tr("Keep the server's values"));
     server->setObjectName(QStringLiteral("keepServerButton"));
     cancel->setAutoDefault(false);
     page->setAutoDefault(false);

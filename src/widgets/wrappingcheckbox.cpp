@@ -1,5 +1,7 @@
 #include "wrappingcheckbox.h"
 
+#include "theme.h"
+
 #include <QStyleOptionButton>
 #include <QStylePainter>
 
@@ -36,8 +38,7 @@ void WrappingCheckBox::paintEvent(QPaintEvent *) {
     option.rect.setHeight(fontMetrics().height() + 2 * padding);
     QStylePainter painter(this);
     painter.drawControl(QStyle::CE_CheckBox, option);
-    painter.setPen(
-        palette().color(isEnabled() ? QPalette::Active : QPalette::Disabled, QPalette::WindowText));
+    painter.setPen(!isEnabled() ? Theme::textOff : hasFocus() ? Theme::text : Theme::textDim);
     painter.drawText(rect().adjusted(textLeft(), padding, 0, 0), flags, text());
     if (hasFocus()) {
         const QRect line =

@@ -2,7 +2,6 @@
 
 #include "ciphers.h"
 #include "localstore.h"
-#include "nvlcrypto.h"
 #include "scriptedpeer.h"
 
 #include <mutex>
@@ -42,29 +41,20 @@ public:
     }
 
 private:
-    static ScriptedPeer::Reply sealed(const nlohmann::json &data) {
-        const std::string plain = data.dump();
-        char *out = nullptr;
-        dataToCypher(plain.data(), plain.size(), &out);
-        const std::string text(out);
-        nvlcryptoFree(out);
-        return ScriptedPeer::json({{"code", 0}, {"data", text}});
-    }
-
     ScriptedPeer::Reply answer(const ScriptedPeer::Request &request) {
         const std::lock_guard lock(m_mutex);
         if (const auto code = m_codes.find(request.path); code != m_codes.end())
             return ScriptedPeer::json({{"code", code->second}});
         if (request.path == "/v1/alarm/list")
-            return sealed(m_alarms);
+            return ScriptedPeer::sealed(m_alarms);
         if (request.path != "/v1/task/list" || !m_tasks.is_array())
-            return request.path == "/v1/task/list" ? sealed(m_tasks) : ScriptedPeer::json({{"code", 0}});
+            return request.path == "/v1/task/list" ? ScriptedPeer::sealed(m_tasks) : ScriptedPeer::json({{"code", 0}});
         const std::size_t start = request.json()["start"];
         const std::size_t count = request.json()["count"];
         nlohmann::json page = nlohmann::json::array();
         for (std::size_t i = start; i < std::min(start + count, m_tasks.size()); ++i)
             page.push_back(m_tasks[i]);
-        return sealed(page);
+        return ScriptedPeer::sealed(page);
     }
 
     std::mutex m_mutex;
