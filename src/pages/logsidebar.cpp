@@ -16,6 +16,7 @@
 #include <QVBoxLayout>
 
 #include <algorithm>
+#include <tuple>
 
 namespace {
 
@@ -46,14 +47,8 @@ std::optional<Kind> chosen(const QComboBox *box) {
 
 } // namespace
 
-LogSidebar::LogSidebar(QWidget *parent)
-    : QFrame(parent),
-      m_startDate(new QDateEdit(this)),
-      m_startTime(new QTimeEdit(this)),
-      m_endDate(new QDateEdit(this)),
-      m_endTime(new QTimeEdit(this)),
-      m_problem(new QLabel(this)),
-      m_search(new QPushButton(tr("Search"), this)) {
+// Parts are made from the top down, which is the way of the Tab key.
+LogSidebar::LogSidebar(QWidget *parent) : QFrame(parent) {
     setObjectName(QStringLiteral("logSidebar"));
     setFixedWidth(sidebarWidth);
     auto *layout = new QVBoxLayout(this);
@@ -64,8 +59,9 @@ LogSidebar::LogSidebar(QWidget *parent)
     layout->addWidget(heading);
     layout->addSpacing(4);
     addQuickFrames(layout);
-    addTimes(layout, tr("Start Time"), "startDateEdit", m_startDate, "startTimeEdit", m_startTime);
-    addTimes(layout, tr("End Time"), "endDateEdit", m_endDate, "endTimeEdit", m_endTime);
+    std::tie(m_startDate, m_startTime) = addTimes(layout, tr("Start Time"), "startDateEdit", "startTimeEdit");
+    std::tie(m_endDate, m_endTime) = addTimes(layout, tr("End Time"), "endDateEdit", "endTimeEdit");
+    m_problem = new QLabel(this);
     m_problem->setObjectName(QStringLiteral("frameProblemLabel"));
     m_problem->setProperty("role", QStringLiteral("warning"));
     m_problem->setTextFormat(Qt::PlainText);
@@ -78,6 +74,7 @@ LogSidebar::LogSidebar(QWidget *parent)
     m_type = addFilter(layout, "typeComboBox", tr("Type"));
     m_type->addItems({tr("All Types"), logTypeText(LogEntry::Type::Alarm), logTypeText(LogEntry::Type::Event),
                       logTypeText(LogEntry::Type::Audit)});
+    m_search = new QPushButton(tr("Search"), this);
     m_search->setObjectName(QStringLiteral("searchButton"));
     m_search->setProperty("role", QStringLiteral("primary"));
     layout->addSpacing(10);
@@ -113,8 +110,10 @@ void LogSidebar::addQuickFrames(QVBoxLayout *layout) {
     layout->addSpacing(4);
 }
 
-void LogSidebar::addTimes(QVBoxLayout *layout, const QString &caption, const char *dateName, QDateEdit *date,
-                          const char *timeName, QTimeEdit *time) {
+std::pair<QDateEdit *, QTimeEdit *> LogSidebar::addTimes(QVBoxLayout *layout, const QString &caption,
+                                                         const char *dateName, const char *timeName) {
+    auto *date = new QDateEdit(this);
+    auto *time = new QTimeEdit(this);
     addCaption(layout, caption, date);
     date->setObjectName(QLatin1String(dateName));
     date->setDisplayFormat(QStringLiteral("yyyy/MM/dd"));
@@ -142,6 +141,7 @@ void LogSidebar::addTimes(QVBoxLayout *layout, const QString &caption, const cha
     };
     connect(date, &QDateEdit::dateChanged, this, edited);
     connect(time, &QTimeEdit::timeChanged, this, edited);
+    return {date, time};
 }
 
 QComboBox *LogSidebar::addFilter(QVBoxLayout *layout, const char *name, const QString &caption) {

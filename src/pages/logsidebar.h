@@ -44,21 +44,21 @@ private:
     enum class Quick { None, LastHour, Today, SevenDays };
 
     void addQuickFrames(QVBoxLayout *layout);
-    void addTimes(QVBoxLayout *layout, const QString &caption, const char *dateName, QDateEdit *date,
-                  const char *timeName, QTimeEdit *time);
+    std::pair<QDateEdit *, QTimeEdit *> addTimes(QVBoxLayout *layout, const QString &caption,
+                                                 const char *dateName, const char *timeName);
     QComboBox *addFilter(QVBoxLayout *layout, const char *name, const QString &caption);
     void chooseQuick(Quick quick);
     void showQuick(Quick quick);
     void setEnds(const QDateTime &start, const QDateTime &end);
 
-    QDateEdit *m_startDate;
-    QTimeEdit *m_startTime;
-    QDateEdit *m_endDate;
-    QTimeEdit *m_endTime;
-    QLabel *m_problem;
+    QDateEdit *m_startDate = nullptr;
+    QTimeEdit *m_startTime = nullptr;
+    QDateEdit *m_endDate = nullptr;
+    QTimeEdit *m_endTime = nullptr;
+    QLabel *m_problem = nullptr;
     QComboBox *m_source = nullptr;
     QComboBox *m_type = nullptr;
-    QPushButton *m_search;
+    QPushButton *m_search = nullptr;
     std::vector<std::pair<Quick, QToolButton *>> m_quickButtons;
     Quick m_quick = Quick::None;
 };

@@ -267,10 +267,10 @@ private slots:
             if (names.last() != m_window->focusWidget()->objectName())
                 names += m_window->focusWidget()->objectName();
         }
-        QCOMPARE(names, QStringList({"lastHourButton", "todayButton", "sevenDaysButton", "startDateEdit",
-                                     "startTimeEdit", "endDateEdit", "endTimeEdit", "sourceComboBox",
-                                     "typeComboBox", "searchButton", "logSearchEdit", "exportButton",
-                                     "logChart", "logTable", "logDetail", "limitDropdown"}));
+        QCOMPARE(names.join(' '),
+                 QStringLiteral("lastHourButton todayButton sevenDaysButton startDateEdit startTimeEdit "
+                                "endDateEdit endTimeEdit sourceComboBox typeComboBox searchButton "
+                                "logSearchEdit exportButton logChart logTable logDetail limitDropdown"));
     }
 
 private:

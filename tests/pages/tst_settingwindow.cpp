@@ -236,10 +236,10 @@ private slots:
             names += m_window->focusWidget()->objectName();
             QTest::keyClick(m_window->focusWidget(), Qt::Key_Tab);
         }
-        QCOMPARE(names,
-                 QStringList({"alarmCheckBox", "taskCheckBox", "languageComboBox", "logSpinBox",
-                              "filePathEdit", "browseButton", "restorePointCheckBox", "restorePointSpinBox",
-                              "uploadLimitCheckBox", "uploadLimitSpinBox", "cancelButton", "applyButton"}));
+        QCOMPARE(names.join(' '),
+                 QStringLiteral("alarmCheckBox taskCheckBox languageComboBox logSpinBox filePathEdit "
+                                "browseButton restorePointCheckBox restorePointSpinBox uploadLimitCheckBox "
+                                "uploadLimitSpinBox cancelButton applyButton"));
         QTest::keyClick(button("applyButton"), Qt::Key_Space);
         QTRY_COMPARE(text("statusLabel"), QStringLiteral("Settings saved."));
         QCOMPARE(m_service->settings().at("ui_lang").get<std::string>(), std::string("tlh"));
