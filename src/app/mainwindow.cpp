@@ -137,7 +137,7 @@ void MainWindow::navigateTo(int page) {
 
 void MainWindow::askToLeave(const std::function<void()> &discard) {
     m_navigation->button(m_pages->currentIndex())->setChecked(true);
-    if (m_question)
+    if (m_question && m_question->isVisible())
         return m_question->raise();
     m_question = new ConfirmDialog(ConfirmDialog::Kind::LeavePage, this);
     m_question->setAttribute(Qt::WA_DeleteOnClose);
