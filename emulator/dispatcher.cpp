@@ -1,5 +1,6 @@
 #include "dispatcher.h"
 
+#include "audit.h"
 #include "clock.h"
 #include "service.h"
 
@@ -66,6 +67,10 @@ Answer Dispatcher::answer(const Endpoint &endpoint, const Incoming &incoming, bo
 Answer Dispatcher::granted(const Endpoint &endpoint, const Incoming &incoming, bool alwaysRenew) {
     const Call call = callOf(endpoint, incoming);
     Answer answer = endpoint.handle(m_service, call);
+    if (const std::string done = auditText(endpoint.path, call.body); !done.empty()) {
+        m_service.withModel(
+            [&](Model &model) { model.log.add(nowMs(), "System", "Audit", done, call.session.account); });
+    }
     if (endpoint.gate != Gate::Anybody) {
         renewToken(answer, call.session, alwaysRenew);
     }

@@ -42,8 +42,10 @@ Answer getSettings(Service &service, const Call &) {
 
 Answer setSettings(Service &service, const Call &call) {
     service.withModel([&](Model &model) {
-        model.settings.change(call.body);
-        model.log.add(nowMs(), "System", "Audit", "Settings changed", call.session.account);
+        if (const std::string what = model.settings.change(call.body); !what.empty()) {
+            model.log.add(nowMs(), "System", "Audit", "Settings changed: " + what, call.session.account);
+        }
+        model.log.expire(nowMs(), model.settings.logDays());
     });
     return {};
 }

@@ -6,7 +6,9 @@ namespace emulator {
 
 namespace {
 
-constexpr std::size_t mostEntries = 20000;
+constexpr std::size_t mostEntries = 200000;
+constexpr std::int64_t dayMs = 86400000;
+constexpr std::int64_t betweenExpiriesMs = 60000;
 
 } // namespace
 
@@ -19,6 +21,23 @@ void LogTable::add(std::int64_t at, const char *source, const char *type, const 
                                    {"type", type},
                                    {"description", description},
                                    {"user", user}}));
+}
+
+void LogTable::expire(std::int64_t nowMs, int days) {
+    if (nowMs < m_nextExpiry && days == m_expiryDays) {
+        return;
+    }
+    m_nextExpiry = nowMs + betweenExpiriesMs;
+    m_expiryDays = days;
+    std::unordered_set<std::int64_t> old;
+    for (const RecordList::Record &entry : m_entries.all()) {
+        if (entry.at < nowMs - days * dayMs) {
+            old.insert(entry.row);
+        }
+    }
+    if (!old.empty()) {
+        m_entries.remove(old);
+    }
 }
 
 std::string LogTable::rangeText(std::int64_t from, std::int64_t to) const {

@@ -29,7 +29,7 @@ Past of a new fleet
   --tasks N             tasks that have ended in the last days (0)
   --task-devices N      devices of each of them (20)
   --alarms N            alarms that nobody has removed (0); 5000 are kept at most
-  --log-entries N       log entries of the last 8 days (0); 20000 are kept at most
+  --log-entries N       log entries of the last 8 days (0); 200000 are kept at most
 Tasks
   --task-pace MS        length of a step; the work on a device takes 6 to 8 of them (1000)
   --task-failures P     share of the devices that fail by chance (0)
@@ -185,7 +185,7 @@ Setters valueSetters(Options &options) {
         {"--tasks", numberInto<std::size_t>("--tasks", options.tasks, 20000)},
         {"--task-devices", numberInto<std::size_t>("--task-devices", options.taskDevices, 1000)},
         {"--alarms", numberInto<std::size_t>("--alarms", options.alarms, 5000)},
-        {"--log-entries", numberInto<std::size_t>("--log-entries", options.logEntries, 20000)},
+        {"--log-entries", numberInto<std::size_t>("--log-entries", options.logEntries, 200000)},
         {"--fault", [&](const std::string &text) { options.faults.push_back(text); }},
         {"--orb-sign-in", numberInto("--orb-sign-in", options.orbSignInMs, longestHold)},
         {"--orb-user", [&](const std::string &text) { options.orbUsers.push_back(orbUserOf(text)); }},

@@ -47,6 +47,7 @@ void Service::lookAfter() {
     m_model.authorization.settle(nowMs());
     m_model.batches.dropOverdue(nowMs());
     m_model.engine.settle(nowMs());
+    m_model.log.expire(nowMs(), m_model.settings.logDays());
     if (Clock::now() < m_nextTick) {
         return;
     }

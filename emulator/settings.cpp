@@ -10,27 +10,54 @@ namespace emulator {
 namespace {
 
 constexpr auto storeKey = "settings";
+constexpr std::size_t longestPath = 4096;
+constexpr std::size_t longestLanguage = 16;
 
-Json factorySettings() {
-    return {{"nf_alarms", true},        {"nf_tasks", true},   {"svr_fw_upload_limit_enabled", false},
-            {"svr_fw_upload_limit", 5}, {"log_keepdays", 30}, {"rp_download_path", ""},
-            {"rp_auto", false},         {"rp_keepnum", 3},    {"sys_lang", "en"},
-            {"ui_lang", "en"}};
+/// A setting as a new service has it. A number lies between least and most, a text is no longer than most.
+struct Setting {
+    const char *name;
+    Json value;
+    std::int64_t least = 0;
+    std::int64_t most = 0;
+
+    bool takes(const Json &wanted) const {
+        if (value.is_number_integer()) {
+            return wanted.is_number_integer() && wanted >= least && wanted <= most;
+        }
+        return wanted.type() == value.type() &&
+               (!wanted.is_string() ||
+                wanted.get_ref<const std::string &>().size() <= static_cast<std::size_t>(most));
+    }
+};
+
+const std::vector<Setting> &table() {
+    static const std::vector<Setting> settings = {{"nf_alarms", true},
+                                                  {"nf_tasks", true},
+                                                  {"svr_fw_upload_limit_enabled", false},
+                                                  {"svr_fw_upload_limit", 5, 1, 50},
+                                                  {"log_keepdays", 30, 1, 1095},
+                                                  {"rp_download_path", "", 0, longestPath},
+                                                  {"rp_auto", false},
+                                                  {"rp_keepnum", 3, 1, 9999},
+                                                  {"sys_lang", "en", 0, longestLanguage},
+                                                  {"ui_lang", "en", 0, longestLanguage}};
+    return settings;
 }
 
-bool fits(const Json &value, const Json &example) {
-    if (example.is_number_integer()) {
-        return value.is_number_integer() && value.get<std::int64_t>() >= 0;
-    }
-    return value.type() == example.type();
+const Setting *find(const std::string &name) {
+    const auto found = std::find_if(table().begin(), table().end(),
+                                    [&](const Setting &setting) { return name == setting.name; });
+    return found == table().end() ? nullptr : &*found;
 }
 
 } // namespace
 
-Settings::Settings(Store &store) : m_store(store), m_values(factorySettings()) {
-    const std::string kept = store.value(storeKey);
-    if (!kept.empty()) {
-        m_values.update(Json::parse(kept));
+Settings::Settings(Store &store) : m_store(store), m_values(Json::object()) {
+    const std::string text = store.value(storeKey);
+    const Json kept = text.empty() ? Json::object() : Json::parse(text);
+    for (const Setting &setting : table()) {
+        const Json value = kept.value(setting.name, setting.value);
+        m_values[setting.name] = setting.takes(value) ? value : setting.value;
     }
 }
 
@@ -40,21 +67,28 @@ std::size_t Settings::firmwareLimit() const {
     return limited ? std::max<std::size_t>(m_values.at("svr_fw_upload_limit").get<std::size_t>(), 1) : 0;
 }
 
-void Settings::change(const Json &members) {
+std::string Settings::change(const Json &members) {
     Json changed = m_values;
+    std::string differences;
     for (const auto &[name, value] : members.items()) {
-        const std::string key = name == "days" ? "log_keepdays" : name;
-        const auto known = changed.find(key);
-        if (known == changed.end()) {
+        const Setting *setting = find(name == "days" ? "log_keepdays" : name);
+        if (!setting) {
             continue;
         }
-        if (!fits(value, *known)) {
-            throw Refusal(Code::Malformed, "setting \"" + name + "\" has a wrong type");
+        if (!setting->takes(value)) {
+            throw Refusal(Code::Malformed, "setting \"" + name + "\" has a wrong type or is out of range");
         }
-        *known = value;
+        if (Json &present = changed[setting->name]; present != value) {
+            differences += (differences.empty() ? "" : ", ") + std::string(setting->name) + ' ' +
+                           jsonText(present) + " -> " + jsonText(value);
+            present = value;
+        }
     }
-    m_store.setValue(storeKey, jsonText(changed));
-    m_values = std::move(changed);
+    if (!differences.empty()) {
+        m_store.setValue(storeKey, jsonText(changed));
+        m_values = std::move(changed);
+    }
+    return differences;
 }
 
 } // namespace emulator

@@ -15,6 +15,7 @@
 #include "servicecontrol.h"
 #include "servicemanagement.h"
 #include "servicerequest.h"
+#include "settingwindow.h"
 #include "sidepanel.h"
 #include "startcheck.h"
 #include "taskinfopool.h"
@@ -207,7 +208,7 @@ void FramelessWindow::onLoginSuccess() {
     m_titleBar->helpButton()->show();
     if (m_content) {
         m_stack->setCurrentWidget(m_content);
-        m_content->deviceWindow()->startWork();
+        m_content->startWork();
     }
     if (m_dialog)
         m_dialog->close();
@@ -247,20 +248,21 @@ void FramelessWindow::onLogOff() {
 
 bool FramelessWindow::hasUnfinishedWork() const {
     return m_loggedIn && (CTaskInfoPool::instance().hasRequestedTask() ||
-                          (m_content && m_content->deviceWindow()->hasPendingEdits()));
+                          (m_content && (m_content->deviceWindow()->hasPendingEdits() ||
+                                         m_content->settingWindow()->hasUnsavedEdits())));
 }
 
 /// Goes on at once, or when the user has agreed to leave behind what a log-off would lose: a task that was
-/// requested and has not begun, or changes of sites.
+/// requested and has not begun, changes of sites or of settings.
 void FramelessWindow::confirmUnfinished(std::function<void()> goOn) {
     if (!hasUnfinishedWork())
         return goOn();
     if (m_unfinishedConfirm && m_unfinishedConfirm->isVisible())
         return m_unfinishedConfirm->raise();
-    m_unfinishedConfirm =
-        new ConfirmDialog(CTaskInfoPool::instance().hasRequestedTask() ? ConfirmDialog::Kind::UnfinishedTask
-                                                                       : ConfirmDialog::Kind::UnsavedSites,
-                          this);
+    const auto kind = CTaskInfoPool::instance().hasRequestedTask()   ? ConfirmDialog::Kind::UnfinishedTask
+                      : m_content->deviceWindow()->hasPendingEdits() ? ConfirmDialog::Kind::UnsavedSites
+                                                                     : ConfirmDialog::Kind::UnsavedSettings;
+    m_unfinishedConfirm = new ConfirmDialog(kind, this);
     m_unfinishedConfirm->setAttribute(Qt::WA_DeleteOnClose);
     connect(m_unfinishedConfirm, &QDialog::accepted, this, std::move(goOn));
     m_unfinishedConfirm->open();
@@ -313,7 +315,7 @@ void FramelessWindow::onRemoteServerChosen(const QString &serverId) {
 
 void FramelessWindow::endSession(Notice notice) {
     if (m_content)
-        m_content->deviceWindow()->stopWork();
+        m_content->stopWork();
     // Dialogs of the session that is over go with it.
     for (QDialog *dialog : findChildren<QDialog *>())
         dialog->close();

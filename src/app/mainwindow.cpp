@@ -2,8 +2,11 @@
 
 #include "alarmpanel.h"
 #include "badgebutton.h"
+#include "confirmdialog.h"
 #include "devicewindow.h"
 #include "icons.h"
+#include "logwindow.h"
+#include "settingwindow.h"
 #include "sidepanel.h"
 
 #include <QButtonGroup>
@@ -43,12 +46,16 @@ MainWindow::MainWindow(QWidget *parent)
       m_splitter(new QSplitter(makeCentral(this))),
       m_pages(new QStackedWidget(m_splitter)),
       m_deviceWindow(new DeviceWindow(m_pages)),
+      m_logWindow(new LogWindow(m_pages)),
+      m_settingWindow(new SettingWindow(m_pages)),
       m_sidePanel(new SidePanel(m_splitter)),
       m_navigation(new QButtonGroup(this)) {
     qDebug("MainWindow constructor");
     setObjectName(QStringLiteral("MainWindow"));
     m_pages->setObjectName(QStringLiteral("pageStack"));
-    m_pages->addWidget(m_deviceWindow);
+    for (QWidget *page : {static_cast<QWidget *>(m_deviceWindow), static_cast<QWidget *>(m_logWindow),
+                          static_cast<QWidget *>(m_settingWindow)})
+        m_pages->addWidget(page);
     auto *layout = static_cast<QHBoxLayout *>(centralWidget()->layout());
     layout->addWidget(buildRail());
     layout->addWidget(m_splitter, 1);
@@ -57,6 +64,7 @@ MainWindow::MainWindow(QWidget *parent)
     m_splitter->setStretchFactor(0, 1);
     m_splitter->setSizes({1000, sidePanelWidth});
     m_sidePanel->hide();
+    connectPages();
     connectPanels();
 }
 
@@ -79,17 +87,69 @@ QWidget *MainWindow::buildRail() {
     layout->addStretch();
     m_alarmButton = addRailButton(rail, "alarmButton", QStringLiteral("nav_alarm_line"), tr("Alarms"));
     m_taskButton = addRailButton(rail, "taskButton", QStringLiteral("nav_task_line"), tr("Tasks"));
-    // Their pages do not exist yet.
-    for (QToolButton *button : {log, settings})
-        button->setEnabled(false);
     m_navigation->setExclusive(true);
-    m_navigation->addButton(device, 0);
+    m_navigation->addButton(device, DevicePage);
+    m_navigation->addButton(log, LogPage);
+    m_navigation->addButton(settings, SettingsPage);
     device->setChecked(true);
     connect(m_navigation, &QButtonGroup::idToggled, this, [this](int page, bool checked) {
-        if (checked)
-            m_pages->setCurrentIndex(page);
+        if (checked && page != m_pages->currentIndex())
+            navigateTo(page);
     });
     return rail;
+}
+
+void MainWindow::startWork() {
+    showPage(DevicePage);
+    m_deviceWindow->startWork();
+    // Whether alarms and tasks may show on the desktop stands there.
+    m_settingWindow->loadConfig();
+}
+
+void MainWindow::stopWork() {
+    m_deviceWindow->stopWork();
+    m_logWindow->reset();
+    m_settingWindow->reset();
+}
+
+void MainWindow::connectPages() {
+    connect(m_logWindow, &LogWindow::export_button_clicked, m_deviceWindow,
+            &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_logWindow, &LogWindow::export_file_generated, m_deviceWindow,
+            &DeviceWindow::onShowAnimatedMsgDlg);
+}
+
+/// Leads to a page unless the one that is left has changes: then the user decides, and the rail shows the
+/// page that is still there.
+void MainWindow::navigateTo(int page) {
+    const auto goOn = [this, page](auto discard) {
+        return [this, page, discard] {
+            discard();
+            navigateTo(page);
+        };
+    };
+    if (page != DevicePage && m_deviceWindow->hasPendingEdits())
+        return askToLeave(goOn([this] { m_deviceWindow->discardEdits(); }));
+    if (page != SettingsPage && m_settingWindow->hasUnsavedEdits())
+        return askToLeave(goOn([this] { m_settingWindow->discardEdits(); }));
+    showPage(page);
+}
+
+void MainWindow::askToLeave(const std::function<void()> &discard) {
+    m_navigation->button(m_pages->currentIndex())->setChecked(true);
+    if (m_question && m_question->isVisible())
+        return m_question->raise();
+    m_question = new ConfirmDialog(ConfirmDialog::Kind::LeavePage, this);
+    m_question->setAttribute(Qt::WA_DeleteOnClose);
+    connect(m_question, &QDialog::rejected, this, discard);
+    m_question->open();
+}
+
+void MainWindow::showPage(int page) {
+    m_pages->setCurrentIndex(page);
+    m_navigation->button(page)->setChecked(true);
+    if (page == SettingsPage)
+        m_settingWindow->loadConfig();
 }
 
 void MainWindow::connectPanels() {
@@ -102,7 +162,7 @@ void MainWindow::connectPanels() {
     });
     connect(m_sidePanel->alarmPanel(), &AlarmPanel::deviceChosen, this,
             [this](const QString &deviceId, const QString &ip) {
-                m_navigation->button(0)->setChecked(true);
+                m_navigation->button(DevicePage)->setChecked(true);
                 m_deviceWindow->selectDevice(deviceId, ip);
             });
 }

@@ -568,6 +568,10 @@ bool DeviceWindow::hasPendingEdits() const {
     return m_siteTree->edits().isDirty();
 }
 
+void DeviceWindow::discardEdits() {
+    m_siteTree->discardEdits();
+}
+
 void DeviceWindow::commitSites() {
     m_siteCommit->send();
 }

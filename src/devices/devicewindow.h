@@ -42,6 +42,7 @@ public:
 
     /// True while there are changes of sites that were not sent.
     bool hasPendingEdits() const;
+    void discardEdits();
 
     /// The devices that operations work on, in the order of their rows.
     const std::vector<DeviceRecordPtr> &selectedDevices() const { return m_selected; }

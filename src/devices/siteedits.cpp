@@ -195,6 +195,11 @@ JSON SiteEdits::commitRecords() const {
     return records;
 }
 
+void SiteEdits::discard() {
+    m_edits = {};
+    merge();
+}
+
 JSON SiteEdits::beginCommit() {
     m_sent = m_edits;
     for (const Sites::Site &site : m_edits.added)

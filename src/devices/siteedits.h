@@ -28,6 +28,8 @@ public:
     const Sites::List &reading() const { return m_base; }
     /// What the user sees: the reading with the edits.
     const Sites::List &merged() const { return m_merged; }
+    /// Forgets the edits; those that are on their way to the service arrive all the same.
+    void discard();
     bool isDirty() const { return !m_edits.isEmpty(); }
 
     bool contains(const QString &id) const { return find(id) != nullptr; }

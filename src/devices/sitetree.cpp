@@ -132,6 +132,12 @@ void SiteTree::forgetSites() {
         emit sitesEdited();
 }
 
+void SiteTree::discardEdits() {
+    m_edits.discard();
+    refresh();
+    emit sitesEdited();
+}
+
 JSON SiteTree::beginCommit() {
     return m_edits.beginCommit();
 }

@@ -34,6 +34,8 @@ public:
     void setSites(const Sites::List &sites);
     /// Forgets sites and edits, as at the end of a session.
     void forgetSites();
+    /// Forgets the edits that were not sent.
+    void discardEdits();
     /// Shows how many devices each site has.
     void setCounts(const DeviceSnapshot &devices);
 

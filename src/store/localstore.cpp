@@ -9,6 +9,7 @@
 namespace {
 const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
+const QString kUiLanguage = QStringLiteral("kUiLanguage");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -91,4 +92,12 @@ QString CLocalStore::defaultFilePath() const {
 
 bool CLocalStore::setDefaultFilePath(const QString &folder) {
     return m_store.replace(kDefaultFilePath, folder);
+}
+
+QString CLocalStore::uiLanguage() const {
+    return m_store.query(kUiLanguage);
+}
+
+bool CLocalStore::setUiLanguage(const QString &language) {
+    return m_store.replace(kUiLanguage, language);
 }

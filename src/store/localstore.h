@@ -46,6 +46,10 @@ public:
     QString defaultFilePath() const;
     bool setDefaultFilePath(const QString &folder);
 
+    /// Code of the language that the windows are to speak; empty for that of the system.
+    QString uiLanguage() const;
+    bool setUiLanguage(const QString &language);
+
 private:
     CLocalStore();
 

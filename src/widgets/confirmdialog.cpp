@@ -28,6 +28,17 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
             ConfirmDialog::tr("There are unsaved/unapplied changes of sites, which are lost when the session "
                               "ends now. Are you sure you want to go on?"),
             ConfirmDialog::tr("End session")};
+    case ConfirmDialog::Kind::UnsavedSettings:
+        return {
+            ConfirmDialog::tr("Settings"),
+            ConfirmDialog::tr("There are settings that were changed and not applied. The changes are lost "
+                              "when the session ends now. Are you sure you want to go on?"),
+            ConfirmDialog::tr("End session")};
+    case ConfirmDialog::Kind::LeavePage:
+        return {ConfirmDialog::tr("Unsaved Changes"),
+                ConfirmDialog::tr("There are unsaved/unapplied changes on this page, which are lost when you "
+                                  "leave it. Do you want to stay?"),
+                ConfirmDialog::tr("Stay")};
     case ConfirmDialog::Kind::CancelTask:
         return {ConfirmDialog::tr("Cancel Task"),
                 ConfirmDialog::tr("Are you sure you want to cancel %n task(s)? Devices that are done already "
@@ -84,7 +95,7 @@ Wording wordingOf(ConfirmDialog::Kind kind, int count) {
 } // namespace
 
 ConfirmDialog::ConfirmDialog(Kind kind, QWidget *parent, int count)
-    : FramelessDialog(parent), m_ui(formIn<Ui::ConfirmDialog>(content())) {
+    : FramelessDialog(parent), m_ui(formIn<Ui::ConfirmDialog>(content())), m_kind(kind) {
     setObjectName(QStringLiteral("ConfirmDialog"));
     const Wording wording = wordingOf(kind, count);
     setWindowTitle(wording.title);
@@ -93,8 +104,10 @@ ConfirmDialog::ConfirmDialog(Kind kind, QWidget *parent, int count)
     // Beside a button that cancels something else, "Cancel" would say the opposite of what it does.
     if (kind == Kind::CancelTask)
         m_ui->cancelButton->setText(tr("Keep running"));
+    if (kind == Kind::LeavePage)
+        m_ui->cancelButton->setText(tr("Discard changes"));
     connect(m_ui->acceptButton, &QPushButton::clicked, this, &QDialog::accept);
-    connect(m_ui->cancelButton, &QPushButton::clicked, this, &QDialog::reject);
+    connect(m_ui->cancelButton, &QPushButton::clicked, this, [this] { done(QDialog::Rejected); });
 }
 
 ConfirmDialog::~ConfirmDialog() = default;
@@ -105,4 +118,9 @@ void ConfirmDialog::addDetail(QWidget *detail) {
 
 void ConfirmDialog::setAcceptable(bool acceptable) {
     m_ui->acceptButton->setEnabled(acceptable);
+}
+
+void ConfirmDialog::reject() {
+    // Changes are lost by the button that says so, never by a key or the cross.
+    done(m_kind == Kind::LeavePage ? QDialog::Accepted : QDialog::Rejected);
 }

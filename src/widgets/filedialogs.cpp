@@ -15,4 +15,15 @@ void askSavePath(QWidget *parent, const QString &title, const QString &suggestio
     dialog->open();
 }
 
+void askFolder(QWidget *parent, const QString &title, const QString &suggestion,
+               const std::function<void(const QString &)> &chosen) {
+    auto *dialog = new QFileDialog(parent, title, suggestion);
+    dialog->setObjectName(QStringLiteral("folderDialog"));
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->setFileMode(QFileDialog::Directory);
+    dialog->setOption(QFileDialog::ShowDirsOnly);
+    QObject::connect(dialog, &QFileDialog::fileSelected, parent, chosen);
+    dialog->open();
+}
+
 } // namespace FileDialogs

@@ -13,4 +13,7 @@ namespace FileDialogs {
 void askSavePath(QWidget *parent, const QString &title, const QString &suggestion, const QString &filter,
                  const QString &suffix, const std::function<void(const QString &path)> &chosen);
 
+void askFolder(QWidget *parent, const QString &title, const QString &suggestion,
+               const std::function<void(const QString &folder)> &chosen);
+
 } // namespace FileDialogs

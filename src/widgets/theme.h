@@ -24,6 +24,11 @@ inline const QColor selection{0x29, 0x86, 0xFF, 38};
 inline const QColor success{0x3F, 0xB9, 0x50};
 inline const QColor warning{0xF0, 0xA0, 0x20};
 inline const QColor error{0xE5, 0x48, 0x4D};
+/// The bars of the log's chart, told apart by their places and the legend as well.
+inline const QColor chartAlarm{0xE5, 0x48, 0x4D};
+inline const QColor chartEvent{0x29, 0x86, 0xFF};
+inline const QColor chartAudit{0x8F, 0x9B, 0xAB};
+inline const QColor chartOther{0x5A, 0x5A, 0x5A};
 
 inline constexpr int rowHeight = 36;
 

@@ -9,7 +9,8 @@ constexpr int stepMs = 60;
 constexpr int stepDegrees = 24;
 } // namespace
 
-WaitingSpinner::WaitingSpinner(QWidget *parent) : QWidget(parent) {
+WaitingSpinner::WaitingSpinner(QWidget *parent, const QString &picture)
+    : QWidget(parent), m_picture(picture) {
     setSizePolicy(QSizePolicy::Fixed, QSizePolicy::Fixed);
     m_turn.setInterval(stepMs);
     connect(&m_turn, &QTimer::timeout, this, [this] {
@@ -26,7 +27,7 @@ void WaitingSpinner::paintEvent(QPaintEvent *) {
     const qreal ratio = devicePixelRatioF();
     if (m_ring.isNull() || m_ring.devicePixelRatio() != ratio ||
         m_ring.deviceIndependentSize().toSize() != size())
-        m_ring = Icons::pixmap(QStringLiteral(":/images/progress_indicator_sm.svg"), size(), ratio);
+        m_ring = Icons::pixmap(m_picture, size(), ratio);
     QPainter painter(this);
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     painter.translate(QRectF(rect()).center());

@@ -9,7 +9,9 @@ class WaitingSpinner : public QWidget {
     Q_OBJECT
 
 public:
-    explicit WaitingSpinner(QWidget *parent = nullptr);
+    /// picture: the ring, a quarter open or so.
+    explicit WaitingSpinner(QWidget *parent = nullptr,
+                            const QString &picture = QStringLiteral(":/images/progress_indicator_sm.svg"));
 
     QSize sizeHint() const override;
 
@@ -19,6 +21,7 @@ protected:
     void hideEvent(QHideEvent *event) override;
 
 private:
+    QString m_picture;
     QTimer m_turn;
     int m_angle = 0;
     QPixmap m_ring;

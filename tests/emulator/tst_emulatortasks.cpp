@@ -85,6 +85,37 @@ private slots:
         QVERIFY(read("soon", "9").code == 3 && read("-1", "9").code == 3 && read(5, "9").code == 3);
     }
 
+    void settingsActAndAreJudged() {
+        fresh({"--log-entries", "800"});
+        const auto log = [&] {
+            return m_caller.call("/v1/logs/list", {{"start_time", "0"}, {"end_time", "99999999999999"}})
+                .data.at("items");
+        };
+        const std::size_t all = log().size();
+        for (const Json &bad : Json::array({{{"log_keepdays", 0}},
+                                            {{"log_keepdays", 1096}},
+                                            {{"days", "3"}},
+                                            {{"svr_fw_upload_limit", 51}},
+                                            {{"rp_keepnum", 2.5}},
+                                            {{"nf_alarms", 1}},
+                                            {{"ui_lang", nullptr}},
+                                            {{"nf_tasks", false}, {"rp_auto", "no"}}})) {
+            QVERIFY2(code("/v1/config/set", bad) == 3, bad.dump().c_str());
+        }
+        COMPARE_JSON(m_caller.call("/v1/config/get").data.at("nf_tasks"), true);
+        QCOMPARE(log().size(), all);
+        QCOMPARE(code("/v1/config/set", {{"days", 4}, {"color", 7}, {"nf_tasks", true}}), 0);
+        const Json left = log();
+        // Half of the eight days, and the entry about the change.
+        QVERIFY(left.size() > all / 3 && left.size() < all * 2 / 3);
+        COMPARE_JSON(left[0].at("description"), "Settings changed: log_keepdays 30 -> 4");
+        COMPARE_JSON(left[0].at("user"), "admin");
+        QCOMPARE(code("/v1/config/set", {{"log_keepdays", 4}}), 0);
+        QCOMPARE(code("/v1/site/new", {{"sitename", "Hall"}, {"parentid", ""}}), 0);
+        COMPARE_JSON(log()[0].at("description"), "Site added: Hall");
+        QCOMPARE(log().size(), left.size() + 1);
+    }
+
     void survivesCrash() {
         fresh();
         runUnder(newTask("deviceCustomCommand", 3));

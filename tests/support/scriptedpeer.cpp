@@ -1,5 +1,7 @@
 #include "scriptedpeer.h"
 
+#include "nvlcrypto.h"
+
 #include <netinet/in.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -151,6 +153,15 @@ std::string ScriptedPeer::http(int status, const std::string &body, const std::v
 
 ScriptedPeer::Reply ScriptedPeer::json(const nlohmann::json &body, const std::vector<std::string> &headers) {
     return {http(200, body.dump(), headers)};
+}
+
+ScriptedPeer::Reply ScriptedPeer::sealed(const nlohmann::json &data) {
+    const std::string plain = data.dump();
+    char *out = nullptr;
+    require(dataToCypher(plain.data(), plain.size(), &out) == 0, "cipher");
+    const std::string text(out);
+    nvlcryptoFree(out);
+    return json({{"code", 0}, {"data", text}});
 }
 
 void ScriptedPeer::serve() {

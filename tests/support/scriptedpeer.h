@@ -78,6 +78,8 @@ public:
                             const std::vector<std::string> &headers = {});
     /// An answer of the service: status 200 and the JSON.
     static Reply json(const nlohmann::json &body, const std::vector<std::string> &headers = {});
+    /// The same with code 0 and ciphered data.
+    static Reply sealed(const nlohmann::json &data);
 
 private:
     struct Tls;

@@ -2,7 +2,6 @@
 
 #include "ciphers.h"
 #include "localstore.h"
-#include "nvlcrypto.h"
 #include "scriptedpeer.h"
 
 #include <mutex>
@@ -64,15 +63,6 @@ public:
     }
 
 private:
-    static ScriptedPeer::Reply sealed(const nlohmann::json &data) {
-        const std::string plain = data.dump();
-        char *out = nullptr;
-        dataToCypher(plain.data(), plain.size(), &out);
-        const std::string text(out);
-        nvlcryptoFree(out);
-        return ScriptedPeer::json({{"code", 0}, {"data", text}});
-    }
-
     ScriptedPeer::Reply answer(const ScriptedPeer::Request &request) {
         const std::lock_guard lock(m_mutex);
         if (request.path == m_held)
@@ -80,21 +70,21 @@ private:
         if (const auto code = m_codes.find(request.path); code != m_codes.end() && code->second != 0)
             return ScriptedPeer::json({{"code", code->second}});
         if (request.path == "/v1/alarm/list")
-            return sealed(m_alarms);
+            return ScriptedPeer::sealed(m_alarms);
         if (request.path == "/v1/task/init")
-            return sealed(m_made.is_null() ? makeTask(request.json()) : m_made);
+            return ScriptedPeer::sealed(m_made.is_null() ? makeTask(request.json()) : m_made);
         if (request.path == "/v1/site/list")
-            return sealed(nlohmann::json::array());
+            return ScriptedPeer::sealed(nlohmann::json::array());
         if (request.path != "/v1/task/list")
             return ScriptedPeer::json({{"code", 0}, {"data", nullptr}});
         if (!m_tasks.is_array())
-            return sealed(m_tasks);
+            return ScriptedPeer::sealed(m_tasks);
         const std::size_t start = request.json()["start"];
         const std::size_t count = request.json()["count"];
         nlohmann::json page = nlohmann::json::array();
         for (std::size_t i = start; i < std::min(start + count, m_tasks.size()); ++i)
             page.push_back(m_tasks[i]);
-        return sealed(page);
+        return ScriptedPeer::sealed(page);
     }
 
     nlohmann::json makeTask(const nlohmann::json &asked) {
