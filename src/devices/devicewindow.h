@@ -7,7 +7,6 @@
 #include "nettask.h"
 #include "operationtargets.h"
 
-#include <QElapsedTimer>
 #include <QPointer>
 #include <QWidget>
 
@@ -19,6 +18,7 @@ class DeviceFooter;
 class DeviceMonitor;
 class DeviceTabs;
 class DeviceToolBar;
+class InventoryUpdater;
 class NoticeBar;
 class QSplitter;
 class QTimer;
@@ -72,7 +72,6 @@ private:
     void connectOperations();
     void addShortcuts();
 
-    void onTick();
     void onTaskListUpdated();
     void openAddDialog();
     void on_authorizeButton_clicked();
@@ -86,7 +85,6 @@ private:
     void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
     void on_deleteButton_clicked();
     void exportDeviceList();
-    void onDevicesDeleted();
     void ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed);
 
     void applySearch(const QString &text);
@@ -117,13 +115,13 @@ private:
 
     DeviceInventory m_inventory;
     std::unique_ptr<DeviceMonitor> m_monitor;
-    NetTask::Owner m_netTask;
     NetTask::Owner m_refreshTask;
 
     QSplitter *m_splitter;
     QWidget *m_console; ///< right of the tree
     SiteTree *m_siteTree;
     SiteCommit *m_siteCommit;
+    InventoryUpdater *m_updater;
     DeviceActions *m_actions;
     DeviceToolBar *m_toolBar;
     NoticeBar *m_noticeBar;
@@ -134,13 +132,6 @@ private:
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
     std::vector<DeviceRecordPtr> m_selected;
-    QElapsedTimer m_sinceReading; ///< since the last reading began, then since it ended
-    qint64 m_readingMs = 0;       ///< how long it took
-    int m_answersSinceReading = 0;
     bool m_tasksRunning = false;
     bool m_online = false;
-    bool m_reloading = false;
-    bool m_reloadWanted = false;
-    bool m_everRead = false;
-    bool m_lastReadFailed = false;
 };
