@@ -4,11 +4,13 @@
 #include "badgebutton.h"
 #include "devicewindow.h"
 #include "icons.h"
+#include "postwork.h"
 #include "sidepanel.h"
 
 #include <QButtonGroup>
 #include <QCursor>
 #include <QDebug>
+#include <QDir>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QSplitter>
@@ -58,6 +60,7 @@ MainWindow::MainWindow(QWidget *parent)
     m_splitter->setSizes({1000, sidePanelWidth});
     m_sidePanel->hide();
     connectPanels();
+    connectPostWork();
 }
 
 MainWindow::~MainWindow() {
@@ -105,6 +108,15 @@ void MainWindow::connectPanels() {
                 m_navigation->button(0)->setChecked(true);
                 m_deviceWindow->selectDevice(deviceId, ip);
             });
+}
+
+void MainWindow::connectPostWork() {
+    CPostWork &work = CPostWork::instance();
+    connect(&work, &CPostWork::exported, m_deviceWindow, [this](const QString &path) {
+        m_deviceWindow->showDefAnimateMsgDlg(
+            tr("Debug information saved as “%1”.").arg(QDir::toNativeSeparators(path)));
+    });
+    connect(&work, &CPostWork::exportFailed, m_deviceWindow, &DeviceWindow::showDefAnimateMsgDlg);
 }
 
 /// A button opens its panel, and closes it when it is the one that is open.

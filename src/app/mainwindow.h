@@ -28,6 +28,7 @@ private:
     QWidget *buildRail();
     BadgeButton *addRailButton(QWidget *rail, const char *name, const QString &icon, const QString &text);
     void connectPanels();
+    void connectPostWork();
     void togglePanel(QToolButton *button);
     void showPanelButtons();
 

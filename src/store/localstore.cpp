@@ -9,6 +9,7 @@
 namespace {
 const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
+const QString kPendingExports = QStringLiteral("kPendingExports");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -91,4 +92,12 @@ QString CLocalStore::defaultFilePath() const {
 
 bool CLocalStore::setDefaultFilePath(const QString &folder) {
     return m_store.replace(kDefaultFilePath, folder);
+}
+
+QString CLocalStore::pendingExports() const {
+    return m_store.query(kPendingExports);
+}
+
+bool CLocalStore::setPendingExports(const QString &json) {
+    return m_store.replace(kPendingExports, json);
 }

@@ -46,6 +46,10 @@ public:
     QString defaultFilePath() const;
     bool setDefaultFilePath(const QString &folder);
 
+    /// JSON text of the exports that were asked for and not collected; empty where none is stored.
+    QString pendingExports() const;
+    bool setPendingExports(const QString &json);
+
 private:
     CLocalStore();
 
