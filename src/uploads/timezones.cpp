@@ -87,6 +87,11 @@ QTimeZone zoneOf(const QString &posix) {
     return isPosix(posix) ? QTimeZone(posix.toLatin1()) : QTimeZone();
 }
 
+/// Of the list, which needs no second look.
+QTimeZone rulesOf(const Zone &zone) {
+    return QTimeZone(QByteArray(zone.posix));
+}
+
 /// "UTC-05:00"
 QString offsetText(int seconds) {
     const int minutes = std::abs(seconds) / 60;
@@ -113,7 +118,7 @@ std::span<const Zone> all() {
 }
 
 QString text(const Zone &zone) {
-    const QTimeZone rules = zoneOf(QLatin1String(zone.posix));
+    const QTimeZone rules = rulesOf(zone);
     return QStringLiteral("(%1) %2").arg(
         offsetText(rules.standardTimeOffset(QDateTime::currentDateTimeUtc())),
         QCoreApplication::translate("TimeZones", zone.cities));
@@ -127,9 +132,8 @@ int find(const QString &posix) {
 
 int likeThisComputers() {
     const std::array<int, 4> own = seasons(QTimeZone::systemTimeZone());
-    const auto found = std::find_if(std::begin(zones), std::end(zones), [&](const Zone &zone) {
-        return seasons(zoneOf(QLatin1String(zone.posix))) == own;
-    });
+    const auto found = std::find_if(std::begin(zones), std::end(zones),
+                                    [&](const Zone &zone) { return seasons(rulesOf(zone)) == own; });
     return found == std::end(zones) ? -1 : static_cast<int>(found - std::begin(zones));
 }
 
