@@ -234,6 +234,8 @@ DeviceRecordPtr parse(const JSON &value) {
     record->deviceClass = classOf(stringMember(value, "d_svrtype"));
     record->siteIds = siteIdsOf(value);
     record->networkType = stringMember(value, "d_nettype");
+    // Unlike the column: a write-protected card is of no use to who wants to store something.
+    record->hasCard = textMember(value, "d_sdstatus") == "ready";
     record->policy = policyOf(value);
     readColumns(value, *record);
     for (const DeviceColumn column :

@@ -44,6 +44,7 @@ struct DeviceRecord {
     DeviceClass deviceClass = DeviceClass::Others;
     QStringList siteIds;
     QString networkType;   ///< empty where the record has none
+    bool hasCard = false;  ///< a memory card is in that takes files
     PasswordPolicy policy; ///< for the passwords of its accounts
     /// What the columns show, "--" for what the record lacks. The status column's text stands elsewhere.
     std::array<QString, deviceColumnCount> texts;

@@ -55,6 +55,17 @@ constexpr auto refreshDelay = 2000ms;
 constexpr auto selectionLogDelay = 200ms;
 constexpr int siteTreeWidth = 248;
 
+/// The entries of the tool bar whose dialogs stand elsewhere.
+constexpr std::pair<const char *, UploadKind> uploadEntries[] = {
+    {"uploadFirmwareAction", UploadKind::Firmware},
+    {"uploadPackageAction", UploadKind::Package},
+    {"uploadConfigurationAction", UploadKind::Configuration},
+    {"uploadHttpsAction", UploadKind::HttpsCertificate},
+    {"uploadIeeeAction", UploadKind::IeeeCertificate},
+    {"certificateListAction", UploadKind::CertificateList},
+    {"exportDebugInfoAction", UploadKind::DebugInfo},
+};
+
 } // namespace
 
 DeviceWindow::DeviceWindow(QWidget *parent)
@@ -174,6 +185,11 @@ void DeviceWindow::connectOperations() {
     };
     for (const auto &[name, slot] : entries)
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this, slot);
+    for (const auto &[name, kind] : uploadEntries)
+        connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this,
+                [this, kind = kind] { emit uploadWanted(kind, targetsOf(m_selected)); });
+    connect(m_toolBar->button(QStringLiteral("quickSettingButton")), &QToolButton::clicked, this,
+            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(m_selected)); });
     connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
@@ -268,6 +284,10 @@ std::vector<DeviceRecordPtr> DeviceWindow::devicesWith(const QStringList &ids) c
 
 OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr> &devices) const {
     return OperationTargets::of(devices, m_inventory, *CTaskInfoPool::instance().taskList());
+}
+
+OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
+    return targetsOf(devicesWith(ids));
 }
 
 void DeviceWindow::on_authorizeButton_clicked() {
@@ -551,10 +571,12 @@ void DeviceWindow::onSelectionChanged() {
         m_selected.push_back(m_inventory.snapshot()->at(device));
     qDebug("device selected: %d", static_cast<int>(m_selected.size()));
     m_selectionLogDelay->start();
-    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "restartButton",
-                             "restoreButton", "deleteButton"})
+    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "uploadButton",
+                             "quickSettingButton", "restartButton", "restoreButton", "deleteButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(!m_selected.empty());
     m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(!m_selected.empty());
+    for (const auto &[name, kind] : uploadEntries)
+        m_toolBar->entry(QLatin1String(name))->setEnabled(!m_selected.empty());
     m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount(), table->unfilteredCount());
 }
 

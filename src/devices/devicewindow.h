@@ -6,6 +6,7 @@
 #include "inventoryreader.h"
 #include "nettask.h"
 #include "operationtargets.h"
+#include "uploadkind.h"
 
 #include <QPointer>
 #include <QWidget>
@@ -40,6 +41,9 @@ public:
     /// Ends that and forgets everything that was shown.
     void stopWork();
 
+    /// What operations have to know of those of the devices that are still managed.
+    OperationTargets::List targetsWith(const QStringList &ids) const;
+
     /// True while there are changes of sites that were not sent.
     bool hasPendingEdits() const;
     void discardEdits();
@@ -65,6 +69,8 @@ signals:
     void disconnectRequested();
     /// A server of the saved list was chosen in place of the present one.
     void remoteServerChosen(const QString &serverId);
+    /// An operation was chosen for the selected devices that is none of the console's own.
+    void uploadWanted(UploadKind kind, const OperationTargets::List &targets);
 
 private:
     void buildLayout();

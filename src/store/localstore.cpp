@@ -10,6 +10,7 @@ namespace {
 const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
 const QString kUiLanguage = QStringLiteral("kUiLanguage");
+const QString kPendingExports = QStringLiteral("kPendingExports");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -100,4 +101,12 @@ QString CLocalStore::uiLanguage() const {
 
 bool CLocalStore::setUiLanguage(const QString &language) {
     return m_store.replace(kUiLanguage, language);
+}
+
+QString CLocalStore::pendingExports() const {
+    return m_store.query(kPendingExports);
+}
+
+bool CLocalStore::setPendingExports(const QString &json) {
+    return m_store.replace(kPendingExports, json);
 }

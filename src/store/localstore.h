@@ -49,6 +49,9 @@ public:
     /// Code of the language that the windows are to speak; empty for that of the system.
     QString uiLanguage() const;
     bool setUiLanguage(const QString &language);
+    /// JSON text of the exports that were asked for and not collected; empty where none is stored.
+    QString pendingExports() const;
+    bool setPendingExports(const QString &json);
 
 private:
     CLocalStore();

@@ -13,7 +13,12 @@ namespace FileDialogs {
 void askSavePath(QWidget *parent, const QString &title, const QString &suggestion, const QString &filter,
                  const QString &suffix, const std::function<void(const QString &path)> &chosen);
 
-void askFolder(QWidget *parent, const QString &title, const QString &suggestion,
-               const std::function<void(const QString &folder)> &chosen);
+/// Asks for a file that exists, beginning in the folder.
+void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
+                 const std::function<void(const QString &path)> &chosen);
+
+/// Asks for a folder that exists, beginning in the given one.
+void askFolder(QWidget *parent, const QString &title, const QString &folder,
+               const std::function<void(const QString &path)> &chosen);
 
 } // namespace FileDialogs
