@@ -235,6 +235,7 @@ DeviceRecordPtr parse(const JSON &value) {
     record->siteIds = siteIdsOf(value);
     record->networkType = stringMember(value, "d_nettype");
     record->policy = policyOf(value);
+    record->certificates = DeviceCertificates::of(value);
     readColumns(value, *record);
     for (const DeviceColumn column :
          {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {
