@@ -9,6 +9,9 @@
 namespace {
 const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
+const QString kFwUploadOnlyApplyFail = QStringLiteral("kFwUploadOnlyApplyFail");
+const QString kFWUploadScheduleOnOff = QStringLiteral("kFWUploadScheduleOnOff");
+const QString kFwRolloutsPrefix = QStringLiteral("kFwRollouts_");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -91,4 +94,28 @@ QString CLocalStore::defaultFilePath() const {
 
 bool CLocalStore::setDefaultFilePath(const QString &folder) {
     return m_store.replace(kDefaultFilePath, folder);
+}
+
+bool CLocalStore::isFwUploadOnlyApplyFail() const {
+    return m_store.queryFlag(kFwUploadOnlyApplyFail);
+}
+
+bool CLocalStore::setFwUploadOnlyApplyFail(bool on) {
+    return m_store.replaceFlag(kFwUploadOnlyApplyFail, on);
+}
+
+bool CLocalStore::isFWUploadScheduleOn() const {
+    return m_store.queryFlag(kFWUploadScheduleOnOff);
+}
+
+bool CLocalStore::setFWUploadScheduleOn(bool on) {
+    return m_store.replaceFlag(kFWUploadScheduleOnOff, on);
+}
+
+QString CLocalStore::fwRollouts(const QString &session) const {
+    return m_store.query(kFwRolloutsPrefix + session);
+}
+
+bool CLocalStore::setFwRollouts(const QString &session, const QString &json) {
+    return m_store.replace(kFwRolloutsPrefix + session, json);
 }
