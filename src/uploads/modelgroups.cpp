@@ -24,11 +24,12 @@ std::vector<ModelGroup> of(const OperationTargets::List &targets) {
     QHash<QString, std::size_t> places;
     for (std::size_t i = 0; i < targets.size(); ++i) {
         const QString &model = targets[i].device->text(DeviceColumn::Model);
-        if (!places.contains(model)) {
-            places.insert(model, groups.size());
+        const std::size_t place = places.value(model, groups.size());
+        if (place == groups.size()) {
+            places.insert(model, place);
             groups.push_back({model, {}, {}});
         }
-        groups[places[model]].targets.push_back(static_cast<int>(i));
+        groups[place].targets.push_back(static_cast<int>(i));
     }
     for (ModelGroup &group : groups)
         group.versions = versionsOf(group.targets, targets);

@@ -55,7 +55,7 @@ struct UploadFirmwareDialog::Start {
 
 UploadFirmwareDialog::UploadFirmwareDialog(OperationTargets::List targets, QWidget *parent)
     : OperationDialog(tr("Upload Firmware"), parent),
-      m_all(std::move(targets)),
+      m_all(std::make_shared<const OperationTargets::List>(std::move(targets))),
       m_file(new UploadFileField(body())),
       m_table(new CheckTable(body())),
       m_groups(new ModelGroupModel(this)),
@@ -65,7 +65,7 @@ UploadFirmwareDialog::UploadFirmwareDialog(OperationTargets::List targets, QWidg
     setObjectName(QStringLiteral("UploadFirmwareDialog"));
     content()->setFixedWidth(contentWidth);
     buildFile();
-    buildDevices(m_all);
+    buildDevices(*m_all);
     buildTimes();
     finish(tr("Upload"), "uploadButton");
     connect(&std::as_const(*this).targets(), &TargetBox::tickedChanged, this,
@@ -119,12 +119,12 @@ void UploadFirmwareDialog::buildTimes() {
 }
 
 void UploadFirmwareDialog::readStart() {
-    QSet<QString> ids;
-    for (const OperationTarget &target : m_all)
-        ids.insert(target.device->id);
     NetJob::post(
         NetJob::createRunner("reading how earlier uploads went", NetTask::Turn::Beside), this,
-        [ids, tasks = CTaskInfoPool::instance().taskList()] {
+        [all = m_all, tasks = CTaskInfoPool::instance().taskList()] {
+            QSet<QString> ids;
+            for (const OperationTarget &target : *all)
+                ids.insert(target.device->id);
             const CLocalStore &store = CLocalStore::instance();
             return Start{store.isFWUploadScheduleOn(), store.isFwUploadOnlyApplyFail(),
                          store.defaultFilePath(), FirmwareHistory::lastFailed(*tasks, ids)};
@@ -200,18 +200,29 @@ void UploadFirmwareDialog::showMisfits() {
 }
 
 void UploadFirmwareDialog::onOnlyFailedToggled() {
-    for (const OperationTarget &target : targets().targets())
-        m_unticked.insert(target.device->id);
-    for (const QString &id : targets().tickedIds())
-        m_unticked.remove(id);
-    for (const int each : m_leftOut)
-        m_unticked.remove(targets().targets()[static_cast<std::size_t>(each)].device->id);
+    noteUnticked();
     OperationTargets::List shown;
-    for (const OperationTarget &target : m_all) {
+    for (const OperationTarget &target : *m_all) {
         if (!m_onlyFailed->isChecked() || m_failed->contains(target.device->id))
             shown.push_back(target);
     }
     showTargets(std::move(shown));
+}
+
+/// What the user has left out of those that are shown; what the image has kept out does not count.
+void UploadFirmwareDialog::noteUnticked() {
+    const OperationTargets::List &shown = targets().targets();
+    std::vector<bool> isWanted(shown.size());
+    for (const int each : targets().ticked())
+        isWanted[static_cast<std::size_t>(each)] = true;
+    for (const int each : m_leftOut)
+        isWanted[static_cast<std::size_t>(each)] = true;
+    for (std::size_t i = 0; i < shown.size(); ++i) {
+        if (!isWanted[i])
+            m_unticked.insert(shown[i].device->id);
+        else if (!m_unticked.isEmpty())
+            m_unticked.remove(shown[i].device->id);
+    }
 }
 
 void UploadFirmwareDialog::showTargets(OperationTargets::List shown) {

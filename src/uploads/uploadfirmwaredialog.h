@@ -5,6 +5,7 @@
 
 #include <QSet>
 
+#include <memory>
 #include <optional>
 
 class CheckTable;
@@ -40,6 +41,7 @@ private:
 
     void onFileChanged();
     void onOnlyFailedToggled();
+    void noteUnticked();
     void onTicked();
     void onGroupToggled(int group, bool checked);
     void showTargets(OperationTargets::List targets);
@@ -53,7 +55,8 @@ private:
     void keepChoices() const;
     bool startUpload();
 
-    OperationTargets::List m_all;          ///< those that the dialog was opened for
+    /// Those that the dialog was opened for; never changed, for a runner reads them too.
+    const std::shared_ptr<const OperationTargets::List> m_all;
     QSet<QString> m_unticked;              ///< while they are not among those that are shown
     std::optional<QSet<QString>> m_failed; ///< devices whose last upload failed, once that is known
     FirmwareHead m_head;

@@ -1,5 +1,7 @@
 #include "rollout.h"
 
+#include "apiclient.h"
+#include "emulatorprocess.h"
 #include "fakelists.h"
 #include "isolatedroot.h"
 #include "nvldmstore.h"
@@ -96,6 +98,8 @@ private slots:
     void comesBackFromItsRecord();
     void endsWithTheSessionAndNotWithTheProgram();
     void imageThatHasChangedIsNotSent();
+    void wavesReachTheDevices_data();
+    void wavesReachTheDevices();
 
 private:
     IsolatedRoot m_root;
@@ -318,6 +322,53 @@ void TestRollout::imageThatHasChangedIsNotSent() {
     QTRY_COMPARE(rollout.state(), State::Stopped);
     QVERIFY(rollout.progress().reasonText.contains("changed"));
     QVERIFY(service.sentTo("/v1/task/init").empty());
+    CTaskInfoPool::instance().clear();
+    StoreWriter::flush();
+}
+
+void TestRollout::wavesReachTheDevices_data() {
+    QTest::addColumn<QByteArray>("image");
+    QTest::addColumn<State>("end");
+    QTest::addColumn<int>("updated");
+    QTest::newRow("fits") << QByteArray("NVLFW1 N 99.9.9\n") << State::Done << 5;
+    QTest::newRow("fits nothing") << QByteArray("NVLFW1 X 99.9.9\n") << State::Stopped << 0;
+}
+
+/// Both waves through the queue to a service that works like the real one.
+void TestRollout::wavesReachTheDevices() {
+    QFETCH(const QByteArray, image);
+    const QTemporaryDir folder;
+    EmulatorProcess emulator(folder.path());
+    QVERIFY(emulator.start({"--devices", "8", "--account", "a@b.example:Passw0rd!", "--task-pace", "20"}));
+    QVERIFY(emulator.command("admit all").startsWith("ok"));
+    CApiClient client("127.0.0.1", emulator.port());
+    QCOMPARE(client.loginServer("a@b.example", "Passw0rd!"), unsigned(ApiOk));
+    CLocalStore::instance().setLoginInfo("127.0.0.1", emulator.port(), "a@b.example",
+                                         CLocalStore::instance().access());
+    const auto devices = [&] {
+        JSON page;
+        client.listDevices(0, 500, page);
+        return page;
+    };
+    RolloutPlan waves;
+    m_root.write("wave.bin", image);
+    waves.image = UploadFile::inspect(m_root.filePath("wave.bin"));
+    for (const JSON &device : devices())
+        waves.deviceIds += stringMember(device, "id");
+    waves.deviceIds = waves.deviceIds.mid(0, 5);
+    waves.firstCount = 2;
+    RolloutMgr::instance().start(waves);
+    const Rollout &rollout = *RolloutMgr::instance().rollouts().at(0);
+    QTimer poll;
+    connect(&poll, &QTimer::timeout, this, [] { CTaskInfoPool::instance().loadTaskStatuses(); });
+    poll.start(100);
+    QTRY_VERIFY_WITH_TIMEOUT(!rollout.isRunning(), 20000);
+    QTEST(rollout.state(), "end");
+    const JSON all = devices();
+    QTEST(static_cast<int>(std::count_if(
+              all.begin(), all.end(), [](const JSON &each) { return each.value("d_fw", "") == "99.9.9"; })),
+          "updated");
+    CLocalStore::instance().clearLoginInfo();
     CTaskInfoPool::instance().clear();
     StoreWriter::flush();
 }
