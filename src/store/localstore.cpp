@@ -11,6 +11,9 @@ const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
 const QString kUiLanguage = QStringLiteral("kUiLanguage");
 const QString kPendingExports = QStringLiteral("kPendingExports");
+const QString kFwUploadOnlyApplyFail = QStringLiteral("kFwUploadOnlyApplyFail");
+const QString kFWUploadScheduleOnOff = QStringLiteral("kFWUploadScheduleOnOff");
+const QString kFwRolloutsPrefix = QStringLiteral("kFwRollouts_");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -109,4 +112,28 @@ QString CLocalStore::pendingExports() const {
 
 bool CLocalStore::setPendingExports(const QString &json) {
     return m_store.replace(kPendingExports, json);
+}
+
+bool CLocalStore::isFwUploadOnlyApplyFail() const {
+    return m_store.queryFlag(kFwUploadOnlyApplyFail);
+}
+
+bool CLocalStore::setFwUploadOnlyApplyFail(bool on) {
+    return m_store.replaceFlag(kFwUploadOnlyApplyFail, on);
+}
+
+bool CLocalStore::isFWUploadScheduleOn() const {
+    return m_store.queryFlag(kFWUploadScheduleOnOff);
+}
+
+bool CLocalStore::setFWUploadScheduleOn(bool on) {
+    return m_store.replaceFlag(kFWUploadScheduleOnOff, on);
+}
+
+QString CLocalStore::fwRollouts(const QString &session) const {
+    return m_store.query(kFwRolloutsPrefix + session);
+}
+
+bool CLocalStore::setFwRollouts(const QString &session, const QString &json) {
+    return m_store.replace(kFwRolloutsPrefix + session, json);
 }

@@ -9,6 +9,10 @@ class QWidget;
 /// Asks for files, without an event loop of its own; nothing is called when the user gives it up.
 namespace FileDialogs {
 
+/// An existing file. folder: where to begin; filter: as QFileDialog takes it.
+void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
+                 const std::function<void(const QString &path)> &chosen);
+
 /// filter: as QFileDialog takes it. suggestion: folder and name; a missing suffix is added.
 void askSavePath(QWidget *parent, const QString &title, const QString &suggestion, const QString &filter,
                  const QString &suffix, const std::function<void(const QString &path)> &chosen);

@@ -44,6 +44,11 @@ public:
         const std::lock_guard lock(m_mutex);
         m_made = std::move(data);
     }
+    /// From now on requests to the path are answered with this, ciphered.
+    void setAnswer(const std::string &path, nlohmann::json data) {
+        const std::lock_guard lock(m_mutex);
+        m_answers[path] = std::move(data);
+    }
     /// From now on requests to the path are read and never answered; an empty path ends it.
     void hold(const std::string &path) {
         const std::lock_guard lock(m_mutex);
@@ -77,6 +82,8 @@ private:
             return ScriptedPeer::json({{"code", code->second}});
         if (const auto reply = m_replies.find(request.path); reply != m_replies.end())
             return reply->second;
+        if (const auto given = m_answers.find(request.path); given != m_answers.end())
+            return ScriptedPeer::sealed(given->second);
         if (request.path == "/v1/alarm/list")
             return ScriptedPeer::sealed(m_alarms);
         if (request.path == "/v1/task/init")
@@ -113,6 +120,7 @@ private:
     nlohmann::json m_alarms = {{"items", nlohmann::json::array()}, {"total_items", 0}};
     std::map<std::string, int> m_codes;
     std::map<std::string, ScriptedPeer::Reply> m_replies;
+    std::map<std::string, nlohmann::json> m_answers;
     std::string m_held;
     std::map<std::string, std::vector<std::string>> m_sent;
     ScriptedPeer m_peer;
