@@ -7,8 +7,10 @@
 #include "icons.h"
 #include "logwindow.h"
 #include "postwork.h"
+#include "rolloutstrip.h"
 #include "settingwindow.h"
 #include "sidepanel.h"
+#include "uploaddialogs.h"
 
 #include <QButtonGroup>
 #include <QCursor>
@@ -69,6 +71,8 @@ MainWindow::MainWindow(QWidget *parent)
     connectPages();
     connectPanels();
     connectPostWork();
+    new UploadDialogs(m_deviceWindow);
+    m_deviceWindow->addStrip(new RolloutStrip(m_deviceWindow));
 }
 
 MainWindow::~MainWindow() {

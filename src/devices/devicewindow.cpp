@@ -122,6 +122,11 @@ void DeviceWindow::buildLayout() {
     layout->addWidget(m_splitter);
 }
 
+void DeviceWindow::addStrip(QWidget *strip) {
+    auto *layout = static_cast<QVBoxLayout *>(m_console->layout());
+    layout->insertWidget(layout->indexOf(m_footer), strip);
+}
+
 void DeviceWindow::connectParts() {
     connect(m_monitor.get(), &DeviceMonitor::updateStatus, this, &DeviceWindow::onUpdateDeviceStatus);
     connect(m_monitor.get(), &DeviceMonitor::serverAnswered, this, &DeviceWindow::onServerAnswered);

@@ -41,6 +41,8 @@ public:
     /// Ends that and forgets everything that was shown.
     void stopWork();
 
+    /// The devices of the last reading.
+    const DeviceSnapshotPtr &devices() const { return m_inventory.snapshot(); }
     /// What operations have to know of those of the devices that are still managed.
     OperationTargets::List targetsWith(const QStringList &ids) const;
 
@@ -56,6 +58,8 @@ public slots:
     void commitSites();
     /// Reads sites and devices again.
     void reload();
+    /// Puts a part between the tables and the footer.
+    void addStrip(QWidget *strip);
     /// Selects the device with the id, or else the one with the address, and brings it into view.
     void selectDevice(const QString &id, const QString &ip);
     /// Shows a transient message.
