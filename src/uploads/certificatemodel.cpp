@@ -7,10 +7,11 @@
 
 #include <QDateTime>
 #include <QLocale>
-#include <QMap>
 #include <QSet>
 
 #include <algorithm>
+#include <array>
+#include <bit>
 #include <limits>
 #include <map>
 
@@ -171,16 +172,18 @@ void CertificateModel::tellFiles() {
 
 /// How many of the checked devices cannot be served for which reason.
 QString CertificateModel::blockedText() const {
-    QMap<int, int> counts;
+    std::array<int, std::numeric_limits<int>::digits> counts{};
     for (int item = 0; item < itemCount(); ++item) {
         const CertificateFindings findings = m_findings[static_cast<std::size_t>(item)];
         if (isChecked(item) && CertificateCheck::blocks(findings))
-            ++counts[CertificateCheck::first(findings)];
+            ++counts[static_cast<std::size_t>(std::countr_zero(unsigned(findings.toInt())))];
     }
     QStringList reasons;
-    for (auto reason = counts.cbegin(); reason != counts.cend(); ++reason)
-        reasons += tr("%1 (%2)").arg(CertificateCheck::note(static_cast<CertificateFinding>(reason.key())),
-                                     QLocale().toString(reason.value()));
+    for (const CertificateFinding finding : CertificateCheck::all()) {
+        const int count = counts[static_cast<std::size_t>(std::countr_zero(unsigned(finding)))];
+        if (count > 0)
+            reasons += tr("%1 (%2)").arg(CertificateCheck::note(finding), QLocale().toString(count));
+    }
     return reasons.join(tr(", "));
 }
 

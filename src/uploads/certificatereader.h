@@ -39,6 +39,8 @@ private:
     };
 
     void readSome();
+    void onRead(const Files &files);
+    void drop(qsizetype count);
 
     std::deque<Order> m_orders;
     int m_left = 0;
