@@ -5,6 +5,7 @@
 #include "accountsetupdialog.h"
 #include "confirmdialog.h"
 #include "devicewindow.h"
+#include "exetaskmgr.h"
 #include "idlewatch.h"
 #include "localstore.h"
 #include "logindialog.h"
@@ -21,6 +22,7 @@
 #include "taskinfopool.h"
 #include "titlebar.h"
 #include "transientmessage.h"
+#include "uploadtaskmgr.h"
 #include "welcomepage.h"
 
 #include <QApplication>
@@ -246,10 +248,16 @@ void FramelessWindow::onLogOff() {
     });
 }
 
+/// Whether a log-off would cut work that the service has not begun yet.
+bool FramelessWindow::isTaskRequested() {
+    return CTaskInfoPool::instance().hasRequestedTask() || UploadTaskMgr::instance().isBusy() ||
+           ExeTaskMgr::instance().isBusy();
+}
+
 bool FramelessWindow::hasUnfinishedWork() const {
-    return m_loggedIn && (CTaskInfoPool::instance().hasRequestedTask() ||
-                          (m_content && (m_content->deviceWindow()->hasPendingEdits() ||
-                                         m_content->settingWindow()->hasUnsavedEdits())));
+    return m_loggedIn &&
+           (isTaskRequested() || (m_content && (m_content->deviceWindow()->hasPendingEdits() ||
+                                                m_content->settingWindow()->hasUnsavedEdits())));
 }
 
 /// Goes on at once, or when the user has agreed to leave behind what a log-off would lose: a task that was
@@ -259,7 +267,7 @@ void FramelessWindow::confirmUnfinished(std::function<void()> goOn) {
         return goOn();
     if (m_unfinishedConfirm && m_unfinishedConfirm->isVisible())
         return m_unfinishedConfirm->raise();
-    const auto kind = CTaskInfoPool::instance().hasRequestedTask()   ? ConfirmDialog::Kind::UnfinishedTask
+    const auto kind = isTaskRequested()                              ? ConfirmDialog::Kind::UnfinishedTask
                       : m_content->deviceWindow()->hasPendingEdits() ? ConfirmDialog::Kind::UnsavedSites
                                                                      : ConfirmDialog::Kind::UnsavedSettings;
     m_unfinishedConfirm = new ConfirmDialog(kind, this);
@@ -286,7 +294,7 @@ void FramelessWindow::onNotificationClicked(int type) {
 }
 
 void FramelessWindow::logoutIfIdle() {
-    if (CTaskInfoPool::instance().hasRunningTask())
+    if (CTaskInfoPool::instance().hasRunningTask() || isTaskRequested())
         return;
     if (m_idle->wasActiveSinceLastTick() || !m_loggedIn)
         return;

@@ -82,6 +82,7 @@ private:
     void connectParts();
     void connectServiceManagement();
     void probeLocalService();
+    static bool isTaskRequested();
     bool hasUnfinishedWork() const;
     void confirmUnfinished(std::function<void()> goOn);
     void endSession(Notice notice);

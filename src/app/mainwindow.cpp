@@ -6,12 +6,16 @@
 #include "devicewindow.h"
 #include "icons.h"
 #include "logwindow.h"
+#include "postwork.h"
+#include "rolloutstrip.h"
 #include "settingwindow.h"
 #include "sidepanel.h"
+#include "uploaddialogs.h"
 
 #include <QButtonGroup>
 #include <QCursor>
 #include <QDebug>
+#include <QDir>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QSplitter>
@@ -66,6 +70,9 @@ MainWindow::MainWindow(QWidget *parent)
     m_sidePanel->hide();
     connectPages();
     connectPanels();
+    connectPostWork();
+    new UploadDialogs(m_deviceWindow);
+    m_deviceWindow->addStrip(new RolloutStrip(m_deviceWindow));
 }
 
 MainWindow::~MainWindow() {
@@ -165,6 +172,15 @@ void MainWindow::connectPanels() {
                 m_navigation->button(DevicePage)->setChecked(true);
                 m_deviceWindow->selectDevice(deviceId, ip);
             });
+}
+
+void MainWindow::connectPostWork() {
+    CPostWork &work = CPostWork::instance();
+    connect(&work, &CPostWork::exported, m_deviceWindow, [this](const QString &path) {
+        m_deviceWindow->showDefAnimateMsgDlg(
+            tr("Debug information saved as “%1”.").arg(QDir::toNativeSeparators(path)));
+    });
+    connect(&work, &CPostWork::exportFailed, m_deviceWindow, &DeviceWindow::showDefAnimateMsgDlg);
 }
 
 /// A button opens its panel, and closes it when it is the one that is open.

@@ -45,6 +45,7 @@ private:
     BadgeButton *addRailButton(QWidget *rail, const char *name, const QString &icon, const QString &text);
     void connectPages();
     void connectPanels();
+    void connectPostWork();
     void navigateTo(int page);
     void askToLeave(const std::function<void()> &discard);
     void showPage(int page);

@@ -14,7 +14,7 @@
 
 #include <QAction>
 #include <QDebug>
-#include <QFileDialog>
+#include <QFileInfo>
 #include <QThreadPool>
 
 #include <nlohmann/json.hpp>
@@ -74,15 +74,6 @@ QString folderOfFiles() {
     return CLocalStore::instance().defaultFilePath();
 }
 
-void askOpenPath(QWidget *parent, const QString &title, const std::function<void(const QString &)> &chosen) {
-    auto *dialog = new QFileDialog(parent, title, folderOfFiles(), QStringLiteral("csv File(*.csv)"));
-    dialog->setObjectName(QStringLiteral("openFileDialog"));
-    dialog->setAttribute(Qt::WA_DeleteOnClose);
-    dialog->setFileMode(QFileDialog::ExistingFile);
-    QObject::connect(dialog, &QFileDialog::fileSelected, parent, chosen);
-    dialog->open();
-}
-
 } // namespace
 
 AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *parent)
@@ -93,7 +84,10 @@ AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *pare
       m_discovery(new DeviceDiscovery(this)) {
     setObjectName(QStringLiteral("AddDeviceDialog"));
     setWindowTitle(tr("Add Device"));
-    m_askOpenPath = [this](const auto &chosen) { askOpenPath(this, tr("Open File"), chosen); };
+    m_askOpenPath = [this](const auto &chosen) {
+        FileDialogs::askOpenPath(this, tr("Open File"), folderOfFiles(), QStringLiteral("csv File(*.csv)"),
+                                 chosen);
+    };
     m_askSavePath = [this](const auto &chosen) {
         const QString name = tr("Devices") + QStringLiteral(".csv");
         const QString folder = folderOfFiles();

@@ -234,7 +234,10 @@ DeviceRecordPtr parse(const JSON &value) {
     record->deviceClass = classOf(stringMember(value, "d_svrtype"));
     record->siteIds = siteIdsOf(value);
     record->networkType = stringMember(value, "d_nettype");
+    // Unlike the column: a write-protected card is of no use to who wants to store something.
+    record->hasCard = textMember(value, "d_sdstatus") == "ready";
     record->policy = policyOf(value);
+    record->certificates = DeviceCertificates::of(value);
     readColumns(value, *record);
     for (const DeviceColumn column :
          {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "devicecertificates.h"
 #include "json.h"
 #include "passwordpolicy.h"
 
@@ -44,7 +45,9 @@ struct DeviceRecord {
     DeviceClass deviceClass = DeviceClass::Others;
     QStringList siteIds;
     QString networkType;   ///< empty where the record has none
+    bool hasCard = false;  ///< a memory card is in that takes files
     PasswordPolicy policy; ///< for the passwords of its accounts
+    DeviceCertificates certificates;
     /// What the columns show, "--" for what the record lacks. The status column's text stands elsewhere.
     std::array<QString, deviceColumnCount> texts;
     /// What the columns are sorted by before their texts: numbers, addresses, versions, times, or the first

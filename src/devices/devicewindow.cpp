@@ -13,6 +13,7 @@
 #include "devicetabs.h"
 #include "devicetoolbar.h"
 #include "filedialogs.h"
+#include "inventoryupdater.h"
 #include "mainconsoletable.h"
 #include "messagelog.h"
 #include "noticebar.h"
@@ -52,23 +53,31 @@ namespace {
 
 constexpr auto refreshDelay = 2000ms;
 constexpr auto selectionLogDelay = 200ms;
-/// Polls tell of devices that come and go; what else others change shows with a reading once a minute.
-constexpr int answersBetweenReadings = 10;
 constexpr int siteTreeWidth = 248;
-/// While tasks run, readings take one part in so many of the time at most.
-constexpr int readingShare = 4;
+
+/// The entries of the tool bar whose dialogs stand elsewhere.
+constexpr std::pair<const char *, UploadKind> uploadEntries[] = {
+    {"uploadFirmwareAction", UploadKind::Firmware},
+    {"uploadPackageAction", UploadKind::Package},
+    {"uploadConfigurationAction", UploadKind::Configuration},
+    {"uploadHttpsAction", UploadKind::HttpsCertificate},
+    {"uploadIeeeAction", UploadKind::IeeeCertificate},
+    {"certificateListAction", UploadKind::CertificateList},
+    {"exportDebugInfoAction", UploadKind::DebugInfo},
+};
 
 } // namespace
 
 DeviceWindow::DeviceWindow(QWidget *parent)
     : QWidget(parent),
       m_monitor(std::make_unique<DeviceMonitor>(m_inventory)),
-      m_netTask(new (std::nothrow) NetTask),
       m_refreshTask(new (std::nothrow) NetTask),
       m_splitter(new QSplitter(this)),
       m_console(new QWidget(m_splitter)),
       m_siteTree(new SiteTree(m_splitter)),
       m_siteCommit(new SiteCommit(m_siteTree, this)),
+      m_updater(new InventoryUpdater(
+          m_inventory, [this] { return m_siteTree->edits().commitCount(); }, this)),
       m_actions(new DeviceActions(this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_noticeBar(new NoticeBar(m_console)),
@@ -77,7 +86,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_selectionLogDelay(new QTimer(this)) {
     qDebug("DeviceWindow constructor");
     setObjectName(QStringLiteral("DeviceWindow"));
-    if (!m_netTask || !m_refreshTask)
+    if (!m_refreshTask)
         qDebug("net task create failed!should not be this case!");
     m_selectionLogDelay->setSingleShot(true);
     m_selectionLogDelay->setInterval(selectionLogDelay);
@@ -113,11 +122,20 @@ void DeviceWindow::buildLayout() {
     layout->addWidget(m_splitter);
 }
 
+void DeviceWindow::addStrip(QWidget *strip) {
+    auto *layout = static_cast<QVBoxLayout *>(m_console->layout());
+    layout->insertWidget(layout->indexOf(m_footer), strip);
+}
+
 void DeviceWindow::connectParts() {
     connect(m_monitor.get(), &DeviceMonitor::updateStatus, this, &DeviceWindow::onUpdateDeviceStatus);
     connect(m_monitor.get(), &DeviceMonitor::serverAnswered, this, &DeviceWindow::onServerAnswered);
     connect(m_monitor.get(), &DeviceMonitor::serverLost, this, &DeviceWindow::onServerLost);
-    connect(m_monitor.get(), &DeviceMonitor::ticked, this, &DeviceWindow::onTick);
+    connect(m_monitor.get(), &DeviceMonitor::ticked, m_updater, &InventoryUpdater::reloadForTasks);
+    connect(m_updater, &InventoryUpdater::read, this, &DeviceWindow::onReading);
+    connect(m_updater, &InventoryUpdater::failed, this, &DeviceWindow::showContent);
+    connect(m_updater, &InventoryUpdater::statesRead, this, &DeviceWindow::onUpdateDeviceStatus);
+    connect(m_updater, &InventoryUpdater::statesSettled, this, [this] { m_monitor->forceRefresh(); });
     connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this,
             &DeviceWindow::onTaskListUpdated);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
@@ -172,10 +190,15 @@ void DeviceWindow::connectOperations() {
     };
     for (const auto &[name, slot] : entries)
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this, slot);
+    for (const auto &[name, kind] : uploadEntries)
+        connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this,
+                [this, kind = kind] { emit uploadWanted(kind, targetsOf(m_selected)); });
+    connect(m_toolBar->button(QStringLiteral("quickSettingButton")), &QToolButton::clicked, this,
+            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(m_selected)); });
     connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
-    connect(m_actions, &DeviceActions::devicesDeleted, this, &DeviceWindow::onDevicesDeleted);
+    connect(m_actions, &DeviceActions::devicesDeleted, m_updater, &InventoryUpdater::readStatesSoon);
     connect(m_actions, &DeviceActions::statesChanged, this, [this] { m_monitor->forceRefresh(); });
     connect(m_actions, &DeviceActions::passwordWanted, this,
             [this](const QStringList &ids) { openSetPasswordDialog(devicesWith(ids)); });
@@ -215,9 +238,7 @@ void DeviceWindow::stopWork() {
         m_reconnecting->close();
     if (m_refreshing)
         m_refreshing->close();
-    m_reloadWanted = false;
-    m_everRead = false;
-    m_lastReadFailed = false;
+    m_updater->stop();
     m_tasksRunning = false;
     m_online = false;
     m_inventory.replace(std::make_shared<DeviceSnapshot>(), {});
@@ -241,50 +262,7 @@ void DeviceWindow::loadRemoteServers() {
 }
 
 void DeviceWindow::reload() {
-    if (!CLocalStore::instance().loginInfo().isComplete())
-        return;
-    if (m_reloading) {
-        m_reloadWanted = true;
-        return;
-    }
-    const auto read = [snapshot = m_inventory.snapshot(),
-                       codes = m_inventory.statuses()](ServiceSession &session) {
-        return InventoryReader::readAll(session, snapshot, codes);
-    };
-    m_reloadWanted = false;
-    m_answersSinceReading = 0;
-    m_sinceReading.start();
-    m_reloading = ServiceRequest::post(
-        m_netTask.get(), this, read,
-        [this, commits = m_siteTree->edits().commitCount()](InventoryReader::Reading reading) {
-            // Sites that were read before a commit are older than the tree.
-            if (commits != m_siteTree->edits().commitCount())
-                reading.sites.reset();
-            onReading(reading);
-        },
-        [this](JobEnd end) {
-            m_reloading = false;
-            m_readingMs = m_sinceReading.restart();
-            if (end != JobEnd::Delivered && end != JobEnd::SessionGone) {
-                m_lastReadFailed = true;
-                showContent();
-            }
-            if (m_reloadWanted)
-                reload();
-        });
-    // The runner may still be busy with the last answer of a session that has ended.
-    m_reloadWanted = !m_reloading;
-}
-
-/// A task that has moved has changed devices, mostly. How soon they are read again depends on what that
-/// costs.
-void DeviceWindow::onTick() {
-    CTaskInfoPool &pool = CTaskInfoPool::instance();
-    if (m_reloading || m_reloadWanted || !pool.isTasksChanged() ||
-        m_sinceReading.elapsed() < m_readingMs * (readingShare - 1))
-        return;
-    reload();
-    pool.clearTasksChanged();
+    m_updater->reload();
 }
 
 void DeviceWindow::onTaskListUpdated() {
@@ -311,6 +289,10 @@ std::vector<DeviceRecordPtr> DeviceWindow::devicesWith(const QStringList &ids) c
 
 OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr> &devices) const {
     return OperationTargets::of(devices, m_inventory, *CTaskInfoPool::instance().taskList());
+}
+
+OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
+    return targetsOf(devicesWith(ids));
 }
 
 void DeviceWindow::on_authorizeButton_clicked() {
@@ -408,21 +390,6 @@ void DeviceWindow::ask(ConfirmDialog::Kind kind, const std::function<void()> &ag
     confirm->open();
 }
 
-/// The service needs a moment to let devices go; the next poll comes at once after it.
-void DeviceWindow::onDevicesDeleted() {
-    const auto read = [snapshot = m_inventory.snapshot(),
-                       codes = m_inventory.statuses()](ServiceSession &session) {
-        return InventoryReader::readStatus(session, snapshot, codes);
-    };
-    ServiceRequest::post(
-        NetJob::createRunner("reading the states after a removal"), this, read,
-        [this](const std::optional<DeviceStatusUpdate> &update) {
-            if (update)
-                onUpdateDeviceStatus(*update);
-        },
-        [this](JobEnd) { m_monitor->forceRefresh(); }, [] { std::this_thread::sleep_for(refreshDelay); });
-}
-
 void DeviceWindow::exportDeviceList() {
     const QString folder = CLocalStore::instance().defaultFilePath();
     const QString name = tr("Device List") + QStringLiteral(".csv");
@@ -469,11 +436,9 @@ void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     qDebug("update device info");
     if (reading.sites)
         m_siteTree->setSites(*reading.sites);
-    m_lastReadFailed = !reading.devices;
     if (reading.devices) {
         const DeviceSnapshotPtr previous = m_inventory.snapshot();
         m_inventory.replace(reading.devices, reading.codes);
-        m_everRead = true;
         m_tabs->refill();
         DeviceLog::tablesFilled(reading.devices, previous);
         m_footer->markUpdated();
@@ -502,8 +467,8 @@ void DeviceWindow::onServerAnswered() {
     }
     if (!m_online && !m_refreshing)
         openRefreshDialog();
-    else if (++m_answersSinceReading >= answersBetweenReadings)
-        reload();
+    else
+        m_updater->countAnswer();
 }
 
 void DeviceWindow::onServerLost() {
@@ -611,10 +576,12 @@ void DeviceWindow::onSelectionChanged() {
         m_selected.push_back(m_inventory.snapshot()->at(device));
     qDebug("device selected: %d", static_cast<int>(m_selected.size()));
     m_selectionLogDelay->start();
-    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "restartButton",
-                             "restoreButton", "deleteButton"})
+    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "uploadButton",
+                             "quickSettingButton", "restartButton", "restoreButton", "deleteButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(!m_selected.empty());
     m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(!m_selected.empty());
+    for (const auto &[name, kind] : uploadEntries)
+        m_toolBar->entry(QLatin1String(name))->setEnabled(!m_selected.empty());
     m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount(), table->unfilteredCount());
 }
 
@@ -623,9 +590,10 @@ void DeviceWindow::showStatusCounts() {
 }
 
 void DeviceWindow::showContent() {
-    const auto content = m_everRead         ? DeviceTab::Content::Read
-                         : m_lastReadFailed ? DeviceTab::Content::Failed
-                                            : DeviceTab::Content::Loading;
+    using Knowledge = InventoryUpdater::Knowledge;
+    const auto content = m_updater->knowledge() == Knowledge::Read     ? DeviceTab::Content::Read
+                         : m_updater->knowledge() == Knowledge::Failed ? DeviceTab::Content::Failed
+                                                                       : DeviceTab::Content::Loading;
     m_tabs->showContent(content, m_siteTree->currentSite() != Sites::overviewId);
 }
 

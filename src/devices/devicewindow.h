@@ -6,8 +6,8 @@
 #include "inventoryreader.h"
 #include "nettask.h"
 #include "operationtargets.h"
+#include "uploadkind.h"
 
-#include <QElapsedTimer>
 #include <QPointer>
 #include <QWidget>
 
@@ -19,6 +19,7 @@ class DeviceFooter;
 class DeviceMonitor;
 class DeviceTabs;
 class DeviceToolBar;
+class InventoryUpdater;
 class NoticeBar;
 class QSplitter;
 class QTimer;
@@ -40,6 +41,11 @@ public:
     /// Ends that and forgets everything that was shown.
     void stopWork();
 
+    /// The devices of the last reading.
+    const DeviceSnapshotPtr &devices() const { return m_inventory.snapshot(); }
+    /// What operations have to know of those of the devices that are still managed.
+    OperationTargets::List targetsWith(const QStringList &ids) const;
+
     /// True while there are changes of sites that were not sent.
     bool hasPendingEdits() const;
     void discardEdits();
@@ -52,6 +58,8 @@ public slots:
     void commitSites();
     /// Reads sites and devices again.
     void reload();
+    /// Puts a part between the tables and the footer.
+    void addStrip(QWidget *strip);
     /// Selects the device with the id, or else the one with the address, and brings it into view.
     void selectDevice(const QString &id, const QString &ip);
     /// Shows a transient message.
@@ -65,6 +73,8 @@ signals:
     void disconnectRequested();
     /// A server of the saved list was chosen in place of the present one.
     void remoteServerChosen(const QString &serverId);
+    /// An operation was chosen for the selected devices that is none of the console's own.
+    void uploadWanted(UploadKind kind, const OperationTargets::List &targets);
 
 private:
     void buildLayout();
@@ -72,7 +82,6 @@ private:
     void connectOperations();
     void addShortcuts();
 
-    void onTick();
     void onTaskListUpdated();
     void openAddDialog();
     void on_authorizeButton_clicked();
@@ -86,7 +95,6 @@ private:
     void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
     void on_deleteButton_clicked();
     void exportDeviceList();
-    void onDevicesDeleted();
     void ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed);
 
     void applySearch(const QString &text);
@@ -117,13 +125,13 @@ private:
 
     DeviceInventory m_inventory;
     std::unique_ptr<DeviceMonitor> m_monitor;
-    NetTask::Owner m_netTask;
     NetTask::Owner m_refreshTask;
 
     QSplitter *m_splitter;
     QWidget *m_console; ///< right of the tree
     SiteTree *m_siteTree;
     SiteCommit *m_siteCommit;
+    InventoryUpdater *m_updater;
     DeviceActions *m_actions;
     DeviceToolBar *m_toolBar;
     NoticeBar *m_noticeBar;
@@ -134,13 +142,6 @@ private:
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
     std::vector<DeviceRecordPtr> m_selected;
-    QElapsedTimer m_sinceReading; ///< since the last reading began, then since it ended
-    qint64 m_readingMs = 0;       ///< how long it took
-    int m_answersSinceReading = 0;
     bool m_tasksRunning = false;
     bool m_online = false;
-    bool m_reloading = false;
-    bool m_reloadWanted = false;
-    bool m_everRead = false;
-    bool m_lastReadFailed = false;
 };

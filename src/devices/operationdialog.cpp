@@ -25,6 +25,7 @@ OperationDialog::OperationDialog(const QString &title, QWidget *parent)
       m_layout(new QVBoxLayout(content())),
       m_body(new QWidget(content())),
       m_parts(new QVBoxLayout(m_body)),
+      m_footNote(label({}, "quiet")),
       m_complaint(namedLabel("msgWarningIcon", m_body), namedLabel("msgWarningLabel", m_body)) {
     setWindowTitle(title);
     setAttribute(Qt::WA_DeleteOnClose);
@@ -47,9 +48,10 @@ QWidget *OperationDialog::buildFooter(const QString &acceptText, const char *acc
     m_accept = new QPushButton(acceptText, footer);
     m_accept->setObjectName(QLatin1String(acceptName));
     m_accept->setDefault(true);
+    m_footNote->setObjectName(QStringLiteral("footNoteLabel"));
     auto *layout = new QHBoxLayout(footer);
     layout->setContentsMargins(20, 14, 20, 14);
-    layout->addStretch();
+    layout->addWidget(m_footNote, 1);
     layout->addWidget(cancel);
     layout->addWidget(m_accept);
     connect(cancel, &QPushButton::clicked, this, &QDialog::reject);
@@ -62,11 +64,24 @@ QWidget *OperationDialog::buildFooter(const QString &acceptText, const char *acc
 
 void OperationDialog::finish(OperationTargets::List targets, OperationTargets::Need need,
                              const QString &acceptText, const char *acceptName) {
-    m_given = OperationTargets::warnings(targets, need);
+    addTargets(std::move(targets), need);
+    finish(acceptText, acceptName);
+}
+
+void OperationDialog::addTargets(OperationTargets::List targets, OperationTargets::Need need) {
+    m_need = need;
     m_targets = new TargetBox(m_body);
+    replaceTargets(std::move(targets));
+    m_parts->addWidget(m_targets);
+}
+
+void OperationDialog::replaceTargets(OperationTargets::List targets) {
+    m_given = OperationTargets::warnings(targets, m_need);
     m_targets->setTargets(std::move(targets));
     m_targets->setWarnings(m_given);
-    m_parts->addWidget(m_targets);
+}
+
+void OperationDialog::finish(const QString &acceptText, const char *acceptName) {
     auto *line = new QWidget(m_body);
     auto *layout = new QHBoxLayout(line);
     layout->setContentsMargins(0, 0, 0, 0);
@@ -107,6 +122,10 @@ QLabel *OperationDialog::label(const QString &text, const char *role) const {
 void OperationDialog::setWarnings(std::vector<TargetWarning> warnings) {
     warnings.insert(warnings.begin(), m_given.begin(), m_given.end());
     m_targets->setWarnings(std::move(warnings));
+}
+
+void OperationDialog::setFootNote(const QString &text) {
+    m_footNote->setText(text);
 }
 
 void OperationDialog::updateAccept() {

@@ -24,6 +24,12 @@ protected:
     /// keyboard's way leads from top to bottom.
     void finish(OperationTargets::List targets, OperationTargets::Need need, const QString &acceptText,
                 const char *acceptName);
+    /// The same where the devices have been added already.
+    void finish(const QString &acceptText, const char *acceptName);
+    /// Adds the devices below the parts there are, for a dialog that has more parts after them.
+    void addTargets(OperationTargets::List targets, OperationTargets::Need need);
+    /// Other devices in place of those that were added, all of them ticked.
+    void replaceTargets(OperationTargets::List targets);
 
     /// Adds a part below those there are.
     void addPart(QWidget *part);
@@ -32,12 +38,16 @@ protected:
 
     QWidget *body() const { return m_body; }
     const TargetBox &targets() const { return *m_targets; }
+    TargetBox &targets() { return *m_targets; }
     QPushButton *acceptButton() const { return m_accept; }
 
     /// What speaks against some of the devices beside their states; replaces what an earlier call gave.
     void setWarnings(std::vector<TargetWarning> warnings);
     /// What is wrong with the whole; empty for nothing.
     void setComplaint(const QString &text) { m_complaint.setText(text); }
+
+    /// Says something quietly beside the buttons; once the dialog is finished.
+    void setFootNote(const QString &text);
 
     /// The accept button was pressed, with devices ticked.
     virtual void apply() = 0;
@@ -56,6 +66,8 @@ private:
     QVBoxLayout *m_parts;
     TargetBox *m_targets = nullptr;
     QPushButton *m_accept = nullptr;
+    QLabel *m_footNote;
     WarningLine m_complaint;
+    OperationTargets::Need m_need = OperationTargets::Need::Connection;
     std::vector<TargetWarning> m_given; ///< what the devices' states speak against
 };

@@ -65,6 +65,10 @@ QStringList TargetBox::tickedIds() const {
     return m_model->checkedIds();
 }
 
+void TargetBox::setTicked(const std::vector<int> &targets, bool ticked) {
+    m_model->setChecked(targets, ticked);
+}
+
 void TargetBox::openList() {
     auto *dialog = new TargetListDialog(m_model, this);
     dialog->open();

@@ -25,6 +25,8 @@ public:
     std::vector<int> ticked() const;
     int tickedCount() const;
     QStringList tickedIds() const;
+    /// Ticks or unticks the targets at these places.
+    void setTicked(const std::vector<int> &targets, bool ticked);
 
 signals:
     /// Other devices are ticked now.

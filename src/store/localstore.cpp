@@ -10,6 +10,10 @@ namespace {
 const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
 const QString kUiLanguage = QStringLiteral("kUiLanguage");
+const QString kPendingExports = QStringLiteral("kPendingExports");
+const QString kFwUploadOnlyApplyFail = QStringLiteral("kFwUploadOnlyApplyFail");
+const QString kFWUploadScheduleOnOff = QStringLiteral("kFWUploadScheduleOnOff");
+const QString kFwRolloutsPrefix = QStringLiteral("kFwRollouts_");
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -100,4 +104,36 @@ QString CLocalStore::uiLanguage() const {
 
 bool CLocalStore::setUiLanguage(const QString &language) {
     return m_store.replace(kUiLanguage, language);
+}
+
+QString CLocalStore::pendingExports() const {
+    return m_store.query(kPendingExports);
+}
+
+bool CLocalStore::setPendingExports(const QString &json) {
+    return m_store.replace(kPendingExports, json);
+}
+
+bool CLocalStore::isFwUploadOnlyApplyFail() const {
+    return m_store.queryFlag(kFwUploadOnlyApplyFail);
+}
+
+bool CLocalStore::setFwUploadOnlyApplyFail(bool on) {
+    return m_store.replaceFlag(kFwUploadOnlyApplyFail, on);
+}
+
+bool CLocalStore::isFWUploadScheduleOn() const {
+    return m_store.queryFlag(kFWUploadScheduleOnOff);
+}
+
+bool CLocalStore::setFWUploadScheduleOn(bool on) {
+    return m_store.replaceFlag(kFWUploadScheduleOnOff, on);
+}
+
+QString CLocalStore::fwRollouts(const QString &session) const {
+    return m_store.query(kFwRolloutsPrefix + session);
+}
+
+bool CLocalStore::setFwRollouts(const QString &session, const QString &json) {
+    return m_store.replace(kFwRolloutsPrefix + session, json);
 }

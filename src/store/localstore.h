@@ -49,6 +49,20 @@ public:
     /// Code of the language that the windows are to speak; empty for that of the system.
     QString uiLanguage() const;
     bool setUiLanguage(const QString &language);
+    /// JSON text of the exports that were asked for and not collected; empty where none is stored.
+    QString pendingExports() const;
+    bool setPendingExports(const QString &json);
+    /// Whether firmware goes to those devices alone whose last upload failed.
+    bool isFwUploadOnlyApplyFail() const;
+    bool setFwUploadOnlyApplyFail(bool on);
+    /// Whether firmware goes out at a time, and not at once.
+    bool isFWUploadScheduleOn() const;
+    bool setFWUploadScheduleOn(bool on);
+
+    /// JSON text of the rollouts that a session has begun; empty where none is stored. session: a word for
+    /// server and account.
+    QString fwRollouts(const QString &session) const;
+    bool setFwRollouts(const QString &session, const QString &json);
 
 private:
     CLocalStore();

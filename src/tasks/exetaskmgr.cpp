@@ -1,5 +1,6 @@
 #include "exetaskmgr.h"
 
+#include "postwork.h"
 #include "servicesession.h"
 #include "taskcheck.h"
 #include "tasktargets.h"
@@ -34,6 +35,9 @@ unsigned assignManual(TaskStep &step) {
 
 unsigned exportDebugInfo(TaskStep &step) {
     const JSON devices = TaskTargets::withTask(step.record.at("devices"), step.tid);
+    // Noted before the service begins, so that nothing it has collected is forgotten.
+    CPostWork::instance().expectExport(step.session.login(), QString::fromStdString(step.tid),
+                                       stringMember(step.record, "storepath"));
     JSON answer;
     return step.session.call([&](CApiClient &client) {
         return client.exportDebugInfo(step.text("storepath").c_str(), devices, answer);
@@ -114,7 +118,10 @@ ExeTaskMgr &ExeTaskMgr::instance() {
     return *manager;
 }
 
-ExeTaskMgr::ExeTaskMgr() : TaskQueue(families, "Handling FW upload task occurs error: ") {}
+ExeTaskMgr::ExeTaskMgr() : TaskQueue(families, "Handling FW upload task occurs error: ") {
+    // Steps tell it of their exports, but it has to be made in this thread.
+    CPostWork::instance();
+}
 
 bool ExeTaskMgr::insertNewAutoAssignIpTask(const JSON &devices, QString *ctid) {
     qDebug("Initiating auto assigning IP task");

@@ -15,7 +15,7 @@ public:
     /// devices: array of {"id","ip"}, each with its new address. The servers of names may be empty.
     bool insertNewManualAssignIpTask(const JSON &devices, const QString &mask, const QString &gate,
                                      const QString &dns1, const QString &dns2, QString *ctid = nullptr);
-    /// storePath: where the service puts what it collects.
+    /// storePath: the folder on this computer for the report, which CPostWork collects.
     bool insertNewExportDebugInfoTask(const JSON &devices, const QString &storePath, QString *ctid = nullptr);
     /// info: the settings as CApiClient::runQuickSetup takes them.
     bool insertNewQuickSetupTask(const JSON &devices, const JSON &info, QString *ctid = nullptr);

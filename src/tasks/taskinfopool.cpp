@@ -2,6 +2,7 @@
 
 #include "messagelog.h"
 #include "pagereader.h"
+#include "postwork.h"
 #include "servicerequest.h"
 #include "taskstate.h"
 
@@ -49,16 +50,17 @@ int totalOf(const JSON &value) {
     return static_cast<int>(std::clamp<std::int64_t>(value.get<std::int64_t>(), 0, most));
 }
 
-/// Runs the body of a fetch; nothing that it throws leaves the thread.
-void guarded(const std::function<void()> &body) {
+/// Runs the body of a fetch; nothing that it throws leaves the thread. False when it has thrown.
+bool guarded(const std::function<void()> &body) {
     try {
         body();
-        return;
+        return true;
     } catch (const std::exception &error) {
         qWarning("Handling task status loading occurs error: %s", error.what());
     } catch (...) {
         qWarning("Handling task status loading occurs error: Unknown exception");
     }
+    return false;
 }
 
 } // namespace
@@ -78,7 +80,8 @@ CTaskInfoPool::CTaskInfoPool()
 void CTaskInfoPool::loadTaskStatuses() {
     ServiceRequest::post(&m_taskRunner, this,
                          [this](ServiceSession &session) {
-                             fetchTaskStatuses(session);
+                             if (fetchTaskStatuses(session))
+                                 startPostWork();
                              return true;
                          },
                          {});
@@ -93,9 +96,14 @@ void CTaskInfoPool::loadAlarmInfo() {
                          {});
 }
 
-void CTaskInfoPool::fetchTaskStatuses(ServiceSession &session) {
+bool CTaskInfoPool::fetchTaskStatuses(ServiceSession &session) {
     const std::lock_guard fetch(m_fetch);
-    guarded([&] { readTasks(session); });
+    return guarded([&] { readTasks(session); });
+}
+
+void CTaskInfoPool::startPostWork() {
+    QMetaObject::invokeMethod(
+        this, [] { CPostWork::instance().SyncExportDebugInfo(); }, Qt::QueuedConnection);
 }
 
 void CTaskInfoPool::readTasks(ServiceSession &session) {

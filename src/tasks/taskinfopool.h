@@ -27,8 +27,8 @@ public:
     void loadAlarmInfo();
 
     /// Fetches the task list at once, for a job that has made a task and wants it to be seen. Waits for a
-    /// fetch that is under way.
-    void fetchTaskStatuses(ServiceSession &session);
+    /// fetch that is under way. False when it has thrown, which is logged.
+    bool fetchTaskStatuses(ServiceSession &session);
 
     /// Writes a task's final state on the service. Blocks for a request: for a runner's thread.
     unsigned updateTaskState(ServiceSession &session, const QString &tid, const QString &state);
@@ -64,6 +64,7 @@ signals:
 private:
     CTaskInfoPool();
 
+    void startPostWork();
     void readTasks(ServiceSession &session);
     void readAlarms(ServiceSession &session);
     bool takeTasks(const ServiceSession &session, TaskListPtr tasks);

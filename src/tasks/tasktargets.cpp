@@ -34,6 +34,13 @@ JSON ids(const JSON &devices) {
     return converted(devices, [](JSON id) { return id; });
 }
 
+JSON ids(const QStringList &ids) {
+    JSON array = JSON::array();
+    for (const QString &id : ids)
+        array.push_back(id.toStdString());
+    return array;
+}
+
 JSON withTask(const JSON &devices, const std::string &tid) {
     return converted(devices, [&](JSON id) { return JSON{{"id", std::move(id)}, {"tid", tid}}; });
 }

@@ -13,6 +13,7 @@ namespace TaskTargets {
 
 /// ["DV…", …]
 JSON ids(const JSON &devices);
+JSON ids(const QStringList &ids);
 /// [{"id","tid"}, …]
 JSON withTask(const JSON &devices, const std::string &tid);
 /// [{"id", and the members of the record}, …]; members that the record lacks are left out.

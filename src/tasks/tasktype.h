@@ -8,6 +8,7 @@ namespace TaskType {
 inline const QString firmwareUpload = QStringLiteral("deviceFWUpgrade");
 inline const QString configFileUpload = QStringLiteral("deviceConfigFileUpload");
 inline const QString packageUpload = QStringLiteral("devicePackageUpload");
+inline const QString debugInfoExport = QStringLiteral("deviceExportDeviceInfo");
 inline const QString restart = QStringLiteral("deviceRestart");
 inline const QString restore = QStringLiteral("deviceRestore");
 inline const QString changePassword = QStringLiteral("deviceChangePass");

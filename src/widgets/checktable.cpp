@@ -32,8 +32,7 @@ public:
             place.setLeft(place.left() + markSize + 2 * padding);
         }
         const QString text = index.data().toString();
-        RowPainter::paintText(painter, place, option.font,
-                              text == QLatin1String("--") ? Theme::textQuiet : Theme::textStrong, text);
+        RowPainter::paintText(painter, place, option.font, colourOf(index, text), text);
     }
 
 protected:
@@ -50,6 +49,13 @@ protected:
     }
 
 private:
+    static QColor colourOf(const QModelIndex &index, const QString &text) {
+        const QVariant given = index.data(Qt::ForegroundRole);
+        if (given.isValid())
+            return given.value<QColor>();
+        return text == QLatin1String("--") ? Theme::textQuiet : Theme::textStrong;
+    }
+
     static bool isChecked(const QModelIndex &index) {
         return index.data(Qt::CheckStateRole).toInt() == Qt::Checked;
     }

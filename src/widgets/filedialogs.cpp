@@ -4,6 +4,16 @@
 
 namespace FileDialogs {
 
+void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
+                 const std::function<void(const QString &)> &chosen) {
+    auto *dialog = new QFileDialog(parent, title, folder, filter);
+    dialog->setObjectName(QStringLiteral("openFileDialog"));
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->setFileMode(QFileDialog::ExistingFile);
+    QObject::connect(dialog, &QFileDialog::fileSelected, parent, chosen);
+    dialog->open();
+}
+
 void askSavePath(QWidget *parent, const QString &title, const QString &suggestion, const QString &filter,
                  const QString &suffix, const std::function<void(const QString &)> &chosen) {
     auto *dialog = new QFileDialog(parent, title, suggestion, filter);
@@ -15,9 +25,19 @@ void askSavePath(QWidget *parent, const QString &title, const QString &suggestio
     dialog->open();
 }
 
-void askFolder(QWidget *parent, const QString &title, const QString &suggestion,
+void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
+                 const std::function<void(const QString &)> &chosen) {
+    auto *dialog = new QFileDialog(parent, title, folder, filter);
+    dialog->setObjectName(QStringLiteral("openFileDialog"));
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->setFileMode(QFileDialog::ExistingFile);
+    QObject::connect(dialog, &QFileDialog::fileSelected, parent, chosen);
+    dialog->open();
+}
+
+void askFolder(QWidget *parent, const QString &title, const QString &folder,
                const std::function<void(const QString &)> &chosen) {
-    auto *dialog = new QFileDialog(parent, title, suggestion);
+    auto *dialog = new QFileDialog(parent, title, folder);
     dialog->setObjectName(QStringLiteral("folderDialog"));
     dialog->setAttribute(Qt::WA_DeleteOnClose);
     dialog->setFileMode(QFileDialog::Directory);

@@ -44,11 +44,22 @@ public:
         const std::lock_guard lock(m_mutex);
         m_made = std::move(data);
     }
+    /// From now on requests to the path are answered with this, ciphered.
+    void setAnswer(const std::string &path, nlohmann::json data) {
+        const std::lock_guard lock(m_mutex);
+        m_answers[path] = std::move(data);
+    }
     /// From now on requests to the path are read and never answered; an empty path ends it.
     void hold(const std::string &path) {
         const std::lock_guard lock(m_mutex);
         m_held = path;
     }
+    /// From now on requests to the path get this answer, right or wrong.
+    void reply(const std::string &path, ScriptedPeer::Reply reply) {
+        const std::lock_guard lock(m_mutex);
+        m_replies[path] = std::move(reply);
+    }
+    std::uint32_t port() const { return m_peer.port(); }
     /// The bodies that were sent to a path.
     std::vector<nlohmann::json> sentTo(const std::string &path) {
         std::vector<nlohmann::json> bodies;
@@ -69,6 +80,10 @@ private:
             return {{}, ScriptedPeer::End::Hold};
         if (const auto code = m_codes.find(request.path); code != m_codes.end() && code->second != 0)
             return ScriptedPeer::json({{"code", code->second}});
+        if (const auto reply = m_replies.find(request.path); reply != m_replies.end())
+            return reply->second;
+        if (const auto given = m_answers.find(request.path); given != m_answers.end())
+            return ScriptedPeer::sealed(given->second);
         if (request.path == "/v1/alarm/list")
             return ScriptedPeer::sealed(m_alarms);
         if (request.path == "/v1/task/init")
@@ -104,6 +119,8 @@ private:
     nlohmann::json m_made;
     nlohmann::json m_alarms = {{"items", nlohmann::json::array()}, {"total_items", 0}};
     std::map<std::string, int> m_codes;
+    std::map<std::string, ScriptedPeer::Reply> m_replies;
+    std::map<std::string, nlohmann::json> m_answers;
     std::string m_held;
     std::map<std::string, std::vector<std::string>> m_sent;
     ScriptedPeer m_peer;

@@ -1,0 +1,111 @@
+#include "inventoryupdater.h"
+
+#include "servicerequest.h"
+#include "taskinfopool.h"
+
+#include <QDebug>
+
+#include <chrono>
+#include <new>
+#include <thread>
+
+namespace {
+
+constexpr std::chrono::milliseconds settlingTime{2000};
+constexpr int answersBetweenReadings = 10;
+/// While tasks run, readings take one part in so many of the time at most.
+constexpr int readingShare = 4;
+
+} // namespace
+
+InventoryUpdater::InventoryUpdater(const DeviceInventory &inventory, std::function<int()> siteCommits,
+                                   QObject *parent)
+    : QObject(parent),
+      m_inventory(inventory),
+      m_siteCommits(std::move(siteCommits)),
+      m_netTask(new (std::nothrow) NetTask) {
+    if (!m_netTask)
+        qDebug("net task create failed!should not be this case!");
+}
+
+InventoryUpdater::~InventoryUpdater() = default;
+
+void InventoryUpdater::reload() {
+    if (!CLocalStore::instance().loginInfo().isComplete())
+        return;
+    if (m_reloading) {
+        m_reloadWanted = true;
+        return;
+    }
+    const auto work = [snapshot = m_inventory.snapshot(),
+                       codes = m_inventory.statuses()](ServiceSession &session) {
+        return InventoryReader::readAll(session, snapshot, codes);
+    };
+    m_reloadWanted = false;
+    m_answersSinceReading = 0;
+    m_sinceReading.start();
+    m_reloading = ServiceRequest::post(
+        m_netTask.get(), this, work,
+        [this, commits = m_siteCommits()](const InventoryReader::Reading &reading) {
+            take(reading, commits);
+        },
+        [this](JobEnd end) { onEnded(end); });
+    // The runner may still be busy with the last answer of a session that has ended.
+    m_reloadWanted = !m_reloading;
+}
+
+void InventoryUpdater::take(InventoryReader::Reading reading, int siteCommits) {
+    // Sites that were read before a commit are older than the tree.
+    if (siteCommits != m_siteCommits())
+        reading.sites.reset();
+    if (reading.devices)
+        m_knowledge = Knowledge::Read;
+    else if (m_knowledge == Knowledge::None)
+        m_knowledge = Knowledge::Failed;
+    emit read(reading);
+}
+
+void InventoryUpdater::onEnded(JobEnd end) {
+    m_reloading = false;
+    m_readingMs = m_sinceReading.restart();
+    if (end != JobEnd::Delivered && end != JobEnd::SessionGone) {
+        if (m_knowledge == Knowledge::None)
+            m_knowledge = Knowledge::Failed;
+        emit failed();
+    }
+    if (m_reloadWanted)
+        reload();
+}
+
+void InventoryUpdater::reloadForTasks() {
+    CTaskInfoPool &pool = CTaskInfoPool::instance();
+    if (m_reloading || m_reloadWanted || !pool.isTasksChanged() ||
+        m_sinceReading.elapsed() < m_readingMs * (readingShare - 1))
+        return;
+    reload();
+    pool.clearTasksChanged();
+}
+
+void InventoryUpdater::countAnswer() {
+    if (++m_answersSinceReading >= answersBetweenReadings)
+        reload();
+}
+
+void InventoryUpdater::readStatesSoon() {
+    const auto work = [snapshot = m_inventory.snapshot(),
+                       codes = m_inventory.statuses()](ServiceSession &session) {
+        return InventoryReader::readStatus(session, snapshot, codes);
+    };
+    ServiceRequest::post(
+        NetJob::createRunner("reading the states after a removal"), this, work,
+        [this](const std::optional<DeviceStatusUpdate> &update) {
+            if (update)
+                emit statesRead(*update);
+        },
+        [this](JobEnd) { emit statesSettled(); }, [] { std::this_thread::sleep_for(settlingTime); });
+}
+
+void InventoryUpdater::stop() {
+    m_reloadWanted = false;
+    m_knowledge = Knowledge::None;
+}

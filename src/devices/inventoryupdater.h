@@ -1,0 +1,61 @@
+#pragma once
+
+#include "inventoryreader.h"
+#include "netjob.h"
+
+#include <QElapsedTimer>
+#include <QObject>
+
+#include <functional>
+
+/// Reads the inventory of the present session again when that is due: one reading at a time, another one
+/// right after it where it was asked for meanwhile. User-interface thread.
+class InventoryUpdater : public QObject {
+    Q_OBJECT
+
+public:
+    /// What is known of the service's devices.
+    enum class Knowledge { None, Failed, Read };
+
+    /// The inventory must outlive the updater. siteCommits: counts the commits of sites.
+    InventoryUpdater(const DeviceInventory &inventory, std::function<int()> siteCommits,
+                     QObject *parent = nullptr);
+    ~InventoryUpdater() override;
+
+    Knowledge knowledge() const { return m_knowledge; }
+
+    void reload();
+    /// Reads again when a task has moved since, which mostly changes devices. How soon depends on what a
+    /// reading costs.
+    void reloadForTasks();
+    /// The server has answered a check: polls tell of devices that come and go, and what else others change
+    /// shows with a reading once in so many answers.
+    void countAnswer();
+    /// Reads the states alone, as soon as the service had time to act on what it was told.
+    void readStatesSoon();
+    /// The session has ended.
+    void stop();
+
+signals:
+    /// Something was read; which parts, the reading tells.
+    void read(const InventoryReader::Reading &reading);
+    /// A reading has failed as a whole.
+    void failed();
+    void statesRead(const DeviceStatusUpdate &update);
+    /// The reading of the states alone has ended, however it did.
+    void statesSettled();
+
+private:
+    void take(InventoryReader::Reading reading, int siteCommits);
+    void onEnded(JobEnd end);
+
+    const DeviceInventory &m_inventory;
+    std::function<int()> m_siteCommits;
+    NetTask::Owner m_netTask;
+    QElapsedTimer m_sinceReading; ///< since the last reading began, then since it ended
+    qint64 m_readingMs = 0;       ///< how long it took
+    int m_answersSinceReading = 0;
+    bool m_reloading = false;
+    bool m_reloadWanted = false;
+    Knowledge m_knowledge = Knowledge::None;
+};

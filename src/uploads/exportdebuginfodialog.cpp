@@ -1,0 +1,52 @@
+#include "exportdebuginfodialog.h"
+
+#include "exetaskmgr.h"
+#include "filefield.h"
+#include "localstore.h"
+#include "targetbox.h"
+#include "tasktargets.h"
+
+#include <QLabel>
+#include <QStandardPaths>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+QString proposedFolder() {
+    const QString last = CLocalStore::instance().defaultFilePath();
+    return last.isEmpty() ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation) : last;
+}
+
+} // namespace
+
+ExportDebugInfoDialog::ExportDebugInfoDialog(OperationTargets::List targets, QWidget *parent)
+    : OperationDialog(tr("Export Debug Info"), parent),
+      m_folder(new FileField(FileField::Kind::Folder,
+                             {tr("Folder on this computer"), tr("Choose Folder"), {}}, body())) {
+    setObjectName(QStringLiteral("ExportDebugInfoDialog"));
+    m_folder->setObjectName(QStringLiteral("folderField"));
+    m_folder->acceptDropsOn(this);
+    addPart(m_folder);
+    auto *note = label(tr("The devices collect the information first. The report is saved when they are "
+                          "done, also if the program is started again meanwhile."),
+                       "quiet");
+    note->setWordWrap(true);
+    addPart(note);
+    finish(std::move(targets), OperationTargets::Need::Authorization, tr("Export"), "exportButton");
+    connect(m_folder, &FileField::changed, this, &ExportDebugInfoDialog::updateAccept);
+    m_folder->setPath(proposedFolder());
+    m_folder->setFocus();
+}
+
+bool ExportDebugInfoDialog::isComplete() const {
+    return !m_folder->path().isEmpty();
+}
+
+void ExportDebugInfoDialog::apply() {
+    if (ExeTaskMgr::instance().insertNewExportDebugInfoTask(TaskTargets::ids(targets().tickedIds()),
+                                                            m_folder->path()))
+        accept();
+    else
+        setComplaint(tr("The export could not be started."));
+}

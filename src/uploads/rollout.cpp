@@ -1,0 +1,197 @@
+#include "rollout.h"
+
+#include "taskstate.h"
+
+#include <QSet>
+
+#include <utility>
+
+namespace {
+
+constexpr qint64 minuteMs = 60 * 1000;
+
+/// The devices of a wave that its task has not served.
+QStringList notDone(const Rollout::Wave &wave, const TaskRecord *task) {
+    QSet<QString> done;
+    if (task) {
+        for (const TaskDevice &device : task->devices) {
+            if (TaskState::isFinal(device.state) && !TaskState::isFailure(device.state) &&
+                device.state != TaskState::aborted)
+                done.insert(device.target->id);
+        }
+    }
+    QStringList left;
+    for (const QString &id : wave.deviceIds) {
+        if (!done.contains(id))
+            left += id;
+    }
+    return left;
+}
+
+} // namespace
+
+Rollout::Rollout(RolloutPlanPtr plan, Surroundings surroundings, QObject *parent)
+    : QObject(parent), m_plan(std::move(plan)), m_surroundings(std::move(surroundings)) {}
+
+void Rollout::begin() {
+    beginWave(State::FirstWave, m_plan->firstWave());
+}
+
+void Rollout::resume(const Progress &progress) {
+    m_progress = progress;
+    const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
+    // What the queue of that run held is gone with it.
+    if (isUploading && m_progress.wave.tid.isEmpty())
+        return halt(Reason::NotBegun, tr("The client was closed before it began."));
+    advance();
+}
+
+void Rollout::beginWave(State state, const QStringList &deviceIds) {
+    m_progress.earlierDone += m_progress.wave.done;
+    m_progress.earlierFailed += m_progress.wave.failed;
+    m_progress.wave = {};
+    m_progress.wave.deviceIds = deviceIds;
+    setState(state);
+    m_surroundings.upload(*this, deviceIds, state == State::FirstWave ? m_plan->actionTime : QString());
+}
+
+void Rollout::advance() {
+    if (state() == State::Waiting && m_surroundings.now() >= m_progress.waitUntil)
+        return beginWave(State::SecondWave, m_plan->rest());
+    if (!m_progress.wave.tid.isEmpty())
+        follow();
+}
+
+void Rollout::onQueued(const QString &ctid) {
+    m_progress.wave.ctid = ctid;
+}
+
+void Rollout::onNotBegun(const QString &reason) {
+    halt(Reason::NotBegun, reason);
+}
+
+void Rollout::onServiceTaskMade(const QString &ctid, const QString &tid) {
+    if (ctid != m_progress.wave.ctid || ctid.isEmpty())
+        return;
+    m_progress.wave.tid = tid;
+    emit moved();
+    advance();
+}
+
+void Rollout::onHandOverFailed(const QString &ctid, const QString &reason) {
+    if (ctid == m_progress.wave.ctid && !ctid.isEmpty())
+        halt(Reason::NotBegun, reason);
+}
+
+/// The figures are followed in a stopped rollout too: its devices are at work all the same.
+void Rollout::follow() {
+    const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
+    const TaskRecordPtr task = m_surroundings.tasks()->find(m_progress.wave.tid);
+    if (task)
+        count(*task);
+    if (!isUploading)
+        return;
+    if (task && task->isFinal())
+        return onWaveEnded(*task);
+    if (!task && m_progress.wave.isSeen)
+        halt(Reason::TaskGone);
+}
+
+void Rollout::count(const TaskRecord &task) {
+    Wave &wave = m_progress.wave;
+    const int done = wave.total() - static_cast<int>(notDone(wave, &task).size());
+    // What a task that is over has left out will not come any more.
+    const bool isOver = task.isFinal() && task.status != TaskState::aborted;
+    const int failed = isOver ? wave.total() - done : std::min(task.failedDevices, wave.total() - done);
+    const qint64 scheduledAt = task.status == TaskState::scheduled ? task.scheduledAt : 0;
+    const bool isSame =
+        wave.isSeen && done == wave.done && failed == wave.failed && scheduledAt == wave.scheduledAt;
+    wave.isSeen = true;
+    wave.done = done;
+    wave.failed = failed;
+    wave.scheduledAt = scheduledAt;
+    if (!isSame)
+        emit counted();
+}
+
+void Rollout::onWaveEnded(const TaskRecord &task) {
+    if (task.status == TaskState::aborted)
+        return halt(Reason::Cancelled);
+    if (state() == State::FirstWave)
+        judgeFirstWave();
+    else
+        setState(State::Done);
+}
+
+void Rollout::judgeFirstWave() {
+    const Wave &wave = m_progress.wave;
+    if (m_plan->rest().isEmpty())
+        return setState(State::Done);
+    if (qint64{wave.failed} * 100 > qint64{m_plan->mostFailedPercent} * wave.total())
+        return halt(Reason::TooManyFailed);
+    m_progress.waitUntil = m_surroundings.now() + m_plan->waitMinutes * minuteMs;
+    setState(State::Waiting);
+    advance();
+}
+
+void Rollout::halt(Reason reason, const QString &text) {
+    if (state() != State::Stopped)
+        m_progress.stoppedIn = state();
+    m_progress.reason = reason;
+    m_progress.reasonText = text;
+    setState(State::Stopped);
+}
+
+void Rollout::stop() {
+    if (canStop())
+        halt(Reason::User);
+}
+
+void Rollout::goOn() {
+    if (!canGoOn())
+        return;
+    const Reason reason = std::exchange(m_progress.reason, Reason::None);
+    const State stoppedIn = m_progress.stoppedIn;
+    if (state() == State::Waiting || reason == Reason::TooManyFailed)
+        return beginWave(State::SecondWave, m_plan->rest());
+    if (reason == Reason::User) {
+        setState(stoppedIn);
+        return advance();
+    }
+    repeatWave(stoppedIn);
+}
+
+void Rollout::repeatWave(State wave) {
+    const TaskRecordPtr task = m_surroundings.tasks()->find(m_progress.wave.tid);
+    const QStringList left = notDone(m_progress.wave, task.get());
+    if (left.isEmpty()) {
+        setState(wave);
+        return wave == State::FirstWave ? judgeFirstWave() : setState(State::Done);
+    }
+    // They are tried once more, and nobody knows of a lost task whom it has served.
+    m_progress.wave.failed = 0;
+    m_progress.wave.done = m_progress.wave.total() - static_cast<int>(left.size());
+    beginWave(wave, left);
+}
+
+bool Rollout::canStop() const {
+    return state() == State::FirstWave || state() == State::Waiting;
+}
+
+bool Rollout::canGoOn() const {
+    return state() == State::Waiting || state() == State::Stopped;
+}
+
+bool Rollout::canBeDismissed() const {
+    const bool isLastSent = state() == State::SecondWave && !m_progress.wave.tid.isEmpty();
+    return state() == State::Stopped || state() == State::Done || isLastSent;
+}
+
+bool Rollout::isRunning() const {
+    return state() != State::Stopped && state() != State::Done;
+}
+
+void Rollout::setState(State state) {
+    m_progress.state = state;
+    emit moved();
+}

@@ -1,0 +1,109 @@
+#pragma once
+
+#include "rolloutplan.h"
+#include "taskrecord.h"
+
+#include <QObject>
+
+#include <functional>
+
+/// Firmware for a first group of devices, and for the rest only when that went well enough.
+///
+/// It has no clock, no list and no requests of its own: whoever owns it hands these over, calls advance()
+/// when time has passed or the list is another one, and tells what became of an upload. An upload that it
+/// asks for is answered by onQueued() or onNotBegun(), at once or later. User-interface thread.
+class Rollout : public QObject {
+    Q_OBJECT
+
+public:
+    enum class State { FirstWave, Waiting, SecondWave, Stopped, Done };
+    enum class Reason {
+        None,
+        User,
+        TooManyFailed, ///< in the first wave
+        Cancelled,     ///< the task of the wave was
+        TaskGone,      ///< removed from the list before it was over
+        NotBegun       ///< the wave did not get to the service; the progress has the text of it
+    };
+
+    /// One of the two uploads.
+    struct Wave {
+        QStringList deviceIds;
+        QString ctid; ///< of the record in the queue
+        QString tid;  ///< of the task on the service
+        bool isSeen = false;
+        qint64 scheduledAt = 0; ///< Unix ms, 0 where it does not wait for its time
+        int done = 0;
+        int failed = 0;
+
+        int total() const { return static_cast<int>(deviceIds.size()); }
+        int finished() const { return done + failed; }
+    };
+
+    /// How far it is: all that a rollout is beside its plan.
+    struct Progress {
+        State state = State::FirstWave;
+        State stoppedIn = State::FirstWave;
+        Reason reason = Reason::None;
+        QString reasonText;
+        Wave wave;           ///< the present one, or the last one
+        int earlierDone = 0; ///< devices that waves before this one have brought to an end
+        int earlierFailed = 0;
+        qint64 waitUntil = 0; ///< Unix ms
+    };
+
+    struct Surroundings {
+        std::function<qint64()> now; ///< Unix ms
+        std::function<TaskListPtr()> tasks;
+        /// actionTime: Unix ms as text, empty for now.
+        std::function<void(Rollout &, const QStringList &deviceIds, const QString &actionTime)> upload;
+    };
+
+    Rollout(RolloutPlanPtr plan, Surroundings surroundings, QObject *parent = nullptr);
+
+    void begin();
+    /// Goes on from where an earlier run of the program has left it.
+    void resume(const Progress &progress);
+    void advance();
+
+    void onQueued(const QString &ctid);
+    void onNotBegun(const QString &reason);
+    void onServiceTaskMade(const QString &ctid, const QString &tid);
+    void onHandOverFailed(const QString &ctid, const QString &reason);
+
+    void stop();
+    /// Does not wait any longer, or goes on after a stop: with the wave that did not come to its end, else
+    /// with the next one.
+    void goOn();
+
+    bool canStop() const;
+    bool canGoOn() const;
+    /// True when nothing is left that would be decided.
+    bool canBeDismissed() const;
+    bool isRunning() const;
+
+    const RolloutPlan &plan() const { return *m_plan; }
+    const RolloutPlanPtr &planPtr() const { return m_plan; }
+    const Progress &progress() const { return m_progress; }
+    State state() const { return m_progress.state; }
+
+signals:
+    /// It is in another state, or knows the task of its wave now: time to keep its progress.
+    void moved();
+    /// Figures are different.
+    void counted();
+
+private:
+    void beginWave(State state, const QStringList &deviceIds);
+    void follow();
+    void count(const TaskRecord &task);
+    void onWaveEnded(const TaskRecord &task);
+    void judgeFirstWave();
+    void repeatWave(State wave);
+    void halt(Reason reason, const QString &text = {});
+    void setState(State state);
+
+    RolloutPlanPtr m_plan;
+    Surroundings m_surroundings;
+    Progress m_progress;
+};

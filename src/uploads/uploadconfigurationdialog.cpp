@@ -1,0 +1,36 @@
+#include "uploadconfigurationdialog.h"
+
+#include "filefield.h"
+#include "targetbox.h"
+#include "tasktargets.h"
+#include "uploadtaskmgr.h"
+
+#include <nlohmann/json.hpp>
+
+UploadConfigurationDialog::UploadConfigurationDialog(OperationTargets::List targets, QWidget *parent)
+    : OperationDialog(tr("Upload Configuration File"), parent),
+      m_file(new FileField(
+          FileField::Kind::File,
+          {tr("Configuration file"), tr("Choose Configuration File"), tr("One file of up to 4 GiB.")},
+          body())) {
+    setObjectName(QStringLiteral("UploadConfigurationDialog"));
+    m_file->setObjectName(QStringLiteral("configurationFileField"));
+    m_file->acceptDropsOn(this);
+    addPart(m_file);
+    finish(std::move(targets), OperationTargets::Need::Authorization, tr("Upload"), "uploadButton");
+    connect(m_file, &FileField::changed, this, &UploadConfigurationDialog::updateAccept);
+    m_file->setFocus();
+}
+
+bool UploadConfigurationDialog::isComplete() const {
+    return !m_file->path().isEmpty();
+}
+
+void UploadConfigurationDialog::apply() {
+    if (UploadTaskMgr::instance().insertNewConfigFileUploadTask(QStringLiteral("manual"), m_file->fileName(),
+                                                                m_file->path(),
+                                                                TaskTargets::ids(targets().tickedIds())))
+        accept();
+    else
+        setComplaint(tr("The upload could not be started."));
+}

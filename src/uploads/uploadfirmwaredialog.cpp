@@ -1,0 +1,328 @@
+#include "uploadfirmwaredialog.h"
+
+#include "checktable.h"
+#include "credentialfields.h"
+#include "firmwarehistory.h"
+#include "firmwareupload.h"
+#include "modelgroupmodel.h"
+#include "rolloutfields.h"
+#include "rolloutmgr.h"
+#include "schedulefield.h"
+#include "servicerequest.h"
+#include "storewriter.h"
+#include "targetbox.h"
+#include "taskinfopool.h"
+#include "theme.h"
+#include "uploadfilefield.h"
+
+#include <QCheckBox>
+#include <QHeaderView>
+#include <QLabel>
+#include <QLocale>
+#include <QPushButton>
+
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+
+namespace {
+
+constexpr int contentWidth = 720;
+constexpr int mostRows = 4;
+constexpr int fewestRows = 1;
+
+QString number(int value) {
+    return QLocale().toString(value);
+}
+
+/// How many uploads the service lets run at a time; 0 where it has no limit or does not tell.
+int uploadLimitOf(const JSON &settings) {
+    const auto isOn = settings.find("svr_fw_upload_limit_enabled");
+    const auto limit = settings.find("svr_fw_upload_limit");
+    if (isOn == settings.end() || *isOn != true || limit == settings.end() || !limit->is_number_integer())
+        return 0;
+    return static_cast<int>(std::clamp<std::int64_t>(limit->get<std::int64_t>(), 0, 1'000'000));
+}
+
+} // namespace
+
+struct UploadFirmwareDialog::Start {
+    bool isScheduled = false;
+    bool onlyFailed = false;
+    QString folder;
+    QSet<QString> failed;
+};
+
+UploadFirmwareDialog::UploadFirmwareDialog(OperationTargets::List targets, QWidget *parent)
+    : OperationDialog(tr("Upload Firmware"), parent),
+      m_all(std::make_shared<const OperationTargets::List>(std::move(targets))),
+      m_file(new UploadFileField(body())),
+      m_table(new CheckTable(body())),
+      m_groups(new ModelGroupModel(this)),
+      m_schedule(new ScheduleField(body())),
+      m_waves(new RolloutFields(body())),
+      m_onlyFailed(new QCheckBox(tr("Only devices whose last upload failed"), body())) {
+    setObjectName(QStringLiteral("UploadFirmwareDialog"));
+    content()->setFixedWidth(contentWidth);
+    buildFile();
+    buildDevices(*m_all);
+    buildTimes();
+    finish(tr("Upload"), "uploadButton");
+    connect(&std::as_const(*this).targets(), &TargetBox::tickedChanged, this,
+            &UploadFirmwareDialog::onTicked);
+    onTicked();
+    readStart();
+    readUploadLimit();
+    m_file->setFocus();
+}
+
+UploadFirmwareDialog::~UploadFirmwareDialog() = default;
+
+void UploadFirmwareDialog::buildFile() {
+    m_file->setFileDialog(tr("Open Firmware Image"), tr("All Files(*)"),
+                          tr("Choose an image, or drop it here"));
+    m_file->acceptDropsOn(this);
+    m_fileWarning = addField(tr("Firmware file"), m_file, "fileWarningLabel");
+    connect(m_file, &UploadFileField::changed, this, &UploadFirmwareDialog::onFileChanged);
+    connect(m_file, &UploadFileField::dropRefused, this,
+            [this](const QString &reason) { CredentialFields::tell(m_fileWarning, reason); });
+}
+
+void UploadFirmwareDialog::buildDevices(OperationTargets::List targets) {
+    m_table->setObjectName(QStringLiteral("modelTable"));
+    m_table->setAccessibleName(tr("Models of the devices"));
+    m_groups->setGroups(ModelGroups::of(targets));
+    m_table->showList(m_groups, {190, 100, 170}, -1);
+    addPart(m_table);
+    m_empty = label(tr("The last upload failed on none of the devices."), "quiet");
+    m_empty->setObjectName(QStringLiteral("noDevicesLabel"));
+    m_empty->hide();
+    addPart(m_empty);
+    addTargets(std::move(targets), OperationTargets::Need::Authorization);
+    connect(m_groups, &ModelGroupModel::groupToggled, this, &UploadFirmwareDialog::onGroupToggled);
+    fitTable();
+}
+
+void UploadFirmwareDialog::buildTimes() {
+    m_onlyFailed->setObjectName(QStringLiteral("onlyFailedCheckBox"));
+    m_onlyFailed->setEnabled(false);
+    addPart(m_onlyFailed);
+    m_scheduleWarning = addField(tr("When"), m_schedule, "scheduleWarningLabel");
+    addPart(label(tr("Rollout"), "caption"));
+    addPart(m_waves);
+    connect(m_onlyFailed, &QCheckBox::toggled, this, &UploadFirmwareDialog::onOnlyFailedToggled);
+    connect(m_schedule, &ScheduleField::changed, this, [this] {
+        CredentialFields::tell(m_scheduleWarning, m_schedule->problem());
+        showAction();
+    });
+    connect(m_waves, &RolloutFields::changed, this, &UploadFirmwareDialog::showAction);
+}
+
+void UploadFirmwareDialog::readStart() {
+    NetJob::post(
+        NetJob::createRunner("reading how earlier uploads went", NetTask::Turn::Beside), this,
+        [all = m_all, tasks = CTaskInfoPool::instance().taskList()] {
+            QSet<QString> ids;
+            for (const OperationTarget &target : *all)
+                ids.insert(target.device->id);
+            const CLocalStore &store = CLocalStore::instance();
+            return Start{store.isFWUploadScheduleOn(), store.isFwUploadOnlyApplyFail(),
+                         store.defaultFilePath(), FirmwareHistory::lastFailed(*tasks, ids)};
+        },
+        [this](const Start &start) { onStartRead(start); });
+}
+
+void UploadFirmwareDialog::onStartRead(const Start &start) {
+    m_failed = start.failed;
+    m_file->setFolder(start.folder);
+    m_schedule->setScheduled(start.isScheduled || m_schedule->isScheduled());
+    m_onlyFailed->setEnabled(true);
+    m_onlyFailed->setChecked(start.onlyFailed);
+}
+
+void UploadFirmwareDialog::readUploadLimit() {
+    ServiceRequest::post(
+        NetJob::createRunner("reading the limit of uploads"), this,
+        [](ServiceSession &session) {
+            JSON settings;
+            const unsigned result =
+                session.call([&](CApiClient &client) { return client.loadServerSettings(settings); });
+            return result == ApiOk && settings.is_object() ? uploadLimitOf(settings) : 0;
+        },
+        [this](int limit) { setFootNote(limit > 0 ? tr("%1 at a time").arg(number(limit)) : QString()); });
+}
+
+void UploadFirmwareDialog::onFileChanged() {
+    const UploadFile &file = m_file->file();
+    m_head = FirmwareHead::parse(file.head);
+    QString problem = file.problem;
+    if (problem.isEmpty() && m_head.kind == FirmwareHead::Kind::Broken)
+        problem = tr("The first line of this image is damaged; every device would refuse it.");
+    CredentialFields::tell(m_fileWarning, problem);
+    if (!m_file->isChecking())
+        showImage();
+    updateAccept();
+}
+
+/// Ticks what an earlier image has kept out, and leaves out what this one is not for.
+void UploadFirmwareDialog::showImage() {
+    m_groups->setImage(m_head, m_file->file().isGood());
+    targets().setTicked(std::exchange(m_leftOut, {}), true);
+    const std::vector<int> ticked = targets().ticked();
+    for (const int each : misfits()) {
+        if (std::binary_search(ticked.begin(), ticked.end(), each))
+            m_leftOut.push_back(each);
+    }
+    showMisfits();
+    targets().setTicked(m_leftOut, false);
+}
+
+std::vector<int> UploadFirmwareDialog::misfits() const {
+    std::vector<int> found;
+    for (std::size_t i = 0; i < m_groups->groups().size(); ++i) {
+        const std::vector<int> &members = m_groups->groups()[i].targets;
+        if (m_groups->fitOf(i) == FirmwareHead::Fit::OtherModel)
+            found.insert(found.end(), members.begin(), members.end());
+    }
+    std::sort(found.begin(), found.end());
+    return found;
+}
+
+void UploadFirmwareDialog::showMisfits() {
+    std::vector<int> found = misfits();
+    if (found.empty())
+        return setWarnings({});
+    setWarnings({{[](int count) {
+                      return tr("%n device(s) will fail: the image is for another model group.", nullptr,
+                                count);
+                  },
+                  tr("Another model group"), std::move(found)}});
+}
+
+void UploadFirmwareDialog::onOnlyFailedToggled() {
+    noteUnticked();
+    OperationTargets::List shown;
+    for (const OperationTarget &target : *m_all) {
+        if (!m_onlyFailed->isChecked() || m_failed->contains(target.device->id))
+            shown.push_back(target);
+    }
+    showTargets(std::move(shown));
+}
+
+/// What the user has left out of those that are shown; what the image has kept out does not count.
+void UploadFirmwareDialog::noteUnticked() {
+    const OperationTargets::List &shown = targets().targets();
+    std::vector<bool> isWanted(shown.size());
+    for (const int each : targets().ticked())
+        isWanted[static_cast<std::size_t>(each)] = true;
+    for (const int each : m_leftOut)
+        isWanted[static_cast<std::size_t>(each)] = true;
+    for (std::size_t i = 0; i < shown.size(); ++i) {
+        if (!isWanted[i])
+            m_unticked.insert(shown[i].device->id);
+        else if (!m_unticked.isEmpty())
+            m_unticked.remove(shown[i].device->id);
+    }
+}
+
+void UploadFirmwareDialog::showTargets(OperationTargets::List shown) {
+    std::vector<int> unticked;
+    for (std::size_t i = 0; i < shown.size(); ++i) {
+        if (m_unticked.contains(shown[i].device->id))
+            unticked.push_back(static_cast<int>(i));
+    }
+    m_leftOut.clear();
+    m_groups->setGroups(ModelGroups::of(shown));
+    replaceTargets(std::move(shown));
+    targets().setTicked(unticked, false);
+    showImage();
+    fitTable();
+}
+
+/// As many rows as there are models, as long as the dialog fits the smallest window.
+void UploadFirmwareDialog::fitTable() {
+    const int rows = std::clamp(m_groups->rowCount(), fewestRows, mostRows);
+    m_table->setFixedHeight(m_table->horizontalHeader()->height() + rows * Theme::rowHeight + 2);
+    m_table->setVisible(m_groups->rowCount() > 0);
+    m_empty->setVisible(m_groups->rowCount() == 0);
+}
+
+void UploadFirmwareDialog::onGroupToggled(int group, bool checked) {
+    targets().setTicked(m_groups->groups()[static_cast<std::size_t>(group)].targets, checked);
+}
+
+void UploadFirmwareDialog::onTicked() {
+    // While others are being put in their place, the groups are ahead of the targets or behind them.
+    std::size_t grouped = 0;
+    for (const ModelGroup &group : m_groups->groups())
+        grouped += group.targets.size();
+    if (grouped == targets().targets().size())
+        m_groups->setTicked(targets().ticked());
+    m_waves->setDeviceCount(targets().tickedCount());
+    showAction();
+}
+
+bool UploadFirmwareDialog::isComplete() const {
+    return m_file->file().isGood() && !m_file->isChecking() && m_head.kind != FirmwareHead::Kind::Broken &&
+           m_schedule->problem().isEmpty();
+}
+
+void UploadFirmwareDialog::showAction() {
+    const int count = targets().tickedCount();
+    const int first = m_waves->firstCount();
+    const bool isScheduled = m_schedule->isScheduled();
+    if (m_waves->isInWaves())
+        acceptButton()->setText((isScheduled ? tr("Schedule for %1, then %2") : tr("Upload to %1, then %2"))
+                                    .arg(number(first), number(count - first)));
+    else
+        acceptButton()->setText(
+            (isScheduled ? tr("Schedule for %1") : tr("Upload to %1")).arg(number(count)));
+    updateAccept();
+}
+
+/// A first wave is to meet every model, and devices that will fail as things stand tell nothing about the
+/// image.
+QStringList UploadFirmwareDialog::orderedIds() const {
+    const OperationTargets::List &all = targets().targets();
+    std::vector<bool> doubtful(all.size());
+    for (const TargetWarning &warning :
+         OperationTargets::warnings(all, OperationTargets::Need::Authorization)) {
+        for (const int each : warning.targets)
+            doubtful[static_cast<std::size_t>(each)] = true;
+    }
+    for (const int each : misfits())
+        doubtful[static_cast<std::size_t>(each)] = true;
+    QStringList ids;
+    for (const int each : ModelGroups::mixed(m_groups->groups(), targets().ticked(), doubtful))
+        ids += all[static_cast<std::size_t>(each)].device->id;
+    return ids;
+}
+
+void UploadFirmwareDialog::keepChoices() const {
+    StoreWriter::post([isScheduled = m_schedule->isScheduled(), onlyFailed = m_onlyFailed->isChecked()] {
+        CLocalStore::instance().setFWUploadScheduleOn(isScheduled);
+        CLocalStore::instance().setFwUploadOnlyApplyFail(onlyFailed);
+    });
+}
+
+bool UploadFirmwareDialog::startUpload() {
+    const qint64 time = m_schedule->time();
+    const QString actionTime = time > 0 ? QString::number(time) : QString();
+    if (!m_waves->isInWaves())
+        return FirmwareUpload::insert(m_file->file(), targets().tickedIds(), FirmwareUpload::newId(),
+                                      actionTime);
+    RolloutMgr::instance().start({m_file->file(), FirmwareUpload::newId(), actionTime, orderedIds(),
+                                  m_waves->firstCount(), m_waves->waitMinutes(),
+                                  m_waves->mostFailedPercent()});
+    return true;
+}
+
+void UploadFirmwareDialog::apply() {
+    // It may have passed since it was chosen.
+    if (!CredentialFields::tell(m_scheduleWarning, m_schedule->problem()))
+        return m_schedule->setFocus();
+    if (!startUpload())
+        return setComplaint(tr("The upload could not be started."));
+    keepChoices();
+    accept();
+}

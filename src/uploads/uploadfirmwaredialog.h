@@ -1,0 +1,73 @@
+#pragma once
+
+#include "firmwarehead.h"
+#include "operationdialog.h"
+
+#include <QSet>
+
+#include <memory>
+#include <optional>
+
+class CheckTable;
+class ModelGroupModel;
+class QCheckBox;
+class RolloutFields;
+class ScheduleField;
+class UploadFileField;
+
+/// Asks which firmware image devices are to get, when, and whether all of them at once, and puts the upload
+/// into the queue.
+class UploadFirmwareDialog : public OperationDialog {
+    Q_OBJECT
+
+public:
+    explicit UploadFirmwareDialog(OperationTargets::List targets, QWidget *parent = nullptr);
+    ~UploadFirmwareDialog() override;
+
+protected:
+    void apply() override;
+    bool isComplete() const override;
+
+private:
+    /// What is read on a runner before the dialog can show it.
+    struct Start;
+
+    void buildFile();
+    void buildDevices(OperationTargets::List targets);
+    void buildTimes();
+    void readStart();
+    void readUploadLimit();
+    void onStartRead(const Start &start);
+
+    void onFileChanged();
+    void onOnlyFailedToggled();
+    void noteUnticked();
+    void onTicked();
+    void onGroupToggled(int group, bool checked);
+    void showTargets(OperationTargets::List targets);
+    void showImage();
+    void showMisfits();
+    void fitTable();
+    void showAction();
+
+    std::vector<int> misfits() const;
+    QStringList orderedIds() const;
+    void keepChoices() const;
+    bool startUpload();
+
+    /// Those that the dialog was opened for; never changed, for a runner reads them too.
+    const std::shared_ptr<const OperationTargets::List> m_all;
+    QSet<QString> m_unticked;              ///< while they are not among those that are shown
+    std::optional<QSet<QString>> m_failed; ///< devices whose last upload failed, once that is known
+    FirmwareHead m_head;
+    std::vector<int> m_leftOut; ///< what was unticked because the image does not fit
+    UploadFileField *m_file;
+    QLabel *m_fileWarning = nullptr;
+    CheckTable *m_table;
+    ModelGroupModel *m_groups;
+    QLabel *m_empty = nullptr;
+    ScheduleField *m_schedule;
+    QLabel *m_scheduleWarning = nullptr;
+    RolloutFields *m_waves;
+    QCheckBox *m_onlyFailed;
+};
