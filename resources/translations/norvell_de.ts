@@ -743,6 +743,491 @@
     </message>
 </context>
 <context>
+    <name>CPostWork</name>
+    <message>
+        <source>Reason: %1.</source>
+        <translation>Grund: %1.</translation>
+    </message>
+    <message>
+        <source>There will be no debug information in “%1”: the server does not know its task any more.</source>
+        <translation>In „%1“ wird es keine Debug-Infos geben: der Server kennt ihre Aufgabe nicht mehr.</translation>
+    </message>
+    <message>
+        <source>The debug information could not be saved in “%1”, which will be tried again. %2</source>
+        <translation>Die Debug-Infos konnten nicht in „%1“ gespeichert werden; es wird erneut versucht. %2</translation>
+    </message>
+</context>
+<context>
+    <name>CaFileField</name>
+    <message>
+        <source>This certificate has expired.</source>
+        <translation>Dieses Zertifikat ist abgelaufen.</translation>
+    </message>
+    <message>
+        <source>This certificate is not yet valid.</source>
+        <translation>Dieses Zertifikat ist noch nicht gültig.</translation>
+    </message>
+    <message>
+        <source>This certificate expires soon.</source>
+        <translation>Dieses Zertifikat läuft bald ab.</translation>
+    </message>
+    <message>
+        <source>This is no certificate of an authority.</source>
+        <translation>Dies ist kein Zertifikat einer Zertifizierungsstelle.</translation>
+    </message>
+    <message>
+        <source>CA certificate</source>
+        <translation>CA-Zertifikat</translation>
+    </message>
+    <message>
+        <source>Choose a file</source>
+        <translation>Datei wählen</translation>
+    </message>
+    <message>
+        <source>Browse…</source>
+        <translation>Durchsuchen…</translation>
+    </message>
+    <message>
+        <source>Choose a CA certificate</source>
+        <translation>CA-Zertifikat wählen</translation>
+    </message>
+    <message>
+        <source>There is no certificate in the file.</source>
+        <translation>Die Datei enthält kein Zertifikat.</translation>
+    </message>
+    <message>
+        <source>%1, valid from %2 to %3</source>
+        <translation>%1, gültig von %2 bis %3</translation>
+    </message>
+    <message>
+        <source>%1 %2</source>
+        <translation>%1 %2</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateBox</name>
+    <message>
+        <source>Select all/Deselect all</source>
+        <translation>Alle auswählen/abwählen</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Suchen</translation>
+    </message>
+    <message>
+        <source>Search model, IP or MAC</source>
+        <translation>Modell, IP oder MAC suchen</translation>
+    </message>
+    <message>
+        <source>Choose files…</source>
+        <translation>Dateien wählen…</translation>
+    </message>
+    <message>
+        <source>Devices and their certificates</source>
+        <translation>Geräte und ihre Zertifikate</translation>
+    </message>
+    <message>
+        <source>Pick certificate…</source>
+        <translation>Zertifikat wählen…</translation>
+    </message>
+    <message>
+        <source>Pick private key…</source>
+        <translation>Privaten Schlüssel wählen…</translation>
+    </message>
+    <message>
+        <source>Remove files</source>
+        <translation>Dateien entfernen</translation>
+    </message>
+    <message>
+        <source>Choose files</source>
+        <translation>Dateien wählen</translation>
+    </message>
+    <message>
+        <source>Pick private key</source>
+        <translation>Privaten Schlüssel wählen</translation>
+    </message>
+    <message>
+        <source>Pick certificate</source>
+        <translation>Zertifikat wählen</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>There is no private key in the file.</source>
+        <translation>Die Datei enthält keinen privaten Schlüssel.</translation>
+    </message>
+    <message>
+        <source>There is no certificate in the file.</source>
+        <translation>Die Datei enthält kein Zertifikat.</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n file(s) left to read…</source>
+        <translation>
+            <numerusform>%n Datei wird noch gelesen…</numerusform>
+            <numerusform>%n Dateien werden noch gelesen…</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n file(s) not used: %1</source>
+        <translation>
+            <numerusform>%n Datei nicht verwendet: %1</numerusform>
+            <numerusform>%n Dateien nicht verwendet: %1</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>, </source>
+        <translation>, </translation>
+    </message>
+    <message>
+        <source>Files find their devices by the MAC addresses in their names. Drop them here, or select rows to pick by hand.</source>
+        <translation>Dateien finden ihre Geräte über die MAC-Adressen in ihren Namen. Dateien hier ablegen oder Zeilen auswählen, um sie einzeln zu wählen.</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateCheck</name>
+    <message>
+        <source>No MAC address of its own</source>
+        <translation>Keine eigene MAC-Adresse</translation>
+    </message>
+    <message>
+        <source>File of no use</source>
+        <translation>Unbrauchbare Datei</translation>
+    </message>
+    <message>
+        <source>No certificate</source>
+        <translation>Kein Zertifikat</translation>
+    </message>
+    <message>
+        <source>No private key</source>
+        <translation>Kein privater Schlüssel</translation>
+    </message>
+    <message>
+        <source>Encrypted key not supported</source>
+        <translation>Verschlüsselter Schlüssel nicht unterstützt</translation>
+    </message>
+    <message>
+        <source>Key not opened by the password</source>
+        <translation>Passwort öffnet den Schlüssel nicht</translation>
+    </message>
+    <message>
+        <source>Key of another certificate</source>
+        <translation>Schlüssel eines anderen Zertifikats</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Abgelaufen</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) would get an expired certificate.</source>
+        <translation>
+            <numerusform>%n Gerät würde ein abgelaufenes Zertifikat erhalten.</numerusform>
+            <numerusform>%n Geräte würden ein abgelaufenes Zertifikat erhalten.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Not yet valid</source>
+        <translation>Noch nicht gültig</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) would get a certificate that is not yet valid.</source>
+        <translation>
+            <numerusform>%n Gerät würde ein noch nicht gültiges Zertifikat erhalten.</numerusform>
+            <numerusform>%n Geräte würden ein noch nicht gültiges Zertifikat erhalten.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>File with a private key</source>
+        <translation>Datei mit privatem Schlüssel</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) would get a file that holds a private key too.</source>
+        <translation>
+            <numerusform>%n Gerät würde eine Datei erhalten, die auch einen privaten Schlüssel enthält.</numerusform>
+            <numerusform>%n Geräte würden eine Datei erhalten, die auch einen privaten Schlüssel enthält.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>No key or request on the device</source>
+        <translation>Kein Schlüssel und keine Anforderung auf dem Gerät</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will fail: no private key or certificate request there to install a certificate for.</source>
+        <translation>
+            <numerusform>%n Gerät wird fehlschlagen: es hat weder einen privaten Schlüssel noch eine Zertifikatsanforderung.</numerusform>
+            <numerusform>%n Geräte werden fehlschlagen: sie haben weder einen privaten Schlüssel noch eine Zertifikatsanforderung.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Expires soon</source>
+        <translation>Läuft bald ab</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateFiles</name>
+    <message>
+        <source>The file does not exist.</source>
+        <translation>Die Datei ist nicht vorhanden.</translation>
+    </message>
+    <message>
+        <source>It is a folder, not a file.</source>
+        <translation>Es ist ein Ordner, keine Datei.</translation>
+    </message>
+    <message>
+        <source>It is not a plain file.</source>
+        <translation>Es ist keine gewöhnliche Datei.</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>Die Datei ist leer.</translation>
+    </message>
+    <message>
+        <source>The file is larger than 1 MiB, which no certificate is.</source>
+        <translation>Die Datei ist größer als 1 MiB; so groß ist kein Zertifikat.</translation>
+    </message>
+    <message>
+        <source>The file cannot be read: %1.</source>
+        <translation>Die Datei kann nicht gelesen werden: %1.</translation>
+    </message>
+    <message>
+        <source>The file cannot be read.</source>
+        <translation>Die Datei kann nicht gelesen werden.</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateListModel</name>
+    <message>
+        <source>HTTPS</source>
+        <translation>HTTPS</translation>
+    </message>
+    <message>
+        <source>IEEE 802.1X</source>
+        <translation>IEEE 802.1X</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>Zustand</translation>
+    </message>
+    <message>
+        <source>Expires</source>
+        <translation>Läuft ab</translation>
+    </message>
+    <message>
+        <source>Use</source>
+        <translation>Verwendung</translation>
+    </message>
+    <message>
+        <source>Subject</source>
+        <translation>Inhaber</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateModel</name>
+    <message>
+        <source>%1, %2</source>
+        <translation>%1, %2</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>, </source>
+        <translation>, </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will be left out: %1.</source>
+        <translation>
+            <numerusform>%n Gerät wird ausgelassen: %1.</numerusform>
+            <numerusform>%n Geräte werden ausgelassen: %1.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>self-signed</source>
+        <translation>selbst signiert</translation>
+    </message>
+    <message>
+        <source>issued by %1</source>
+        <translation>ausgestellt von %1</translation>
+    </message>
+    <message>
+        <source>%1, %2, valid from %3 to %4</source>
+        <translation>%1, %2, gültig von %3 bis %4</translation>
+    </message>
+    <message>
+        <source>Model</source>
+        <translation>Modell</translation>
+    </message>
+    <message>
+        <source>IP</source>
+        <translation>IP</translation>
+    </message>
+    <message>
+        <source>MAC</source>
+        <translation>MAC</translation>
+    </message>
+    <message>
+        <source>Certificate</source>
+        <translation>Zertifikat</translation>
+    </message>
+    <message>
+        <source>Private Key</source>
+        <translation>Privater Schlüssel</translation>
+    </message>
+    <message>
+        <source>Valid until</source>
+        <translation>Gültig bis</translation>
+    </message>
+    <message>
+        <source>Note</source>
+        <translation>Hinweis</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Key matches</source>
+        <translation>Schlüssel passt</translation>
+    </message>
+    <message>
+        <source>Ready</source>
+        <translation>Bereit</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateParser</name>
+    <message>
+        <source>The private key in the file is damaged or of an unknown kind.</source>
+        <translation>Der private Schlüssel in der Datei ist beschädigt oder von unbekannter Art.</translation>
+    </message>
+    <message>
+        <source>The file holds a request for a certificate, not a certificate.</source>
+        <translation>Die Datei enthält eine Zertifikatsanforderung, kein Zertifikat.</translation>
+    </message>
+    <message>
+        <source>The file holds a public key only.</source>
+        <translation>Die Datei enthält nur einen öffentlichen Schlüssel.</translation>
+    </message>
+    <message>
+        <source>The file holds neither a certificate nor a private key.</source>
+        <translation>Die Datei enthält weder ein Zertifikat noch einen privaten Schlüssel.</translation>
+    </message>
+    <message>
+        <source>A certificate in the file is damaged.</source>
+        <translation>Ein Zertifikat in der Datei ist beschädigt.</translation>
+    </message>
+    <message>
+        <source>The file is damaged or cut off.</source>
+        <translation>Die Datei ist beschädigt oder abgeschnitten.</translation>
+    </message>
+    <message>
+        <source>The file holds neither a certificate nor a private key in PEM or DER form.</source>
+        <translation>Die Datei enthält weder ein Zertifikat noch einen privaten Schlüssel im PEM- oder DER-Format.</translation>
+    </message>
+</context>
+<context>
+    <name>CertificatePaths</name>
+    <message>
+        <source>Certificates and keys</source>
+        <translation>Zertifikate und Schlüssel</translation>
+    </message>
+    <message>
+        <source>All files</source>
+        <translation>Alle Dateien</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateUploadDialog</name>
+    <message>
+        <source>Certificates in use</source>
+        <translation>Verwendete Zertifikate</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Übernehmen</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices will be served</source>
+        <translation>%1 von %2 Geräten werden bedient</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>Das Hochladen konnte nicht gestartet werden.</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateValidities</name>
+    <message>
+        <source>Unknown</source>
+        <translation>Unbekannt</translation>
+    </message>
+    <message>
+        <source>Not yet valid</source>
+        <translation>Noch nicht gültig</translation>
+    </message>
+    <message>
+        <source>Expires soon</source>
+        <translation>Läuft bald ab</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Abgelaufen</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Gültig</translation>
+    </message>
+</context>
+<context>
+    <name>CertificatesDialog</name>
+    <message>
+        <source>Certificates in use</source>
+        <translation>Verwendete Zertifikate</translation>
+    </message>
+    <message>
+        <source>Reading the certificates…</source>
+        <translation>Zertifikate werden gelesen…</translation>
+    </message>
+    <message>
+        <source>The certificates could not be read.</source>
+        <translation>Die Zertifikate konnten nicht gelesen werden.</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Suchen</translation>
+    </message>
+    <message>
+        <source>Search device or subject</source>
+        <translation>Gerät oder Inhaber suchen</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
+    <message>
+        <source>No device works with a certificate.</source>
+        <translation>Kein Gerät arbeitet mit einem Zertifikat.</translation>
+    </message>
+    <message>
+        <source>No certificate matches the search.</source>
+        <translation>Kein Zertifikat passt zur Suche.</translation>
+    </message>
+    <message>
+        <source>%1 expired, %2 within %3 days</source>
+        <translation>%1 abgelaufen, %2 innerhalb von %3 Tagen</translation>
+    </message>
+    <message>
+        <source>%1 of %2 certificates</source>
+        <translation>%1 von %2 Zertifikaten</translation>
+    </message>
+</context>
+<context>
     <name>ConfirmDialog</name>
     <message>
         <source>Cancel</source>
@@ -1492,6 +1977,10 @@
         <source>More</source>
         <translation>Mehr</translation>
     </message>
+    <message>
+        <source>Certificates in use</source>
+        <translation>Verwendete Zertifikate</translation>
+    </message>
 </context>
 <context>
     <name>DeviceWindow</name>
@@ -1547,6 +2036,33 @@
     </message>
 </context>
 <context>
+    <name>ExportDebugInfoDialog</name>
+    <message>
+        <source>Export Debug Info</source>
+        <translation>Debug-Infos exportieren</translation>
+    </message>
+    <message>
+        <source>Folder on this computer</source>
+        <translation>Ordner auf diesem Computer</translation>
+    </message>
+    <message>
+        <source>Choose Folder</source>
+        <translation>Ordner wählen</translation>
+    </message>
+    <message>
+        <source>The devices collect the information first. The report is saved when they are done, also if the program is started again meanwhile.</source>
+        <translation>Die Geräte sammeln die Informationen zuerst. Der Bericht wird gespeichert, wenn sie fertig sind, auch wenn das Programm inzwischen neu gestartet wird.</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Exportieren</translation>
+    </message>
+    <message>
+        <source>The export could not be started.</source>
+        <translation>Der Export konnte nicht gestartet werden.</translation>
+    </message>
+</context>
+<context>
     <name>FailedTaskStrip</name>
     <message>
         <source>Start again</source>
@@ -1566,6 +2082,88 @@
     <message>
         <source>1 of %1</source>
         <translation>1 von %1</translation>
+    </message>
+</context>
+<context>
+    <name>FileCheck</name>
+    <message>
+        <source>There is no such file.</source>
+        <translation>Die Datei ist nicht vorhanden.</translation>
+    </message>
+    <message>
+        <source>This is a folder.</source>
+        <translation>Dies ist ein Ordner.</translation>
+    </message>
+    <message>
+        <source>This is no plain file.</source>
+        <translation>Dies ist keine gewöhnliche Datei.</translation>
+    </message>
+    <message>
+        <source>The file has a blank name.</source>
+        <translation>Der Name der Datei ist leer.</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>Die Datei ist leer.</translation>
+    </message>
+    <message>
+        <source>The file is larger than 4 GiB.</source>
+        <translation>Die Datei ist größer als 4 GiB.</translation>
+    </message>
+    <message>
+        <source>The file cannot be read.</source>
+        <translation>Die Datei kann nicht gelesen werden.</translation>
+    </message>
+    <message>
+        <source>There is no such folder.</source>
+        <translation>Der Ordner ist nicht vorhanden.</translation>
+    </message>
+    <message>
+        <source>This is no folder.</source>
+        <translation>Dies ist kein Ordner.</translation>
+    </message>
+    <message>
+        <source>Nothing can be written to this folder.</source>
+        <translation>In diesen Ordner kann nichts geschrieben werden.</translation>
+    </message>
+</context>
+<context>
+    <name>FileField</name>
+    <message>
+        <source>Browse...</source>
+        <translation>Durchsuchen ...</translation>
+    </message>
+    <message>
+        <source>Drop a file here or browse for it</source>
+        <translation>Eine Datei hier ablegen oder nach ihr suchen</translation>
+    </message>
+    <message>
+        <source>Drop a folder here or browse for it</source>
+        <translation>Einen Ordner hier ablegen oder nach ihm suchen</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>Only one file can be taken.</source>
+        <translation>Nur eine Datei ist möglich.</translation>
+    </message>
+    <message>
+        <source>Only one folder can be taken.</source>
+        <translation>Nur ein Ordner ist möglich.</translation>
+    </message>
+    <message>
+        <source>Looking at it...</source>
+        <translation>Wird geprüft ...</translation>
+    </message>
+    <message>
+        <source>Size: %1</source>
+        <translation>Größe: %1</translation>
+    </message>
+    <message>
+        <source>Free: %1</source>
+        <translation>Frei: %1</translation>
     </message>
 </context>
 <context>
@@ -2038,6 +2636,45 @@
         <source>Tasks</source>
         <translation>Aufgaben</translation>
     </message>
+    <message>
+        <source>Debug information saved as “%1”.</source>
+        <translation>Debug-Infos gespeichert als „%1“.</translation>
+    </message>
+</context>
+<context>
+    <name>ModelGroupModel</name>
+    <message>
+        <source>Model</source>
+        <translation>Modell</translation>
+    </message>
+    <message>
+        <source>Devices</source>
+        <translation>Geräte</translation>
+    </message>
+    <message>
+        <source>Present version</source>
+        <translation>Jetzige Version</translation>
+    </message>
+    <message>
+        <source>Image</source>
+        <translation>Image</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 von %2</translation>
+    </message>
+    <message>
+        <source>fits</source>
+        <translation>passt</translation>
+    </message>
+    <message>
+        <source>another model group</source>
+        <translation>andere Modellgruppe</translation>
+    </message>
+    <message>
+        <source>cannot be told, the device will judge</source>
+        <translation>nicht erkennbar, das Gerät entscheidet</translation>
+    </message>
 </context>
 <context>
     <name>NoticeBar</name>
@@ -2243,6 +2880,85 @@
     </message>
 </context>
 <context>
+    <name>QuickSetupDialog</name>
+    <message>
+        <source>Quick Setup</source>
+        <translation>Schnelleinrichtung</translation>
+    </message>
+    <message>
+        <source>Daylight saving</source>
+        <translation>Sommerzeit</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>Ein</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Aus</translation>
+    </message>
+    <message>
+        <source>Mains frequency</source>
+        <translation>Netzfrequenz</translation>
+    </message>
+    <message>
+        <source>50 Hz</source>
+        <translation>50 Hz</translation>
+    </message>
+    <message>
+        <source>60 Hz</source>
+        <translation>60 Hz</translation>
+    </message>
+    <message>
+        <source>Audio</source>
+        <translation>Audio</translation>
+    </message>
+    <message>
+        <source>Mute</source>
+        <translation>Stumm</translation>
+    </message>
+    <message>
+        <source>Unmute</source>
+        <translation>Nicht stumm</translation>
+    </message>
+    <message>
+        <source>Only the settings that are ticked change.</source>
+        <translation>Nur die angekreuzten Einstellungen ändern sich.</translation>
+    </message>
+    <message>
+        <source>Time zone</source>
+        <translation>Zeitzone</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>Datum und Uhrzeit</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Übernehmen</translation>
+    </message>
+    <message>
+        <source>As written below</source>
+        <translation>Wie unten angegeben</translation>
+    </message>
+    <message>
+        <source>Time zone as POSIX writes it</source>
+        <translation>Zeitzone in POSIX-Schreibweise</translation>
+    </message>
+    <message>
+        <source>This time zone has no daylight saving.</source>
+        <translation>Diese Zeitzone hat keine Sommerzeit.</translation>
+    </message>
+    <message>
+        <source>This is no time zone, as CET-1CEST,M3.5.0,M10.5.0/3 is one.</source>
+        <translation>Das ist keine Zeitzone wie etwa CET-1CEST,M3.5.0,M10.5.0/3.</translation>
+    </message>
+    <message>
+        <source>The setup could not be started.</source>
+        <translation>Die Einrichtung konnte nicht gestartet werden.</translation>
+    </message>
+</context>
+<context>
     <name>ReconnectingDialog</name>
     <message>
         <source>Unable to establish a connection to the server. The client is currently attempting to reconnect to the server.</source>
@@ -2379,6 +3095,247 @@
             <numerusform>Die Einstellungen von %n Gerät gehen verloren. Zum Fortfahren %n eingeben.</numerusform>
             <numerusform>Die Einstellungen von %n Geräten gehen verloren. Zum Fortfahren %n eingeben.</numerusform>
         </translation>
+    </message>
+</context>
+<context>
+    <name>Rollout</name>
+    <message>
+        <source>The client was closed before it began.</source>
+        <translation>Der Client wurde vor dem Beginn geschlossen.</translation>
+    </message>
+</context>
+<context>
+    <name>RolloutFields</name>
+    <message>
+        <source>In waves:</source>
+        <translation>In Wellen:</translation>
+    </message>
+    <message>
+        <source>Size of the first wave</source>
+        <translation>Größe der ersten Welle</translation>
+    </message>
+    <message>
+        <source>What the first wave is counted in</source>
+        <translation>Einheit der ersten Welle</translation>
+    </message>
+    <message>
+        <source>devices</source>
+        <translation>Geräte</translation>
+    </message>
+    <message>
+        <source>%</source>
+        <translation>%</translation>
+    </message>
+    <message>
+        <source>Minutes between the waves</source>
+        <translation>Minuten zwischen den Wellen</translation>
+    </message>
+    <message>
+        <source>Most failed devices in percent</source>
+        <translation>Höchstens fehlgeschlagene Geräte in Prozent</translation>
+    </message>
+    <message>
+        <source> min</source>
+        <translation> min</translation>
+    </message>
+    <message>
+        <source> %</source>
+        <translation> %</translation>
+    </message>
+    <message>
+        <source>first</source>
+        <translation>zuerst</translation>
+    </message>
+    <message>
+        <source>wait</source>
+        <translation>warten</translation>
+    </message>
+    <message>
+        <source>go on if at most</source>
+        <translation>weiter, wenn höchstens</translation>
+    </message>
+    <message>
+        <source>failed</source>
+        <translation>fehlschlagen</translation>
+    </message>
+</context>
+<context>
+    <name>RolloutMgr</name>
+    <message>
+        <source>The image has changed since the rollout began.</source>
+        <translation>Das Image hat sich seit Beginn der Verteilung geändert.</translation>
+    </message>
+    <message>
+        <source>The image could not be checked.</source>
+        <translation>Das Image konnte nicht geprüft werden.</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>Das Hochladen konnte nicht gestartet werden.</translation>
+    </message>
+    <message numerus="yes">
+        <source>The session has ended, and with it the rollout(s) of %1. Waves that were sent go on.</source>
+        <translation>
+            <numerusform>Die Sitzung ist beendet, und mit ihr die Verteilung von %1. Gesendete Wellen laufen weiter.</numerusform>
+            <numerusform>Die Sitzung ist beendet, und mit ihr die Verteilungen von %1. Gesendete Wellen laufen weiter.</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
+    <name>RolloutRow</name>
+    <message>
+        <source>Continue</source>
+        <translation>Fortsetzen</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Anhalten</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>Ausblenden</translation>
+    </message>
+    <message>
+        <source>Begin with the other devices now</source>
+        <translation>Jetzt mit den übrigen Geräten beginnen</translation>
+    </message>
+    <message>
+        <source>Do not begin with the other devices; those at work go on</source>
+        <translation>Mit den übrigen Geräten nicht beginnen; begonnene laufen weiter</translation>
+    </message>
+</context>
+<context>
+    <name>RolloutTexts</name>
+    <message>
+        <source>%1 of %2 done</source>
+        <translation>%1 von %2 fertig</translation>
+    </message>
+    <message>
+        <source>%1, %2 failed</source>
+        <translation>%1, %2 fehlgeschlagen</translation>
+    </message>
+    <message>
+        <source>Second wave</source>
+        <translation>Zweite Welle</translation>
+    </message>
+    <message>
+        <source>First wave</source>
+        <translation>Erste Welle</translation>
+    </message>
+    <message numerus="yes">
+        <source>%1: %n device(s), waiting to be sent.</source>
+        <translation>
+            <numerusform>%1: %n Gerät, wartet auf das Senden.</numerusform>
+            <numerusform>%1: %n Geräte, warten auf das Senden.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1: %n device(s), scheduled for %2.</source>
+        <translation>
+            <numerusform>%1: %n Gerät, geplant für %2.</numerusform>
+            <numerusform>%1: %n Geräte, geplant für %2.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1: %2.</source>
+        <translation>%1: %2.</translation>
+    </message>
+    <message>
+        <source>Waiting %1 min.</source>
+        <translation>Noch %1 min warten.</translation>
+    </message>
+    <message>
+        <source>Stopped: more than %1 % of the first wave failed.</source>
+        <translation>Angehalten: mehr als %1 % der ersten Welle sind fehlgeschlagen.</translation>
+    </message>
+    <message>
+        <source>Stopped: the task of this wave was cancelled.</source>
+        <translation>Angehalten: die Aufgabe dieser Welle wurde abgebrochen.</translation>
+    </message>
+    <message>
+        <source>Stopped: the task of this wave is no longer in the list.</source>
+        <translation>Angehalten: die Aufgabe dieser Welle steht nicht mehr in der Liste.</translation>
+    </message>
+    <message>
+        <source>Stopped: this wave did not begin. %1</source>
+        <translation>Angehalten: diese Welle wurde nicht begonnen. %1</translation>
+    </message>
+    <message>
+        <source>Stopped.</source>
+        <translation>Angehalten.</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) wait for the second wave.</source>
+        <translation>
+            <numerusform>%n Gerät wartet auf die zweite Welle.</numerusform>
+            <numerusform>%n Geräte warten auf die zweite Welle.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Finished: %1.</source>
+        <translation>Abgeschlossen: %1.</translation>
+    </message>
+</context>
+<context>
+    <name>ScheduleField</name>
+    <message>
+        <source>Now</source>
+        <translation>Jetzt</translation>
+    </message>
+    <message>
+        <source>At</source>
+        <translation>Am</translation>
+    </message>
+    <message>
+        <source>Time of the upload</source>
+        <translation>Zeitpunkt des Hochladens</translation>
+    </message>
+    <message>
+        <source>There is no such time on that day: the clocks are put forward.</source>
+        <translation>Diese Uhrzeit gibt es an dem Tag nicht: die Uhren werden vorgestellt.</translation>
+    </message>
+    <message>
+        <source>This time has passed; choose a later one.</source>
+        <translation>Dieser Zeitpunkt ist vorbei; bitte einen späteren wählen.</translation>
+    </message>
+</context>
+<context>
+    <name>SelfSignedFields</name>
+    <message>
+        <source>Two letters, as in US</source>
+        <translation>Zwei Buchstaben, etwa DE</translation>
+    </message>
+    <message>
+        <source>Optional</source>
+        <translation>Optional</translation>
+    </message>
+    <message>
+        <source>Country</source>
+        <translation>Land</translation>
+    </message>
+    <message>
+        <source>State/Province</source>
+        <translation>Bundesland/Kanton</translation>
+    </message>
+    <message>
+        <source>Locality</source>
+        <translation>Ort</translation>
+    </message>
+    <message>
+        <source>Organization</source>
+        <translation>Organisation</translation>
+    </message>
+    <message>
+        <source>Organizational Unit</source>
+        <translation>Organisationseinheit</translation>
+    </message>
+    <message>
+        <source>Validity (days)</source>
+        <translation>Gültigkeit (Tage)</translation>
+    </message>
+    <message>
+        <source>The country is named by its two letters, as in US.</source>
+        <translation>Das Land wird mit zwei Buchstaben angegeben, etwa DE.</translation>
     </message>
 </context>
 <context>
@@ -3499,6 +4456,290 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     </message>
 </context>
 <context>
+    <name>TimeSyncFields</name>
+    <message numerus="yes">
+        <source>Every %n hour(s)</source>
+        <translation>
+            <numerusform>Alle %n Std.</numerusform>
+            <numerusform>Alle %n Std.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Every %n minute(s)</source>
+        <translation>
+            <numerusform>Alle %n Min.</numerusform>
+            <numerusform>Alle %n Min.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Time synchronization</source>
+        <translation>Zeitsynchronisierung</translation>
+    </message>
+    <message>
+        <source>Set once from this computer</source>
+        <translation>Einmal nach diesem Computer stellen</translation>
+    </message>
+    <message>
+        <source>NTP servers</source>
+        <translation>NTP-Server</translation>
+    </message>
+    <message>
+        <source>NTP server %1</source>
+        <translation>NTP-Server %1</translation>
+    </message>
+    <message>
+        <source>Update interval</source>
+        <translation>Aktualisierungsintervall</translation>
+    </message>
+    <message>
+        <source>“%1” is no name or address of a server.</source>
+        <translation>„%1“ ist kein Name und keine Adresse eines Servers.</translation>
+    </message>
+    <message>
+        <source>The server “%1” is named twice.</source>
+        <translation>Der Server „%1“ ist doppelt angegeben.</translation>
+    </message>
+    <message>
+        <source>Name at least one NTP server.</source>
+        <translation>Mindestens einen NTP-Server angeben.</translation>
+    </message>
+</context>
+<context>
+    <name>TimeZones</name>
+    <message>
+        <source>Pago Pago</source>
+        <translation>Pago Pago</translation>
+    </message>
+    <message>
+        <source>Honolulu</source>
+        <translation>Honolulu</translation>
+    </message>
+    <message>
+        <source>Anchorage</source>
+        <translation>Anchorage</translation>
+    </message>
+    <message>
+        <source>Los Angeles, Vancouver</source>
+        <translation>Los Angeles, Vancouver</translation>
+    </message>
+    <message>
+        <source>Denver, Edmonton</source>
+        <translation>Denver, Edmonton</translation>
+    </message>
+    <message>
+        <source>Phoenix</source>
+        <translation>Phoenix</translation>
+    </message>
+    <message>
+        <source>Chicago, Winnipeg</source>
+        <translation>Chicago, Winnipeg</translation>
+    </message>
+    <message>
+        <source>Mexico City, Guatemala</source>
+        <translation>Mexiko-Stadt, Guatemala</translation>
+    </message>
+    <message>
+        <source>New York, Toronto</source>
+        <translation>New York, Toronto</translation>
+    </message>
+    <message>
+        <source>Bogotá, Lima</source>
+        <translation>Bogotá, Lima</translation>
+    </message>
+    <message>
+        <source>Halifax</source>
+        <translation>Halifax</translation>
+    </message>
+    <message>
+        <source>Caracas, La Paz</source>
+        <translation>Caracas, La Paz</translation>
+    </message>
+    <message>
+        <source>Santiago</source>
+        <translation>Santiago</translation>
+    </message>
+    <message>
+        <source>St. John’s</source>
+        <translation>St. John’s</translation>
+    </message>
+    <message>
+        <source>São Paulo, Buenos Aires</source>
+        <translation>São Paulo, Buenos Aires</translation>
+    </message>
+    <message>
+        <source>South Georgia</source>
+        <translation>Südgeorgien</translation>
+    </message>
+    <message>
+        <source>Azores</source>
+        <translation>Azoren</translation>
+    </message>
+    <message>
+        <source>Praia</source>
+        <translation>Praia</translation>
+    </message>
+    <message>
+        <source>Coordinated Universal Time</source>
+        <translation>Koordinierte Weltzeit</translation>
+    </message>
+    <message>
+        <source>London, Dublin</source>
+        <translation>London, Dublin</translation>
+    </message>
+    <message>
+        <source>Lisbon</source>
+        <translation>Lissabon</translation>
+    </message>
+    <message>
+        <source>Accra, Reykjavik</source>
+        <translation>Accra, Reykjavik</translation>
+    </message>
+    <message>
+        <source>Berlin, Madrid, Paris, Rome</source>
+        <translation>Berlin, Madrid, Paris, Rom</translation>
+    </message>
+    <message>
+        <source>Algiers, Tunis</source>
+        <translation>Algier, Tunis</translation>
+    </message>
+    <message>
+        <source>Lagos</source>
+        <translation>Lagos</translation>
+    </message>
+    <message>
+        <source>Athens, Helsinki, Kyiv</source>
+        <translation>Athen, Helsinki, Kiew</translation>
+    </message>
+    <message>
+        <source>Cairo</source>
+        <translation>Kairo</translation>
+    </message>
+    <message>
+        <source>Jerusalem</source>
+        <translation>Jerusalem</translation>
+    </message>
+    <message>
+        <source>Johannesburg</source>
+        <translation>Johannesburg</translation>
+    </message>
+    <message>
+        <source>Istanbul, Riyadh</source>
+        <translation>Istanbul, Riad</translation>
+    </message>
+    <message>
+        <source>Moscow</source>
+        <translation>Moskau</translation>
+    </message>
+    <message>
+        <source>Nairobi</source>
+        <translation>Nairobi</translation>
+    </message>
+    <message>
+        <source>Tehran</source>
+        <translation>Teheran</translation>
+    </message>
+    <message>
+        <source>Baku, Dubai</source>
+        <translation>Baku, Dubai</translation>
+    </message>
+    <message>
+        <source>Kabul</source>
+        <translation>Kabul</translation>
+    </message>
+    <message>
+        <source>Karachi</source>
+        <translation>Karatschi</translation>
+    </message>
+    <message>
+        <source>Tashkent</source>
+        <translation>Taschkent</translation>
+    </message>
+    <message>
+        <source>Delhi, Mumbai</source>
+        <translation>Delhi, Mumbai</translation>
+    </message>
+    <message>
+        <source>Kathmandu</source>
+        <translation>Kathmandu</translation>
+    </message>
+    <message>
+        <source>Dhaka</source>
+        <translation>Dhaka</translation>
+    </message>
+    <message>
+        <source>Yangon</source>
+        <translation>Rangun</translation>
+    </message>
+    <message>
+        <source>Bangkok, Hanoi</source>
+        <translation>Bangkok, Hanoi</translation>
+    </message>
+    <message>
+        <source>Jakarta</source>
+        <translation>Jakarta</translation>
+    </message>
+    <message>
+        <source>Beijing, Shanghai, Taipei</source>
+        <translation>Peking, Shanghai, Taipeh</translation>
+    </message>
+    <message>
+        <source>Hong Kong</source>
+        <translation>Hongkong</translation>
+    </message>
+    <message>
+        <source>Manila</source>
+        <translation>Manila</translation>
+    </message>
+    <message>
+        <source>Kuala Lumpur, Singapore</source>
+        <translation>Kuala Lumpur, Singapur</translation>
+    </message>
+    <message>
+        <source>Perth</source>
+        <translation>Perth</translation>
+    </message>
+    <message>
+        <source>Tokyo</source>
+        <translation>Tokio</translation>
+    </message>
+    <message>
+        <source>Seoul</source>
+        <translation>Seoul</translation>
+    </message>
+    <message>
+        <source>Darwin</source>
+        <translation>Darwin</translation>
+    </message>
+    <message>
+        <source>Adelaide</source>
+        <translation>Adelaide</translation>
+    </message>
+    <message>
+        <source>Brisbane</source>
+        <translation>Brisbane</translation>
+    </message>
+    <message>
+        <source>Melbourne, Sydney</source>
+        <translation>Melbourne, Sydney</translation>
+    </message>
+    <message>
+        <source>Nouméa</source>
+        <translation>Nouméa</translation>
+    </message>
+    <message>
+        <source>Suva</source>
+        <translation>Suva</translation>
+    </message>
+    <message>
+        <source>Auckland</source>
+        <translation>Auckland</translation>
+    </message>
+    <message>
+        <source>Nukuʻalofa</source>
+        <translation>Nukuʻalofa</translation>
+    </message>
+</context>
+<context>
     <name>TitleBar</name>
     <message>
         <source>Help</source>
@@ -3605,6 +4846,326 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>Cancelling...</source>
         <translation>Wird abgebrochen ...</translation>
+    </message>
+</context>
+<context>
+    <name>UploadConfigurationDialog</name>
+    <message>
+        <source>Upload Configuration File</source>
+        <translation>Konfigurationsdatei hochladen</translation>
+    </message>
+    <message>
+        <source>Configuration file</source>
+        <translation>Konfigurationsdatei</translation>
+    </message>
+    <message>
+        <source>Choose Configuration File</source>
+        <translation>Konfigurationsdatei wählen</translation>
+    </message>
+    <message>
+        <source>One file of up to 4 GiB.</source>
+        <translation>Eine Datei von höchstens 4 GiB.</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>Hochladen</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>Das Hochladen konnte nicht gestartet werden.</translation>
+    </message>
+</context>
+<context>
+    <name>UploadDialogs</name>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
+    </message>
+</context>
+<context>
+    <name>UploadFile</name>
+    <message>
+        <source>There is no such file.</source>
+        <translation>Die Datei ist nicht vorhanden.</translation>
+    </message>
+    <message>
+        <source>This is a folder, not a file.</source>
+        <translation>Dies ist ein Ordner, keine Datei.</translation>
+    </message>
+    <message>
+        <source>The file cannot be read.</source>
+        <translation>Die Datei kann nicht gelesen werden.</translation>
+    </message>
+    <message>
+        <source>This is no plain file.</source>
+        <translation>Dies ist keine gewöhnliche Datei.</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>Die Datei ist leer.</translation>
+    </message>
+    <message>
+        <source>The file has %1; the server takes %2 at most.</source>
+        <translation>Die Datei hat %1; der Server nimmt höchstens %2 an.</translation>
+    </message>
+    <message>
+        <source>The name of the file is blank; give it another one.</source>
+        <translation>Der Name der Datei ist leer; bitte einen anderen vergeben.</translation>
+    </message>
+</context>
+<context>
+    <name>UploadFileField</name>
+    <message>
+        <source>Browse</source>
+        <translation>Durchsuchen</translation>
+    </message>
+    <message>
+        <source>Only one file can be uploaded at a time.</source>
+        <translation>Nur eine Datei kann auf einmal hochgeladen werden.</translation>
+    </message>
+    <message>
+        <source>Only a file of this computer can be uploaded.</source>
+        <translation>Nur eine Datei dieses Computers kann hochgeladen werden.</translation>
+    </message>
+    <message>
+        <source>The file could not be checked; choose it again.</source>
+        <translation>Die Datei konnte nicht geprüft werden; bitte erneut wählen.</translation>
+    </message>
+    <message>
+        <source>Checking...</source>
+        <translation>Wird geprüft ...</translation>
+    </message>
+</context>
+<context>
+    <name>UploadFirmwareDialog</name>
+    <message>
+        <source>Upload Firmware</source>
+        <translation>Firmware hochladen</translation>
+    </message>
+    <message>
+        <source>Only devices whose last upload failed</source>
+        <translation>Nur Geräte, deren letztes Hochladen fehlgeschlagen ist</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>Hochladen</translation>
+    </message>
+    <message>
+        <source>Open Firmware Image</source>
+        <translation>Firmware-Image öffnen</translation>
+    </message>
+    <message>
+        <source>All Files(*)</source>
+        <translation>Alle Dateien(*)</translation>
+    </message>
+    <message>
+        <source>Choose an image, or drop it here</source>
+        <translation>Ein Image wählen oder hier ablegen</translation>
+    </message>
+    <message>
+        <source>Firmware file</source>
+        <translation>Firmware-Datei</translation>
+    </message>
+    <message>
+        <source>Models of the devices</source>
+        <translation>Modelle der Geräte</translation>
+    </message>
+    <message>
+        <source>The last upload failed on none of the devices.</source>
+        <translation>Bei keinem der Geräte ist das letzte Hochladen fehlgeschlagen.</translation>
+    </message>
+    <message>
+        <source>When</source>
+        <translation>Wann</translation>
+    </message>
+    <message>
+        <source>Rollout</source>
+        <translation>Verteilung</translation>
+    </message>
+    <message>
+        <source>%1 at a time</source>
+        <translation>%1 zugleich</translation>
+    </message>
+    <message>
+        <source>The first line of this image is damaged; every device would refuse it.</source>
+        <translation>Die erste Zeile dieses Images ist beschädigt; jedes Gerät würde es ablehnen.</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will fail: the image is for another model group.</source>
+        <translation>
+            <numerusform>%n Gerät wird fehlschlagen: das Image ist für eine andere Modellgruppe.</numerusform>
+            <numerusform>%n Geräte werden fehlschlagen: das Image ist für eine andere Modellgruppe.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Another model group</source>
+        <translation>Andere Modellgruppe</translation>
+    </message>
+    <message>
+        <source>Schedule for %1, then %2</source>
+        <translation>Für %1 planen, dann %2</translation>
+    </message>
+    <message>
+        <source>Upload to %1, then %2</source>
+        <translation>Auf %1 laden, dann %2</translation>
+    </message>
+    <message>
+        <source>Schedule for %1</source>
+        <translation>Für %1 planen</translation>
+    </message>
+    <message>
+        <source>Upload to %1</source>
+        <translation>Auf %1 laden</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>Das Hochladen konnte nicht gestartet werden.</translation>
+    </message>
+</context>
+<context>
+    <name>UploadHttpsDialog</name>
+    <message>
+        <source>Upload Certificate – HTTPS</source>
+        <translation>Zertifikat hochladen – HTTPS</translation>
+    </message>
+    <message>
+        <source>Generate self-signed certificates</source>
+        <translation>Selbst signierte Zertifikate erzeugen</translation>
+    </message>
+    <message>
+        <source>Install certificates</source>
+        <translation>Zertifikate installieren</translation>
+    </message>
+    <message>
+        <source>Upload certificates and private keys</source>
+        <translation>Zertifikate und private Schlüssel hochladen</translation>
+    </message>
+    <message>
+        <source>HTTP and HTTPS</source>
+        <translation>HTTP und HTTPS</translation>
+    </message>
+    <message>
+        <source>HTTPS only</source>
+        <translation>Nur HTTPS</translation>
+    </message>
+    <message>
+        <source>Method</source>
+        <translation>Methode</translation>
+    </message>
+    <message>
+        <source>Mode</source>
+        <translation>Modus</translation>
+    </message>
+    <message>
+        <source>HTTPS Port</source>
+        <translation>HTTPS-Port</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) with HTTP on this port already.</source>
+        <translation>
+            <numerusform>%n Gerät mit HTTP auf diesem Port.</numerusform>
+            <numerusform>%n Geräte mit HTTP auf diesem Port.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>HTTP port</source>
+        <translation>HTTP-Port</translation>
+    </message>
+</context>
+<context>
+    <name>UploadIeeeDialog</name>
+    <message>
+        <source>Upload Certificate – IEEE 802.1x</source>
+        <translation>Zertifikat hochladen – IEEE 802.1x</translation>
+    </message>
+    <message>
+        <source>For encrypted private keys</source>
+        <translation>Für verschlüsselte private Schlüssel</translation>
+    </message>
+    <message>
+        <source>Password</source>
+        <translation>Passwort</translation>
+    </message>
+    <message>
+        <source>Private Key Password</source>
+        <translation>Passwort des privaten Schlüssels</translation>
+    </message>
+    <message>
+        <source>Method</source>
+        <translation>Methode</translation>
+    </message>
+    <message>
+        <source>Identity</source>
+        <translation>Identität</translation>
+    </message>
+    <message>
+        <source>CA Certificate</source>
+        <translation>CA-Zertifikat</translation>
+    </message>
+    <message>
+        <source>Type the identity that the devices log in with.</source>
+        <translation>Die Identität eingeben, mit der sich die Geräte anmelden.</translation>
+    </message>
+    <message>
+        <source>Type the password that the devices log in with.</source>
+        <translation>Das Passwort eingeben, mit dem sich die Geräte anmelden.</translation>
+    </message>
+    <message>
+        <source>Choose the certificate of the authority.</source>
+        <translation>Das Zertifikat der Zertifizierungsstelle wählen.</translation>
+    </message>
+</context>
+<context>
+    <name>UploadPackageDialog</name>
+    <message>
+        <source>Upload Package</source>
+        <translation>Paket hochladen</translation>
+    </message>
+    <message>
+        <source>Package</source>
+        <translation>Paket</translation>
+    </message>
+    <message>
+        <source>Choose Package</source>
+        <translation>Paket wählen</translation>
+    </message>
+    <message>
+        <source>One file of up to 4 GiB.</source>
+        <translation>Eine Datei von höchstens 4 GiB.</translation>
+    </message>
+    <message>
+        <source>Store the package on the memory card</source>
+        <translation>Das Paket auf der Speicherkarte ablegen</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>Hochladen</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will fail: no memory card is ready.</source>
+        <translation>
+            <numerusform>%n Gerät wird fehlschlagen: keine Speicherkarte ist bereit.</numerusform>
+            <numerusform>%n Geräte werden fehlschlagen: keine Speicherkarte ist bereit.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>No memory card ready</source>
+        <translation>Keine Speicherkarte bereit</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) may fail: the memory card is almost full.</source>
+        <translation>
+            <numerusform>%n Gerät kann fehlschlagen: die Speicherkarte ist fast voll.</numerusform>
+            <numerusform>%n Geräte können fehlschlagen: die Speicherkarte ist fast voll.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Memory card almost full</source>
+        <translation>Speicherkarte fast voll</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>Das Hochladen konnte nicht gestartet werden.</translation>
     </message>
 </context>
 <context>

@@ -733,6 +733,484 @@
     </message>
 </context>
 <context>
+    <name>CPostWork</name>
+    <message>
+        <source>Reason: %1.</source>
+        <translation>理由: %1。</translation>
+    </message>
+    <message>
+        <source>There will be no debug information in “%1”: the server does not know its task any more.</source>
+        <translation>「%1」にデバッグ情報は保存されません: サーバーがそのタスクを管理しなくなっています。</translation>
+    </message>
+    <message>
+        <source>The debug information could not be saved in “%1”, which will be tried again. %2</source>
+        <translation>「%1」にデバッグ情報を保存できませんでした。再試行します。%2</translation>
+    </message>
+</context>
+<context>
+    <name>CaFileField</name>
+    <message>
+        <source>This certificate has expired.</source>
+        <translation>この証明書は期限切れです。</translation>
+    </message>
+    <message>
+        <source>This certificate is not yet valid.</source>
+        <translation>この証明書はまだ有効ではありません。</translation>
+    </message>
+    <message>
+        <source>This certificate expires soon.</source>
+        <translation>この証明書はまもなく期限が切れます。</translation>
+    </message>
+    <message>
+        <source>This is no certificate of an authority.</source>
+        <translation>認証局の証明書ではありません。</translation>
+    </message>
+    <message>
+        <source>CA certificate</source>
+        <translation>CA 証明書</translation>
+    </message>
+    <message>
+        <source>Choose a file</source>
+        <translation>ファイルを選択</translation>
+    </message>
+    <message>
+        <source>Browse…</source>
+        <translation>参照…</translation>
+    </message>
+    <message>
+        <source>Choose a CA certificate</source>
+        <translation>CA 証明書を選択</translation>
+    </message>
+    <message>
+        <source>There is no certificate in the file.</source>
+        <translation>ファイルに証明書がありません。</translation>
+    </message>
+    <message>
+        <source>%1, valid from %2 to %3</source>
+        <translation>%1、有効期間 %2～%3</translation>
+    </message>
+    <message>
+        <source>%1 %2</source>
+        <translation>%1 %2</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateBox</name>
+    <message>
+        <source>Select all/Deselect all</source>
+        <translation>すべて選択/選択解除</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>検索</translation>
+    </message>
+    <message>
+        <source>Search model, IP or MAC</source>
+        <translation>モデル、IP、MAC を検索</translation>
+    </message>
+    <message>
+        <source>Choose files…</source>
+        <translation>ファイルを選択…</translation>
+    </message>
+    <message>
+        <source>Devices and their certificates</source>
+        <translation>デバイスとその証明書</translation>
+    </message>
+    <message>
+        <source>Pick certificate…</source>
+        <translation>証明書を選択…</translation>
+    </message>
+    <message>
+        <source>Pick private key…</source>
+        <translation>秘密鍵を選択…</translation>
+    </message>
+    <message>
+        <source>Remove files</source>
+        <translation>ファイルを取り除く</translation>
+    </message>
+    <message>
+        <source>Choose files</source>
+        <translation>ファイルを選択</translation>
+    </message>
+    <message>
+        <source>Pick private key</source>
+        <translation>秘密鍵を選択</translation>
+    </message>
+    <message>
+        <source>Pick certificate</source>
+        <translation>証明書を選択</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>There is no private key in the file.</source>
+        <translation>ファイルに秘密鍵がありません。</translation>
+    </message>
+    <message>
+        <source>There is no certificate in the file.</source>
+        <translation>ファイルに証明書がありません。</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n file(s) left to read…</source>
+        <translation>
+            <numerusform>残り %n 個のファイルを読み取っています…</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n file(s) not used: %1</source>
+        <translation>
+            <numerusform>%n 個のファイルは使用されません: %1</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>, </source>
+        <translation>, </translation>
+    </message>
+    <message>
+        <source>Files find their devices by the MAC addresses in their names. Drop them here, or select rows to pick by hand.</source>
+        <translation>ファイルは名前に含まれる MAC アドレスでデバイスに対応付けられます。ここにドロップするか、行を選択して個別に指定してください。</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateCheck</name>
+    <message>
+        <source>No MAC address of its own</source>
+        <translation>固有の MAC アドレスなし</translation>
+    </message>
+    <message>
+        <source>File of no use</source>
+        <translation>使用できないファイル</translation>
+    </message>
+    <message>
+        <source>No certificate</source>
+        <translation>証明書なし</translation>
+    </message>
+    <message>
+        <source>No private key</source>
+        <translation>秘密鍵なし</translation>
+    </message>
+    <message>
+        <source>Encrypted key not supported</source>
+        <translation>暗号化された鍵は未対応</translation>
+    </message>
+    <message>
+        <source>Key not opened by the password</source>
+        <translation>パスワードで鍵を開けません</translation>
+    </message>
+    <message>
+        <source>Key of another certificate</source>
+        <translation>別の証明書の鍵</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>期限切れ</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) would get an expired certificate.</source>
+        <translation>
+            <numerusform>%n 台のデバイスに期限切れの証明書が設定されます。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Not yet valid</source>
+        <translation>有効期間前</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) would get a certificate that is not yet valid.</source>
+        <translation>
+            <numerusform>%n 台のデバイスに有効期間前の証明書が設定されます。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>File with a private key</source>
+        <translation>秘密鍵を含むファイル</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) would get a file that holds a private key too.</source>
+        <translation>
+            <numerusform>%n 台のデバイスに秘密鍵も含むファイルが送られます。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>No key or request on the device</source>
+        <translation>デバイスに鍵も要求もありません</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will fail: no private key or certificate request there to install a certificate for.</source>
+        <translation>
+            <numerusform>%n 台のデバイスは失敗します: 証明書をインストールする対象の秘密鍵も証明書要求もありません。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Expires soon</source>
+        <translation>まもなく期限切れ</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateFiles</name>
+    <message>
+        <source>The file does not exist.</source>
+        <translation>ファイルが存在しません。</translation>
+    </message>
+    <message>
+        <source>It is a folder, not a file.</source>
+        <translation>ファイルではなくフォルダーです。</translation>
+    </message>
+    <message>
+        <source>It is not a plain file.</source>
+        <translation>通常のファイルではありません。</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>ファイルが空です。</translation>
+    </message>
+    <message>
+        <source>The file is larger than 1 MiB, which no certificate is.</source>
+        <translation>ファイルが 1 MiB を超えています。証明書ではありません。</translation>
+    </message>
+    <message>
+        <source>The file cannot be read: %1.</source>
+        <translation>ファイルを読み取れません: %1。</translation>
+    </message>
+    <message>
+        <source>The file cannot be read.</source>
+        <translation>ファイルを読み取れません。</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateListModel</name>
+    <message>
+        <source>HTTPS</source>
+        <translation>HTTPS</translation>
+    </message>
+    <message>
+        <source>IEEE 802.1X</source>
+        <translation>IEEE 802.1X</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>状態</translation>
+    </message>
+    <message>
+        <source>Expires</source>
+        <translation>有効期限</translation>
+    </message>
+    <message>
+        <source>Use</source>
+        <translation>用途</translation>
+    </message>
+    <message>
+        <source>Subject</source>
+        <translation>サブジェクト</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateModel</name>
+    <message>
+        <source>%1, %2</source>
+        <translation>%1, %2</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>, </source>
+        <translation>, </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will be left out: %1.</source>
+        <translation>
+            <numerusform>%n 台のデバイスを除外します: %1。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>self-signed</source>
+        <translation>自己署名</translation>
+    </message>
+    <message>
+        <source>issued by %1</source>
+        <translation>発行者 %1</translation>
+    </message>
+    <message>
+        <source>%1, %2, valid from %3 to %4</source>
+        <translation>%1、%2、有効期間 %3～%4</translation>
+    </message>
+    <message>
+        <source>Model</source>
+        <translation>モデル</translation>
+    </message>
+    <message>
+        <source>IP</source>
+        <translation>IP</translation>
+    </message>
+    <message>
+        <source>MAC</source>
+        <translation>MAC</translation>
+    </message>
+    <message>
+        <source>Certificate</source>
+        <translation>証明書</translation>
+    </message>
+    <message>
+        <source>Private Key</source>
+        <translation>秘密鍵</translation>
+    </message>
+    <message>
+        <source>Valid until</source>
+        <translation>有効期限</translation>
+    </message>
+    <message>
+        <source>Note</source>
+        <translation>備考</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Key matches</source>
+        <translation>鍵の一致</translation>
+    </message>
+    <message>
+        <source>Ready</source>
+        <translation>使用可能</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateParser</name>
+    <message>
+        <source>The private key in the file is damaged or of an unknown kind.</source>
+        <translation>ファイルの秘密鍵が壊れているか、不明な種類です。</translation>
+    </message>
+    <message>
+        <source>The file holds a request for a certificate, not a certificate.</source>
+        <translation>ファイルの内容は証明書ではなく証明書要求です。</translation>
+    </message>
+    <message>
+        <source>The file holds a public key only.</source>
+        <translation>ファイルには公開鍵しかありません。</translation>
+    </message>
+    <message>
+        <source>The file holds neither a certificate nor a private key.</source>
+        <translation>ファイルに証明書も秘密鍵もありません。</translation>
+    </message>
+    <message>
+        <source>A certificate in the file is damaged.</source>
+        <translation>ファイルの証明書が壊れています。</translation>
+    </message>
+    <message>
+        <source>The file is damaged or cut off.</source>
+        <translation>ファイルが壊れているか、途中で切れています。</translation>
+    </message>
+    <message>
+        <source>The file holds neither a certificate nor a private key in PEM or DER form.</source>
+        <translation>ファイルに PEM または DER 形式の証明書も秘密鍵もありません。</translation>
+    </message>
+</context>
+<context>
+    <name>CertificatePaths</name>
+    <message>
+        <source>Certificates and keys</source>
+        <translation>証明書と鍵</translation>
+    </message>
+    <message>
+        <source>All files</source>
+        <translation>すべてのファイル</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateUploadDialog</name>
+    <message>
+        <source>Certificates in use</source>
+        <translation>使用中の証明書</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>キャンセル</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>適用</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices will be served</source>
+        <translation>%2 台中 %1 台のデバイスが対象</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>アップロードを開始できませんでした。</translation>
+    </message>
+</context>
+<context>
+    <name>CertificateValidities</name>
+    <message>
+        <source>Unknown</source>
+        <translation>不明</translation>
+    </message>
+    <message>
+        <source>Not yet valid</source>
+        <translation>有効期間前</translation>
+    </message>
+    <message>
+        <source>Expires soon</source>
+        <translation>まもなく期限切れ</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>期限切れ</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>有効</translation>
+    </message>
+</context>
+<context>
+    <name>CertificatesDialog</name>
+    <message>
+        <source>Certificates in use</source>
+        <translation>使用中の証明書</translation>
+    </message>
+    <message>
+        <source>Reading the certificates…</source>
+        <translation>証明書を読み取っています…</translation>
+    </message>
+    <message>
+        <source>The certificates could not be read.</source>
+        <translation>証明書を読み取れませんでした。</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>検索</translation>
+    </message>
+    <message>
+        <source>Search device or subject</source>
+        <translation>デバイスまたはサブジェクトを検索</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>閉じる</translation>
+    </message>
+    <message>
+        <source>No device works with a certificate.</source>
+        <translation>証明書を使用しているデバイスはありません。</translation>
+    </message>
+    <message>
+        <source>No certificate matches the search.</source>
+        <translation>検索に一致する証明書がありません。</translation>
+    </message>
+    <message>
+        <source>%1 expired, %2 within %3 days</source>
+        <translation>期限切れ %1、%3 日以内 %2</translation>
+    </message>
+    <message>
+        <source>%1 of %2 certificates</source>
+        <translation>%2 件中 %1 件の証明書</translation>
+    </message>
+</context>
+<context>
     <name>ConfirmDialog</name>
     <message>
         <source>Cancel</source>
@@ -1467,6 +1945,10 @@
         <source>More</source>
         <translation>その他</translation>
     </message>
+    <message>
+        <source>Certificates in use</source>
+        <translation>使用中の証明書</translation>
+    </message>
 </context>
 <context>
     <name>DeviceWindow</name>
@@ -1522,6 +2004,33 @@
     </message>
 </context>
 <context>
+    <name>ExportDebugInfoDialog</name>
+    <message>
+        <source>Export Debug Info</source>
+        <translation>デバッグ情報をエクスポート</translation>
+    </message>
+    <message>
+        <source>Folder on this computer</source>
+        <translation>このコンピューターのフォルダー</translation>
+    </message>
+    <message>
+        <source>Choose Folder</source>
+        <translation>フォルダーを選択</translation>
+    </message>
+    <message>
+        <source>The devices collect the information first. The report is saved when they are done, also if the program is started again meanwhile.</source>
+        <translation>最初にデバイスが情報を収集します。完了するとレポートが保存されます。その間にプログラムを再起動しても構いません。</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>エクスポート</translation>
+    </message>
+    <message>
+        <source>The export could not be started.</source>
+        <translation>エクスポートを開始できませんでした。</translation>
+    </message>
+</context>
+<context>
     <name>FailedTaskStrip</name>
     <message>
         <source>Start again</source>
@@ -1540,6 +2049,88 @@
     <message>
         <source>1 of %1</source>
         <translation>1/%1</translation>
+    </message>
+</context>
+<context>
+    <name>FileCheck</name>
+    <message>
+        <source>There is no such file.</source>
+        <translation>ファイルが存在しません。</translation>
+    </message>
+    <message>
+        <source>This is a folder.</source>
+        <translation>フォルダーです。</translation>
+    </message>
+    <message>
+        <source>This is no plain file.</source>
+        <translation>通常のファイルではありません。</translation>
+    </message>
+    <message>
+        <source>The file has a blank name.</source>
+        <translation>ファイル名が空白です。</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>ファイルが空です。</translation>
+    </message>
+    <message>
+        <source>The file is larger than 4 GiB.</source>
+        <translation>ファイルが 4 GiB を超えています。</translation>
+    </message>
+    <message>
+        <source>The file cannot be read.</source>
+        <translation>ファイルを読み取れません。</translation>
+    </message>
+    <message>
+        <source>There is no such folder.</source>
+        <translation>フォルダーが存在しません。</translation>
+    </message>
+    <message>
+        <source>This is no folder.</source>
+        <translation>フォルダーではありません。</translation>
+    </message>
+    <message>
+        <source>Nothing can be written to this folder.</source>
+        <translation>このフォルダーには書き込めません。</translation>
+    </message>
+</context>
+<context>
+    <name>FileField</name>
+    <message>
+        <source>Browse...</source>
+        <translation>参照...</translation>
+    </message>
+    <message>
+        <source>Drop a file here or browse for it</source>
+        <translation>ここにファイルをドロップするか、参照してください</translation>
+    </message>
+    <message>
+        <source>Drop a folder here or browse for it</source>
+        <translation>ここにフォルダーをドロップするか、参照してください</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>すべてのファイル (*)</translation>
+    </message>
+    <message>
+        <source>Only one file can be taken.</source>
+        <translation>指定できるファイルは 1 つだけです。</translation>
+    </message>
+    <message>
+        <source>Only one folder can be taken.</source>
+        <translation>指定できるフォルダーは 1 つだけです。</translation>
+    </message>
+    <message>
+        <source>Looking at it...</source>
+        <translation>確認しています...</translation>
+    </message>
+    <message>
+        <source>Size: %1</source>
+        <translation>サイズ: %1</translation>
+    </message>
+    <message>
+        <source>Free: %1</source>
+        <translation>空き: %1</translation>
     </message>
 </context>
 <context>
@@ -2008,6 +2599,45 @@
         <source>Tasks</source>
         <translation>タスク</translation>
     </message>
+    <message>
+        <source>Debug information saved as “%1”.</source>
+        <translation>デバッグ情報を「%1」として保存しました。</translation>
+    </message>
+</context>
+<context>
+    <name>ModelGroupModel</name>
+    <message>
+        <source>Model</source>
+        <translation>モデル</translation>
+    </message>
+    <message>
+        <source>Devices</source>
+        <translation>デバイス</translation>
+    </message>
+    <message>
+        <source>Present version</source>
+        <translation>現在のバージョン</translation>
+    </message>
+    <message>
+        <source>Image</source>
+        <translation>イメージ</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%2 台中 %1 台</translation>
+    </message>
+    <message>
+        <source>fits</source>
+        <translation>適合</translation>
+    </message>
+    <message>
+        <source>another model group</source>
+        <translation>別のモデルグループ</translation>
+    </message>
+    <message>
+        <source>cannot be told, the device will judge</source>
+        <translation>判定できません (デバイスが判断します)</translation>
+    </message>
 </context>
 <context>
     <name>NoticeBar</name>
@@ -2209,6 +2839,85 @@
     </message>
 </context>
 <context>
+    <name>QuickSetupDialog</name>
+    <message>
+        <source>Quick Setup</source>
+        <translation>クイック設定</translation>
+    </message>
+    <message>
+        <source>Daylight saving</source>
+        <translation>サマータイム</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>オン</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>オフ</translation>
+    </message>
+    <message>
+        <source>Mains frequency</source>
+        <translation>電源周波数</translation>
+    </message>
+    <message>
+        <source>50 Hz</source>
+        <translation>50 Hz</translation>
+    </message>
+    <message>
+        <source>60 Hz</source>
+        <translation>60 Hz</translation>
+    </message>
+    <message>
+        <source>Audio</source>
+        <translation>音声</translation>
+    </message>
+    <message>
+        <source>Mute</source>
+        <translation>ミュート</translation>
+    </message>
+    <message>
+        <source>Unmute</source>
+        <translation>ミュート解除</translation>
+    </message>
+    <message>
+        <source>Only the settings that are ticked change.</source>
+        <translation>チェックした設定のみ変更されます。</translation>
+    </message>
+    <message>
+        <source>Time zone</source>
+        <translation>タイムゾーン</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>日付と時刻</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>適用</translation>
+    </message>
+    <message>
+        <source>As written below</source>
+        <translation>下記の指定</translation>
+    </message>
+    <message>
+        <source>Time zone as POSIX writes it</source>
+        <translation>POSIX 形式のタイムゾーン</translation>
+    </message>
+    <message>
+        <source>This time zone has no daylight saving.</source>
+        <translation>このタイムゾーンにはサマータイムがありません。</translation>
+    </message>
+    <message>
+        <source>This is no time zone, as CET-1CEST,M3.5.0,M10.5.0/3 is one.</source>
+        <translation>CET-1CEST,M3.5.0,M10.5.0/3 のようなタイムゾーンではありません。</translation>
+    </message>
+    <message>
+        <source>The setup could not be started.</source>
+        <translation>設定を開始できませんでした。</translation>
+    </message>
+</context>
+<context>
     <name>ReconnectingDialog</name>
     <message>
         <source>Unable to establish a connection to the server. The client is currently attempting to reconnect to the server.</source>
@@ -2344,6 +3053,243 @@
         <translation>
             <numerusform>%n 台のデバイスの設定が失われます。続行するには %n と入力してください。</numerusform>
         </translation>
+    </message>
+</context>
+<context>
+    <name>Rollout</name>
+    <message>
+        <source>The client was closed before it began.</source>
+        <translation>開始前にクライアントが閉じられました。</translation>
+    </message>
+</context>
+<context>
+    <name>RolloutFields</name>
+    <message>
+        <source>In waves:</source>
+        <translation>段階的に:</translation>
+    </message>
+    <message>
+        <source>Size of the first wave</source>
+        <translation>第 1 段階の規模</translation>
+    </message>
+    <message>
+        <source>What the first wave is counted in</source>
+        <translation>第 1 段階の単位</translation>
+    </message>
+    <message>
+        <source>devices</source>
+        <translation>台</translation>
+    </message>
+    <message>
+        <source>%</source>
+        <translation>%</translation>
+    </message>
+    <message>
+        <source>Minutes between the waves</source>
+        <translation>段階間の待ち時間 (分)</translation>
+    </message>
+    <message>
+        <source>Most failed devices in percent</source>
+        <translation>失敗デバイスの上限 (パーセント)</translation>
+    </message>
+    <message>
+        <source> min</source>
+        <translation> 分</translation>
+    </message>
+    <message>
+        <source> %</source>
+        <translation> %</translation>
+    </message>
+    <message>
+        <source>first</source>
+        <translation>最初</translation>
+    </message>
+    <message>
+        <source>wait</source>
+        <translation>待機</translation>
+    </message>
+    <message>
+        <source>go on if at most</source>
+        <translation>続行条件 最大</translation>
+    </message>
+    <message>
+        <source>failed</source>
+        <translation>失敗</translation>
+    </message>
+</context>
+<context>
+    <name>RolloutMgr</name>
+    <message>
+        <source>The image has changed since the rollout began.</source>
+        <translation>展開の開始後にイメージが変更されています。</translation>
+    </message>
+    <message>
+        <source>The image could not be checked.</source>
+        <translation>イメージを確認できませんでした。</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>アップロードを開始できませんでした。</translation>
+    </message>
+    <message numerus="yes">
+        <source>The session has ended, and with it the rollout(s) of %1. Waves that were sent go on.</source>
+        <translation>
+            <numerusform>セッションが終了し、%1 の展開も終了しました。送信済みの段階は継続します。</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
+    <name>RolloutRow</name>
+    <message>
+        <source>Continue</source>
+        <translation>続行</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>停止</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>閉じる</translation>
+    </message>
+    <message>
+        <source>Begin with the other devices now</source>
+        <translation>残りのデバイスを今すぐ開始</translation>
+    </message>
+    <message>
+        <source>Do not begin with the other devices; those at work go on</source>
+        <translation>残りのデバイスを開始しない (実行中のデバイスは継続)</translation>
+    </message>
+</context>
+<context>
+    <name>RolloutTexts</name>
+    <message>
+        <source>%1 of %2 done</source>
+        <translation>%2 台中 %1 台完了</translation>
+    </message>
+    <message>
+        <source>%1, %2 failed</source>
+        <translation>%1、%2 台失敗</translation>
+    </message>
+    <message>
+        <source>Second wave</source>
+        <translation>第 2 段階</translation>
+    </message>
+    <message>
+        <source>First wave</source>
+        <translation>第 1 段階</translation>
+    </message>
+    <message numerus="yes">
+        <source>%1: %n device(s), waiting to be sent.</source>
+        <translation>
+            <numerusform>%1: %n 台、送信待ち。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1: %n device(s), scheduled for %2.</source>
+        <translation>
+            <numerusform>%1: %n 台、%2 に予定。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1: %2.</source>
+        <translation>%1: %2。</translation>
+    </message>
+    <message>
+        <source>Waiting %1 min.</source>
+        <translation>待機中 (残り %1 分)。</translation>
+    </message>
+    <message>
+        <source>Stopped: more than %1 % of the first wave failed.</source>
+        <translation>停止: 第 1 段階の失敗が %1 % を超えました。</translation>
+    </message>
+    <message>
+        <source>Stopped: the task of this wave was cancelled.</source>
+        <translation>停止: この段階のタスクがキャンセルされました。</translation>
+    </message>
+    <message>
+        <source>Stopped: the task of this wave is no longer in the list.</source>
+        <translation>停止: この段階のタスクが一覧にありません。</translation>
+    </message>
+    <message>
+        <source>Stopped: this wave did not begin. %1</source>
+        <translation>停止: この段階は開始されませんでした。%1</translation>
+    </message>
+    <message>
+        <source>Stopped.</source>
+        <translation>停止しました。</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) wait for the second wave.</source>
+        <translation>
+            <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Finished: %1.</source>
+        <translation>完了: %1。</translation>
+    </message>
+</context>
+<context>
+    <name>ScheduleField</name>
+    <message>
+        <source>Now</source>
+        <translation>今すぐ</translation>
+    </message>
+    <message>
+        <source>At</source>
+        <translation>日時指定</translation>
+    </message>
+    <message>
+        <source>Time of the upload</source>
+        <translation>アップロードの日時</translation>
+    </message>
+    <message>
+        <source>There is no such time on that day: the clocks are put forward.</source>
+        <translation>夏時間への切り替えのため、その日にこの時刻は存在しません。</translation>
+    </message>
+    <message>
+        <source>This time has passed; choose a later one.</source>
+        <translation>この日時は過ぎています。後の日時を選択してください。</translation>
+    </message>
+</context>
+<context>
+    <name>SelfSignedFields</name>
+    <message>
+        <source>Two letters, as in US</source>
+        <translation>US のような 2 文字</translation>
+    </message>
+    <message>
+        <source>Optional</source>
+        <translation>省略可</translation>
+    </message>
+    <message>
+        <source>Country</source>
+        <translation>国</translation>
+    </message>
+    <message>
+        <source>State/Province</source>
+        <translation>都道府県</translation>
+    </message>
+    <message>
+        <source>Locality</source>
+        <translation>市区町村</translation>
+    </message>
+    <message>
+        <source>Organization</source>
+        <translation>組織</translation>
+    </message>
+    <message>
+        <source>Organizational Unit</source>
+        <translation>部署</translation>
+    </message>
+    <message>
+        <source>Validity (days)</source>
+        <translation>有効期間 (日)</translation>
+    </message>
+    <message>
+        <source>The country is named by its two letters, as in US.</source>
+        <translation>国は US のような 2 文字で指定してください。</translation>
     </message>
 </context>
 <context>
@@ -3460,6 +4406,288 @@ What is done to devices shows here.</source>
     </message>
 </context>
 <context>
+    <name>TimeSyncFields</name>
+    <message numerus="yes">
+        <source>Every %n hour(s)</source>
+        <translation>
+            <numerusform>%n 時間ごと</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Every %n minute(s)</source>
+        <translation>
+            <numerusform>%n 分ごと</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Time synchronization</source>
+        <translation>時刻の同期</translation>
+    </message>
+    <message>
+        <source>Set once from this computer</source>
+        <translation>このコンピューターの時刻に一度合わせる</translation>
+    </message>
+    <message>
+        <source>NTP servers</source>
+        <translation>NTP サーバー</translation>
+    </message>
+    <message>
+        <source>NTP server %1</source>
+        <translation>NTP サーバー %1</translation>
+    </message>
+    <message>
+        <source>Update interval</source>
+        <translation>更新間隔</translation>
+    </message>
+    <message>
+        <source>“%1” is no name or address of a server.</source>
+        <translation>「%1」はサーバーの名前またはアドレスではありません。</translation>
+    </message>
+    <message>
+        <source>The server “%1” is named twice.</source>
+        <translation>サーバー「%1」が重複しています。</translation>
+    </message>
+    <message>
+        <source>Name at least one NTP server.</source>
+        <translation>NTP サーバーを 1 つ以上指定してください。</translation>
+    </message>
+</context>
+<context>
+    <name>TimeZones</name>
+    <message>
+        <source>Pago Pago</source>
+        <translation>パゴパゴ</translation>
+    </message>
+    <message>
+        <source>Honolulu</source>
+        <translation>ホノルル</translation>
+    </message>
+    <message>
+        <source>Anchorage</source>
+        <translation>アンカレッジ</translation>
+    </message>
+    <message>
+        <source>Los Angeles, Vancouver</source>
+        <translation>ロサンゼルス、バンクーバー</translation>
+    </message>
+    <message>
+        <source>Denver, Edmonton</source>
+        <translation>デンバー、エドモントン</translation>
+    </message>
+    <message>
+        <source>Phoenix</source>
+        <translation>フェニックス</translation>
+    </message>
+    <message>
+        <source>Chicago, Winnipeg</source>
+        <translation>シカゴ、ウィニペグ</translation>
+    </message>
+    <message>
+        <source>Mexico City, Guatemala</source>
+        <translation>メキシコシティ、グアテマラ</translation>
+    </message>
+    <message>
+        <source>New York, Toronto</source>
+        <translation>ニューヨーク、トロント</translation>
+    </message>
+    <message>
+        <source>Bogotá, Lima</source>
+        <translation>ボゴタ、リマ</translation>
+    </message>
+    <message>
+        <source>Halifax</source>
+        <translation>ハリファックス</translation>
+    </message>
+    <message>
+        <source>Caracas, La Paz</source>
+        <translation>カラカス、ラパス</translation>
+    </message>
+    <message>
+        <source>Santiago</source>
+        <translation>サンティアゴ</translation>
+    </message>
+    <message>
+        <source>St. John’s</source>
+        <translation>セントジョンズ</translation>
+    </message>
+    <message>
+        <source>São Paulo, Buenos Aires</source>
+        <translation>サンパウロ、ブエノスアイレス</translation>
+    </message>
+    <message>
+        <source>South Georgia</source>
+        <translation>サウスジョージア</translation>
+    </message>
+    <message>
+        <source>Azores</source>
+        <translation>アゾレス諸島</translation>
+    </message>
+    <message>
+        <source>Praia</source>
+        <translation>プライア</translation>
+    </message>
+    <message>
+        <source>Coordinated Universal Time</source>
+        <translation>協定世界時</translation>
+    </message>
+    <message>
+        <source>London, Dublin</source>
+        <translation>ロンドン、ダブリン</translation>
+    </message>
+    <message>
+        <source>Lisbon</source>
+        <translation>リスボン</translation>
+    </message>
+    <message>
+        <source>Accra, Reykjavik</source>
+        <translation>アクラ、レイキャビク</translation>
+    </message>
+    <message>
+        <source>Berlin, Madrid, Paris, Rome</source>
+        <translation>ベルリン、マドリード、パリ、ローマ</translation>
+    </message>
+    <message>
+        <source>Algiers, Tunis</source>
+        <translation>アルジェ、チュニス</translation>
+    </message>
+    <message>
+        <source>Lagos</source>
+        <translation>ラゴス</translation>
+    </message>
+    <message>
+        <source>Athens, Helsinki, Kyiv</source>
+        <translation>アテネ、ヘルシンキ、キーウ</translation>
+    </message>
+    <message>
+        <source>Cairo</source>
+        <translation>カイロ</translation>
+    </message>
+    <message>
+        <source>Jerusalem</source>
+        <translation>エルサレム</translation>
+    </message>
+    <message>
+        <source>Johannesburg</source>
+        <translation>ヨハネスブルグ</translation>
+    </message>
+    <message>
+        <source>Istanbul, Riyadh</source>
+        <translation>イスタンブール、リヤド</translation>
+    </message>
+    <message>
+        <source>Moscow</source>
+        <translation>モスクワ</translation>
+    </message>
+    <message>
+        <source>Nairobi</source>
+        <translation>ナイロビ</translation>
+    </message>
+    <message>
+        <source>Tehran</source>
+        <translation>テヘラン</translation>
+    </message>
+    <message>
+        <source>Baku, Dubai</source>
+        <translation>バクー、ドバイ</translation>
+    </message>
+    <message>
+        <source>Kabul</source>
+        <translation>カブール</translation>
+    </message>
+    <message>
+        <source>Karachi</source>
+        <translation>カラチ</translation>
+    </message>
+    <message>
+        <source>Tashkent</source>
+        <translation>タシケント</translation>
+    </message>
+    <message>
+        <source>Delhi, Mumbai</source>
+        <translation>デリー、ムンバイ</translation>
+    </message>
+    <message>
+        <source>Kathmandu</source>
+        <translation>カトマンズ</translation>
+    </message>
+    <message>
+        <source>Dhaka</source>
+        <translation>ダッカ</translation>
+    </message>
+    <message>
+        <source>Yangon</source>
+        <translation>ヤンゴン</translation>
+    </message>
+    <message>
+        <source>Bangkok, Hanoi</source>
+        <translation>バンコク、ハノイ</translation>
+    </message>
+    <message>
+        <source>Jakarta</source>
+        <translation>ジャカルタ</translation>
+    </message>
+    <message>
+        <source>Beijing, Shanghai, Taipei</source>
+        <translation>北京、上海、台北</translation>
+    </message>
+    <message>
+        <source>Hong Kong</source>
+        <translation>香港</translation>
+    </message>
+    <message>
+        <source>Manila</source>
+        <translation>マニラ</translation>
+    </message>
+    <message>
+        <source>Kuala Lumpur, Singapore</source>
+        <translation>クアラルンプール、シンガポール</translation>
+    </message>
+    <message>
+        <source>Perth</source>
+        <translation>パース</translation>
+    </message>
+    <message>
+        <source>Tokyo</source>
+        <translation>東京</translation>
+    </message>
+    <message>
+        <source>Seoul</source>
+        <translation>ソウル</translation>
+    </message>
+    <message>
+        <source>Darwin</source>
+        <translation>ダーウィン</translation>
+    </message>
+    <message>
+        <source>Adelaide</source>
+        <translation>アデレード</translation>
+    </message>
+    <message>
+        <source>Brisbane</source>
+        <translation>ブリスベン</translation>
+    </message>
+    <message>
+        <source>Melbourne, Sydney</source>
+        <translation>メルボルン、シドニー</translation>
+    </message>
+    <message>
+        <source>Nouméa</source>
+        <translation>ヌメア</translation>
+    </message>
+    <message>
+        <source>Suva</source>
+        <translation>スバ</translation>
+    </message>
+    <message>
+        <source>Auckland</source>
+        <translation>オークランド</translation>
+    </message>
+    <message>
+        <source>Nukuʻalofa</source>
+        <translation>ヌクアロファ</translation>
+    </message>
+</context>
+<context>
     <name>TitleBar</name>
     <message>
         <source>Help</source>
@@ -3566,6 +4794,322 @@ What is done to devices shows here.</source>
     <message>
         <source>Cancelling...</source>
         <translation>キャンセルしています...</translation>
+    </message>
+</context>
+<context>
+    <name>UploadConfigurationDialog</name>
+    <message>
+        <source>Upload Configuration File</source>
+        <translation>構成ファイルをアップロード</translation>
+    </message>
+    <message>
+        <source>Configuration file</source>
+        <translation>構成ファイル</translation>
+    </message>
+    <message>
+        <source>Choose Configuration File</source>
+        <translation>構成ファイルを選択</translation>
+    </message>
+    <message>
+        <source>One file of up to 4 GiB.</source>
+        <translation>4 GiB までのファイル 1 つ。</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>アップロード</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>アップロードを開始できませんでした。</translation>
+    </message>
+</context>
+<context>
+    <name>UploadDialogs</name>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>デバイスは管理されなくなっています。</translation>
+    </message>
+</context>
+<context>
+    <name>UploadFile</name>
+    <message>
+        <source>There is no such file.</source>
+        <translation>ファイルが存在しません。</translation>
+    </message>
+    <message>
+        <source>This is a folder, not a file.</source>
+        <translation>ファイルではなくフォルダーです。</translation>
+    </message>
+    <message>
+        <source>The file cannot be read.</source>
+        <translation>ファイルを読み取れません。</translation>
+    </message>
+    <message>
+        <source>This is no plain file.</source>
+        <translation>通常のファイルではありません。</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>ファイルが空です。</translation>
+    </message>
+    <message>
+        <source>The file has %1; the server takes %2 at most.</source>
+        <translation>ファイルは %1 です。サーバーが受け付けるのは %2 までです。</translation>
+    </message>
+    <message>
+        <source>The name of the file is blank; give it another one.</source>
+        <translation>ファイル名が空白です。別の名前を付けてください。</translation>
+    </message>
+</context>
+<context>
+    <name>UploadFileField</name>
+    <message>
+        <source>Browse</source>
+        <translation>参照</translation>
+    </message>
+    <message>
+        <source>Only one file can be uploaded at a time.</source>
+        <translation>一度にアップロードできるファイルは 1 つだけです。</translation>
+    </message>
+    <message>
+        <source>Only a file of this computer can be uploaded.</source>
+        <translation>アップロードできるのはこのコンピューターのファイルのみです。</translation>
+    </message>
+    <message>
+        <source>The file could not be checked; choose it again.</source>
+        <translation>ファイルを確認できませんでした。もう一度選択してください。</translation>
+    </message>
+    <message>
+        <source>Checking...</source>
+        <translation>確認しています...</translation>
+    </message>
+</context>
+<context>
+    <name>UploadFirmwareDialog</name>
+    <message>
+        <source>Upload Firmware</source>
+        <translation>ファームウェアをアップロード</translation>
+    </message>
+    <message>
+        <source>Only devices whose last upload failed</source>
+        <translation>前回のアップロードに失敗したデバイスのみ</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>アップロード</translation>
+    </message>
+    <message>
+        <source>Open Firmware Image</source>
+        <translation>ファームウェアイメージを開く</translation>
+    </message>
+    <message>
+        <source>All Files(*)</source>
+        <translation>すべてのファイル(*)</translation>
+    </message>
+    <message>
+        <source>Choose an image, or drop it here</source>
+        <translation>イメージを選択するか、ここにドロップ</translation>
+    </message>
+    <message>
+        <source>Firmware file</source>
+        <translation>ファームウェアファイル</translation>
+    </message>
+    <message>
+        <source>Models of the devices</source>
+        <translation>デバイスのモデル</translation>
+    </message>
+    <message>
+        <source>The last upload failed on none of the devices.</source>
+        <translation>前回のアップロードに失敗したデバイスはありません。</translation>
+    </message>
+    <message>
+        <source>When</source>
+        <translation>日時</translation>
+    </message>
+    <message>
+        <source>Rollout</source>
+        <translation>展開</translation>
+    </message>
+    <message>
+        <source>%1 at a time</source>
+        <translation>同時に %1 台</translation>
+    </message>
+    <message>
+        <source>The first line of this image is damaged; every device would refuse it.</source>
+        <translation>このイメージの 1 行目が壊れています。すべてのデバイスに拒否されます。</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will fail: the image is for another model group.</source>
+        <translation>
+            <numerusform>%n 台のデバイスは失敗します: イメージが別のモデルグループ用です。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Another model group</source>
+        <translation>別のモデルグループ</translation>
+    </message>
+    <message>
+        <source>Schedule for %1, then %2</source>
+        <translation>%1 台、次に %2 台を予約</translation>
+    </message>
+    <message>
+        <source>Upload to %1, then %2</source>
+        <translation>%1 台、次に %2 台にアップロード</translation>
+    </message>
+    <message>
+        <source>Schedule for %1</source>
+        <translation>%1 台を予約</translation>
+    </message>
+    <message>
+        <source>Upload to %1</source>
+        <translation>%1 台にアップロード</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>アップロードを開始できませんでした。</translation>
+    </message>
+</context>
+<context>
+    <name>UploadHttpsDialog</name>
+    <message>
+        <source>Upload Certificate – HTTPS</source>
+        <translation>証明書をアップロード – HTTPS</translation>
+    </message>
+    <message>
+        <source>Generate self-signed certificates</source>
+        <translation>自己署名証明書を生成</translation>
+    </message>
+    <message>
+        <source>Install certificates</source>
+        <translation>証明書をインストール</translation>
+    </message>
+    <message>
+        <source>Upload certificates and private keys</source>
+        <translation>証明書と秘密鍵をアップロード</translation>
+    </message>
+    <message>
+        <source>HTTP and HTTPS</source>
+        <translation>HTTP と HTTPS</translation>
+    </message>
+    <message>
+        <source>HTTPS only</source>
+        <translation>HTTPS のみ</translation>
+    </message>
+    <message>
+        <source>Method</source>
+        <translation>方法</translation>
+    </message>
+    <message>
+        <source>Mode</source>
+        <translation>モード</translation>
+    </message>
+    <message>
+        <source>HTTPS Port</source>
+        <translation>HTTPS ポート</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) with HTTP on this port already.</source>
+        <translation>
+            <numerusform>%n 台のデバイスは既にこのポートで HTTP を使用しています。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>HTTP port</source>
+        <translation>HTTP ポート</translation>
+    </message>
+</context>
+<context>
+    <name>UploadIeeeDialog</name>
+    <message>
+        <source>Upload Certificate – IEEE 802.1x</source>
+        <translation>証明書をアップロード – IEEE 802.1x</translation>
+    </message>
+    <message>
+        <source>For encrypted private keys</source>
+        <translation>暗号化された秘密鍵用</translation>
+    </message>
+    <message>
+        <source>Password</source>
+        <translation>パスワード</translation>
+    </message>
+    <message>
+        <source>Private Key Password</source>
+        <translation>秘密鍵のパスワード</translation>
+    </message>
+    <message>
+        <source>Method</source>
+        <translation>方法</translation>
+    </message>
+    <message>
+        <source>Identity</source>
+        <translation>ID</translation>
+    </message>
+    <message>
+        <source>CA Certificate</source>
+        <translation>CA 証明書</translation>
+    </message>
+    <message>
+        <source>Type the identity that the devices log in with.</source>
+        <translation>デバイスがログインに使う ID を入力してください。</translation>
+    </message>
+    <message>
+        <source>Type the password that the devices log in with.</source>
+        <translation>デバイスがログインに使うパスワードを入力してください。</translation>
+    </message>
+    <message>
+        <source>Choose the certificate of the authority.</source>
+        <translation>認証局の証明書を選択してください。</translation>
+    </message>
+</context>
+<context>
+    <name>UploadPackageDialog</name>
+    <message>
+        <source>Upload Package</source>
+        <translation>パッケージをアップロード</translation>
+    </message>
+    <message>
+        <source>Package</source>
+        <translation>パッケージ</translation>
+    </message>
+    <message>
+        <source>Choose Package</source>
+        <translation>パッケージを選択</translation>
+    </message>
+    <message>
+        <source>One file of up to 4 GiB.</source>
+        <translation>4 GiB までのファイル 1 つ。</translation>
+    </message>
+    <message>
+        <source>Store the package on the memory card</source>
+        <translation>パッケージをメモリーカードに保存</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>アップロード</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) will fail: no memory card is ready.</source>
+        <translation>
+            <numerusform>%n 台のデバイスは失敗します: 使用できるメモリーカードがありません。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>No memory card ready</source>
+        <translation>使用できるメモリーカードなし</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) may fail: the memory card is almost full.</source>
+        <translation>
+            <numerusform>%n 台のデバイスは失敗する可能性があります: メモリーカードの空きがほとんどありません。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Memory card almost full</source>
+        <translation>メモリーカードの空き不足</translation>
+    </message>
+    <message>
+        <source>The upload could not be started.</source>
+        <translation>アップロードを開始できませんでした。</translation>
     </message>
 </context>
 <context>
