@@ -25,16 +25,6 @@ void askSavePath(QWidget *parent, const QString &title, const QString &suggestio
     dialog->open();
 }
 
-void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
-                 const std::function<void(const QString &)> &chosen) {
-    auto *dialog = new QFileDialog(parent, title, folder, filter);
-    dialog->setObjectName(QStringLiteral("openFileDialog"));
-    dialog->setAttribute(Qt::WA_DeleteOnClose);
-    dialog->setFileMode(QFileDialog::ExistingFile);
-    QObject::connect(dialog, &QFileDialog::fileSelected, parent, chosen);
-    dialog->open();
-}
-
 void askFolder(QWidget *parent, const QString &title, const QString &folder,
                const std::function<void(const QString &)> &chosen) {
     auto *dialog = new QFileDialog(parent, title, folder);

@@ -17,10 +17,6 @@ void askOpenPath(QWidget *parent, const QString &title, const QString &folder, c
 void askSavePath(QWidget *parent, const QString &title, const QString &suggestion, const QString &filter,
                  const QString &suffix, const std::function<void(const QString &path)> &chosen);
 
-/// Asks for a file that exists, beginning in the folder.
-void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
-                 const std::function<void(const QString &path)> &chosen);
-
 /// Asks for a folder that exists, beginning in the given one.
 void askFolder(QWidget *parent, const QString &title, const QString &folder,
                const std::function<void(const QString &path)> &chosen);
