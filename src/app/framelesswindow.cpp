@@ -13,6 +13,7 @@
 #include "notifier.h"
 #include "popupmenu.h"
 #include "resizeedges.h"
+#include "rolloutmgr.h"
 #include "servicecontrol.h"
 #include "servicemanagement.h"
 #include "servicerequest.h"
@@ -251,7 +252,7 @@ void FramelessWindow::onLogOff() {
 /// Whether a log-off would cut work that the service has not begun yet.
 bool FramelessWindow::isTaskRequested() {
     return CTaskInfoPool::instance().hasRequestedTask() || UploadTaskMgr::instance().isBusy() ||
-           ExeTaskMgr::instance().isBusy();
+           ExeTaskMgr::instance().isBusy() || RolloutMgr::instance().isBusy();
 }
 
 bool FramelessWindow::hasUnfinishedWork() const {
