@@ -3875,6 +3875,10 @@
         <source>As the system</source>
         <translation>Wie das System</translation>
     </message>
+    <message>
+        <source>Another language is used from the next start of the program on.</source>
+        <translation>Eine andere Sprache gilt ab dem nächsten Start des Programms.</translation>
+    </message>
 </context>
 <context>
     <name>SidePanel</name>

@@ -3828,6 +3828,10 @@
         <source>As the system</source>
         <translation>システムと同じ</translation>
     </message>
+    <message>
+        <source>Another language is used from the next start of the program on.</source>
+        <translation>言語の変更は、次回プログラムを起動したときから有効になります。</translation>
+    </message>
 </context>
 <context>
     <name>SidePanel</name>
