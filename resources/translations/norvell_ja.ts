@@ -1851,7 +1851,7 @@
     </message>
     <message>
         <source>Assign IP Address</source>
-        <translation>IP アドレスの割り当て</translation>
+        <translation>IPの割り当て</translation>
     </message>
     <message>
         <source>Upload</source>
