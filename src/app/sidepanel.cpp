@@ -21,7 +21,6 @@ SidePanel::SidePanel(QWidget *parent)
       m_alarms(new AlarmPanel(m_stack)),
       m_tasks(new TaskPanel(m_stack)) {
     setObjectName(QStringLiteral("sidePanel"));
-    setMinimumWidth(narrowest);
     m_stack->setObjectName(QStringLiteral("sideStack"));
     m_stack->addWidget(m_alarms);
     m_stack->addWidget(m_tasks);
@@ -36,6 +35,8 @@ QWidget *SidePanel::buildHeader() {
     auto *header = new QFrame(this);
     header->setObjectName(QStringLiteral("sideHeader"));
     header->setFixedHeight(headerHeight);
+    // The panels may need more, as their texts ask for in the language they are in.
+    header->setMinimumWidth(narrowest);
     auto *layout = new QHBoxLayout(header);
     layout->setContentsMargins(8, 0, 6, 0);
     layout->setSpacing(4);

@@ -12,7 +12,7 @@
 namespace {
 constexpr QSize pictureSize{16, 16};
 constexpr int spaceForTabs = 290;
-constexpr int narrowest = 334;
+constexpr int narrowest = 270;
 constexpr int widest = 560;
 } // namespace
 
@@ -28,11 +28,11 @@ ConsoleCorner::ConsoleCorner(QWidget *parent)
         tr("Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range "
            "(10.4.0.10-20); a MAC address"));
     m_search->setClearButtonEnabled(true);
-    m_search->setMinimumWidth(110);
+    m_search->setMinimumWidth(100);
     m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
     m_remoteCombo->setAccessibleName(tr("Remote connection"));
     m_remoteCombo->setPlaceholderText(tr("Remote connection"));
-    m_remoteCombo->setMinimumWidth(172);
+    m_remoteCombo->setMinimumWidth(126);
     m_columns->setObjectName(QStringLiteral("columnsButton"));
     m_columns->setAccessibleName(tr("Columns"));
     m_columns->setToolTip(tr("Columns"));

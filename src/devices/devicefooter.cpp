@@ -1,5 +1,7 @@
 #include "devicefooter.h"
 
+#include "elidedlabel.h"
+
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QLocale>
@@ -13,8 +15,9 @@ namespace {
 /// Two polls were missed: what is shown may be wrong by now.
 constexpr qint64 staleMs = 9000;
 
+template <typename Label>
 QLabel *quietLabel(const char *name) {
-    auto *label = new QLabel;
+    auto *label = new Label;
     label->setObjectName(QLatin1String(name));
     label->setTextFormat(Qt::PlainText);
     label->setProperty("role", QStringLiteral("quiet"));
@@ -32,7 +35,10 @@ void setRole(QLabel *label, const QString &role) {
 } // namespace
 
 DeviceFooter::DeviceFooter(QWidget *parent)
-    : QFrame(parent), m_selection(quietLabel("selectionLabel")), m_age(quietLabel("dataAgeLabel")) {
+    : QFrame(parent),
+      m_selection(quietLabel<ElidedLabel>("selectionLabel")),
+      // How old the data is stays readable whatever else gives way.
+      m_age(quietLabel<QLabel>("dataAgeLabel")) {
     setObjectName(QStringLiteral("deviceFooter"));
     setFixedHeight(34);
     auto *layout = new QHBoxLayout(this);

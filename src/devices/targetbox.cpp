@@ -79,7 +79,7 @@ void TargetBox::showTicked() {
     const int all = m_model->itemCount();
     m_count->setText(
         ticked == all
-            ? tr("%n device(s) selected", nullptr, all)
+            ? tr("%Ln device(s) selected", nullptr, all)
             : tr("%1 of %2 devices selected").arg(QLocale().toString(ticked), QLocale().toString(all)));
     emit tickedChanged();
 }
