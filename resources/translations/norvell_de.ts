@@ -4041,16 +4041,16 @@
         <source>Show</source>
         <translation>Anzeigen</translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) selected</source>
-        <translation>
-            <numerusform>%n Gerät ausgewählt</numerusform>
-            <numerusform>%n Geräte ausgewählt</numerusform>
-        </translation>
-    </message>
     <message>
         <source>%1 of %2 devices selected</source>
         <translation>%1 von %2 Geräten ausgewählt</translation>
+    </message>
+    <message numerus="yes">
+        <source>%Ln device(s) selected</source>
+        <translation>
+            <numerusform>%Ln Gerät ausgewählt</numerusform>
+            <numerusform>%Ln Geräte ausgewählt</numerusform>
+        </translation>
     </message>
 </context>
 <context>

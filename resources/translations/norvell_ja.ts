@@ -3994,15 +3994,15 @@
         <source>Show</source>
         <translation>表示</translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) selected</source>
-        <translation>
-            <numerusform>%n 台のデバイスを選択</numerusform>
-        </translation>
-    </message>
     <message>
         <source>%1 of %2 devices selected</source>
         <translation>%2 台中 %1 台のデバイスを選択</translation>
+    </message>
+    <message numerus="yes">
+        <source>%Ln device(s) selected</source>
+        <translation>
+            <numerusform>%Ln 台のデバイスを選択</numerusform>
+        </translation>
     </message>
 </context>
 <context>

@@ -132,14 +132,14 @@ private slots:
         QTest::addColumn<QStringList>("counted");
         QTest::addColumn<QString>("number");
         QTest::newRow("German") << "de"
-                                << "Abbrechen" << QStringList{"1 Gerät ausgewählt", "2 Geräte ausgewählt"}
+                                << "Abbrechen" << QStringList{"1 Gerät gelöscht.", "2 Geräte gelöscht."}
                                 << "50.000";
         QTest::newRow("Japanese") << "ja" << QString::fromUtf8("キャンセル")
-                                  << QStringList{QString::fromUtf8("1 台のデバイスを選択"),
-                                                 QString::fromUtf8("2 台のデバイスを選択")}
+                                  << QStringList{QString::fromUtf8("1 台のデバイスを削除しました。"),
+                                                 QString::fromUtf8("2 台のデバイスを削除しました。")}
                                   << "50,000";
         QTest::newRow("English") << "en"
-                                 << "Cancel" << QStringList{"1 device selected", "2 devices selected"}
+                                 << "Cancel" << QStringList{"1 device deleted.", "2 devices deleted."}
                                  << QLocale::system().toString(50000);
     }
     void speaksTheChosenLanguage() {
@@ -151,7 +151,7 @@ private slots:
         language.use(wish);
         QTEST(QCoreApplication::translate("SettingWindow", "Cancel"), "button");
         for (int n = 1; n <= 2; ++n)
-            QCOMPARE(QCoreApplication::translate("TargetBox", "%n device(s) selected", nullptr, n),
+            QCOMPARE(QCoreApplication::translate("DeviceActions", "%n device(s) deleted.", nullptr, n),
                      counted[n - 1]);
         QTEST(QLocale().toString(50000), "number");
     }
