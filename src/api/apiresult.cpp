@@ -2,25 +2,30 @@
 
 #include <QCoreApplication>
 
+namespace {
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(ApiResult)
+};
+} // namespace
+
 QString apiResultText(unsigned result) {
-    const auto tr = [](const char *text) { return QCoreApplication::translate("ApiResult", text); };
     switch (result) {
     case ApiTransportError:
-        return tr("the server did not answer");
+        return Texts::tr("the server did not answer");
     case ApiHttpStatusError:
-        return tr("the server answered with an error");
+        return Texts::tr("the server answered with an error");
     case ApiServerError:
-        return tr("the server refused it");
+        return Texts::tr("the server refused it");
     case ApiMissingData:
     case ApiException:
-        return tr("the server's answer could not be read");
+        return Texts::tr("the server's answer could not be read");
     case ApiCipherFailure:
-        return tr("a secret could not be ciphered");
+        return Texts::tr("a secret could not be ciphered");
     case ApiInvalidArgument:
-        return tr("nobody is logged in");
+        return Texts::tr("nobody is logged in");
     case ApiTargetNotWritten:
-        return tr("the file exists already or cannot be written");
+        return Texts::tr("the file exists already or cannot be written");
     default:
-        return tr("error %1").arg(result);
+        return Texts::tr("error %1").arg(result);
     }
 }

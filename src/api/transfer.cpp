@@ -4,29 +4,32 @@
 
 namespace {
 
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(Transfer)
+};
+
 QString sentence(TransferFailure failure, const QString &file) {
-    const auto tr = [](const char *text) { return QCoreApplication::translate("Transfer", text); };
     switch (failure) {
     case TransferFailure::None:
         break;
     case TransferFailure::Cancelled:
-        return tr("It was cancelled.");
+        return Texts::tr("It was cancelled.");
     case TransferFailure::FileUnreadable:
-        return tr("The file “%1” cannot be read.").arg(file);
+        return Texts::tr("The file “%1” cannot be read.").arg(file);
     case TransferFailure::FileEmpty:
-        return tr("The file “%1” is empty.").arg(file);
+        return Texts::tr("The file “%1” is empty.").arg(file);
     case TransferFailure::FileChanged:
-        return tr("The file “%1” was changed while it was being sent.").arg(file);
+        return Texts::tr("The file “%1” was changed while it was being sent.").arg(file);
     case TransferFailure::FileGone:
-        return tr("The file “%1” disappeared while it was being sent.").arg(file);
+        return Texts::tr("The file “%1” disappeared while it was being sent.").arg(file);
     case TransferFailure::RefusedOrLost:
-        return tr("The service refused it or the connection was lost.");
+        return Texts::tr("The service refused it or the connection was lost.");
     case TransferFailure::Stalled:
-        return tr("Nothing got through to the service for too long.");
+        return Texts::tr("Nothing got through to the service for too long.");
     case TransferFailure::TooLarge:
-        return tr("The service does not take files of this size.");
+        return Texts::tr("The service does not take files of this size.");
     case TransferFailure::TargetNotWritten:
-        return tr("The file “%1” exists already or cannot be written.").arg(file);
+        return Texts::tr("The file “%1” exists already or cannot be written.").arg(file);
     }
     return {};
 }

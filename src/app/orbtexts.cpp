@@ -13,23 +13,24 @@ namespace {
 
 constexpr auto portal = "https://partner.norvell.example/";
 
-QString tr(const char *text) {
-    return QCoreApplication::translate("OrbTexts", text);
-}
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(OrbTexts)
+};
 
 QString deskLink() {
-    return portalLink(tr("Norvell Partner Desk"));
+    return portalLink(Texts::tr("Norvell Partner Desk"));
 }
 
 } // namespace
 
 QString unableToConnect() {
-    return tr("Unable to connect to this service. Check connection information, then retry.");
+    return Texts::tr("Unable to connect to this service. Check connection information, then retry.");
 }
 
 QString unknownError() {
-    return tr("Oops! An unknown error happened. Try again or contact Norvell technical support for further "
-              "assistance.");
+    return Texts::tr(
+        "Oops! An unknown error happened. Try again or contact Norvell technical support for further "
+        "assistance.");
 }
 
 QString failure(unsigned result) {
@@ -40,19 +41,21 @@ SignInFailure signInFailure(unsigned result) {
     switch (result) {
     case ApiCode105:
         return {
-            tr("Incorrect email or password. Check account information via %1.").arg(deskLink()),
+            Texts::tr("Incorrect email or password. Check account information via %1.").arg(deskLink()),
             true,
         };
     case ApiCode108:
         return {
-            tr("Invalid password: Password reset required or password expired. Check account information "
-               "via %1.")
+            Texts::tr(
+                "Invalid password: Password reset required or password expired. Check account information "
+                "via %1.")
                 .arg(deskLink()),
             true,
         };
     case ApiServerError:
         return {
-            tr("User does not exist. %1 via Norvell Partner Desk.").arg(portalLink(tr("Become a Partner"))),
+            Texts::tr("User does not exist. %1 via Norvell Partner Desk.")
+                .arg(portalLink(Texts::tr("Become a Partner"))),
             true,
         };
     default:

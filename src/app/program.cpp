@@ -2,10 +2,11 @@
 
 #include "apppaths.h"
 #include "framelesswindow.h"
+#include "interfacelanguage.h"
+#include "localstore.h"
 #include "mainwindow.h"
 #include "messagelog.h"
 #include "nettask.h"
-#include "pluraltranslator.h"
 #include "processsetup.h"
 #include "requestdeadline.h"
 #include "singleinstance.h"
@@ -76,8 +77,8 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         QGuiApplication::setApplicationDisplayName(QCoreApplication::applicationName());
         QApplication::setWindowIcon(applicationIcon());
         Theme::installFonts();
-        PluralTranslator plurals;
-        QCoreApplication::installTranslator(&plurals);
+        InterfaceLanguage language;
+        language.use(CLocalStore::instance().uiLanguage());
         application.setStyleSheet(Theme::styleSheet());
         status = runWindows(application, shown);
         RequestDeadline::cutAll();

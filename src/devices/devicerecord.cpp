@@ -108,8 +108,8 @@ public:
     }
     void setFlag(DeviceColumn column, std::optional<bool> on) {
         setText(column, !on   ? QString()
-                        : *on ? QCoreApplication::translate(context, "Enabled")
-                              : QCoreApplication::translate(context, "Disabled"));
+                        : *on ? QCoreApplication::translate("DeviceRecords", "Enabled")
+                              : QCoreApplication::translate("DeviceRecords", "Disabled"));
     }
 
 private:
@@ -125,21 +125,21 @@ DeviceClass classOf(const QString &serverType) {
 QString cardStatusText(const QString &status) {
     // A write-protected card can be read, so it counts as ready.
     if (status == QLatin1String("ready") || status == QLatin1String("readonly"))
-        return QCoreApplication::translate(context, "Ready");
+        return QCoreApplication::translate("DeviceRecords", "Ready");
     if (status == QLatin1String("Error"))
-        return QCoreApplication::translate(context, "Error");
+        return QCoreApplication::translate("DeviceRecords", "Error");
     if (status == QLatin1String("detached"))
-        return QCoreApplication::translate(context, "Detached");
+        return QCoreApplication::translate("DeviceRecords", "Detached");
     if (status == QLatin1String("Empty"))
-        return QCoreApplication::translate(context, "Empty");
+        return QCoreApplication::translate("DeviceRecords", "Empty");
     return status;
 }
 
 QString audioText(const QString &audio) {
     if (audio == QLatin1String("mute"))
-        return QCoreApplication::translate(context, "Mute");
+        return QCoreApplication::translate("DeviceRecords", "Mute");
     if (audio == QLatin1String("unmute"))
-        return QCoreApplication::translate(context, "Unmute");
+        return QCoreApplication::translate("DeviceRecords", "Unmute");
     return audio;
 }
 

@@ -19,9 +19,9 @@ namespace {
 constexpr qint64 firstTime = -62'135'596'800'000;
 constexpr qint64 lastTime = 253'402'300'799'999;
 
-QString tr(const char *text) {
-    return QCoreApplication::translate("LogWindow", text);
-}
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(LogWindow)
+};
 
 constexpr const char *columnTitles[logColumnCount] = {
     QT_TRANSLATE_NOOP("LogWindow", "Date/Time"), QT_TRANSLATE_NOOP("LogWindow", "Source"),
@@ -149,15 +149,15 @@ std::vector<SearchWord> wordsOf(const QString &search) {
 } // namespace
 
 QString logColumnTitle(LogColumn column) {
-    return tr(columnTitles[static_cast<int>(column)]);
+    return Texts::tr(columnTitles[static_cast<int>(column)]);
 }
 
 QString logSourceText(LogEntry::Source source) {
-    return tr(sourceNames[static_cast<int>(source)]);
+    return Texts::tr(sourceNames[static_cast<int>(source)]);
 }
 
 QString logTypeText(LogEntry::Type type) {
-    return type == LogEntry::Type::Other ? tr("Other") : tr(typeNames[static_cast<int>(type)]);
+    return type == LogEntry::Type::Other ? Texts::tr("Other") : Texts::tr(typeNames[static_cast<int>(type)]);
 }
 
 QString logTimeText(qint64 at) {

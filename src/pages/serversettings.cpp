@@ -16,9 +16,9 @@ constexpr auto logDaysKey = "log_keepdays";
 constexpr auto logDaysAlias = "days";
 constexpr auto uploadLimitSwitchKey = "svr_fw_upload_limit_enabled";
 
-QString tr(const char *text) {
-    return QCoreApplication::translate("ServerSettings", text);
-}
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(ServerSettings)
+};
 
 const JSON *find(const JSON &object, const char *key) {
     auto found = object.find(key);
@@ -97,10 +97,10 @@ bool isAsSent(const JSON &raw, const QVariant &shown, Kind kind) {
 }
 
 QString remark(const Setting &setting, const JSON &raw, const QVariant &shown) {
-    const QString name = tr(setting.name);
+    const QString name = Texts::tr(setting.name);
     if (!shown.isValid())
-        return tr("%1: the server's value %2 cannot be shown.").arg(name, rawText(raw));
-    return tr("%1: the server has %2, shown is %3.").arg(name, rawText(raw), valueText(shown));
+        return Texts::tr("%1: the server's value %2 cannot be shown.").arg(name, rawText(raw));
+    return Texts::tr("%1: the server has %2, shown is %3.").arg(name, rawText(raw), valueText(shown));
 }
 
 } // namespace
@@ -129,7 +129,7 @@ const Setting &setting(const QString &key) {
 }
 
 QString name(const QString &key) {
-    return tr(setting(key).name);
+    return Texts::tr(setting(key).name);
 }
 
 Reading read(const JSON &object) {
@@ -160,9 +160,9 @@ JSON toJson(const QVariantMap &values) {
 
 QString valueText(const QVariant &value) {
     if (value.typeId() == QMetaType::Bool)
-        return value.toBool() ? tr("on") : tr("off");
+        return value.toBool() ? Texts::tr("on") : Texts::tr("off");
     const QString text = value.toString();
-    return text.isEmpty() ? tr("(empty)") : text;
+    return text.isEmpty() ? Texts::tr("(empty)") : text;
 }
 
 QStringList differences(const QVariantMap &first, const QVariantMap &second) {

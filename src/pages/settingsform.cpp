@@ -206,6 +206,12 @@ void SettingsForm::addLanguage(QVBoxLayout *layout) {
     row->addWidget(label);
     row->addWidget(m_language);
     row->addStretch();
+    // Windows are made once, with their texts.
+    auto *hint = new QLabel(tr("Another language is used from the next start of the program on."));
+    hint->setObjectName(QStringLiteral("languageHintLabel"));
+    hint->setProperty("role", QStringLiteral("caption"));
+    hint->setWordWrap(true);
+    addRow(layout)->addWidget(hint);
     addField(
         "ui_lang", m_language, [this] { return m_language->currentData(); },
         [this](const QVariant &value) {

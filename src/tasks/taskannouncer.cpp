@@ -10,9 +10,9 @@ namespace {
 /// A task may be missing from a list for once, when others were removed while it was read page by page.
 constexpr quint64 roundsKept = 3;
 
-QString tr(const char *text) {
-    return QCoreApplication::translate("TaskAnnouncer", text);
-}
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(TaskAnnouncer)
+};
 
 bool isEnd(const QString &state) {
     return state == TaskState::done || state == TaskState::failed || state == TaskState::uploadDone;
@@ -23,20 +23,20 @@ bool isEnd(const QString &state) {
 QString message(const QString &type, const QString &state) {
     if (type == TaskType::firmwareUpload) {
         if (state == TaskState::scheduled)
-            return tr("Task - Upload Firmware created");
+            return Texts::tr("Task - Upload Firmware created");
         if (state == TaskState::processing)
-            return tr("Task - Upload Firmware processing");
-        return isEnd(state) ? tr("Task - Upload Firmware finished") : QString();
+            return Texts::tr("Task - Upload Firmware processing");
+        return isEnd(state) ? Texts::tr("Task - Upload Firmware finished") : QString();
     }
     if (type == TaskType::configFileUpload) {
         if (state == TaskState::processing)
-            return tr("Task - Upload Configuration File processing");
-        return isEnd(state) ? tr("Task - Upload Configuration File finished") : QString();
+            return Texts::tr("Task - Upload Configuration File processing");
+        return isEnd(state) ? Texts::tr("Task - Upload Configuration File finished") : QString();
     }
     if (type == TaskType::packageUpload) {
         if (state == TaskState::processing)
-            return tr("Task - Upload Package File processing");
-        return isEnd(state) ? tr("Task - Upload Package File finished") : QString();
+            return Texts::tr("Task - Upload Package File processing");
+        return isEnd(state) ? Texts::tr("Task - Upload Package File finished") : QString();
     }
     return {};
 }

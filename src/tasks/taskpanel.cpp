@@ -1,6 +1,7 @@
 #include "taskpanel.h"
 
 #include "confirmdialog.h"
+#include "flowlayout.h"
 #include "icons.h"
 #include "listactions.h"
 #include "notifier.h"
@@ -18,7 +19,6 @@
 #include <QButtonGroup>
 #include <QClipboard>
 #include <QGuiApplication>
-#include <QHBoxLayout>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPointer>
@@ -123,15 +123,13 @@ TaskPanel::~TaskPanel() = default;
 QWidget *TaskPanel::buildFilterRow() {
     auto *box = new QWidget(this);
     auto *row = new QWidget(box);
-    auto *rowLayout = new QHBoxLayout(row);
-    rowLayout->setContentsMargins(0, 0, 0, 0);
+    auto *rowLayout = new FlowLayout(row);
     rowLayout->setSpacing(4);
     auto *group = new QButtonGroup(this);
     group->addButton(addFilterButton(row, "taskFilterAllButton", tr("All"), TaskFilter::Kind::All));
     group->addButton(addFilterButton(row, "taskFilterActiveButton", tr("Active"), TaskFilter::Kind::Active));
     group->addButton(addFilterButton(row, "taskFilterFailedButton", tr("Failed"), TaskFilter::Kind::Failed));
     group->buttons().constFirst()->setChecked(true);
-    rowLayout->addStretch();
     m_removeFinished = new QToolButton(row);
     m_removeFinished->setObjectName(QStringLiteral("removeFinishedButton"));
     m_removeFinished->setProperty("role", QStringLiteral("panel"));
@@ -187,12 +185,11 @@ void TaskPanel::buildTree() {
 QWidget *TaskPanel::buildActionBar() {
     auto *bar = new QFrame(this);
     bar->setObjectName(QStringLiteral("panelActionBar"));
-    auto *buttons = new QHBoxLayout;
+    auto *buttons = new FlowLayout;
     buttons->setSpacing(6);
     buttons->addWidget(makeButton(m_retry, QStringLiteral("retryTaskButton")));
     buttons->addWidget(makeButton(m_cancel, QStringLiteral("cancelTaskButton")));
     buttons->addWidget(makeButton(m_remove, QStringLiteral("removeTaskButton")));
-    buttons->addStretch();
     m_hint->setObjectName(QStringLiteral("taskHintLabel"));
     m_hint->setTextFormat(Qt::PlainText);
     m_hint->setProperty("role", QStringLiteral("quiet"));

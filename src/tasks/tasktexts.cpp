@@ -14,9 +14,9 @@ namespace TaskTexts {
 
 namespace {
 
-QString tr(const char *text, int n = -1) {
-    return QCoreApplication::translate("TaskTexts", text, nullptr, n);
-}
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(TaskTexts)
+};
 
 /// "2 A, 1 B", the greatest count first.
 QString counted(const QHash<QString, int> &counts) {
@@ -52,8 +52,9 @@ QString summary(const TaskRecord &task) {
             ++states[TaskState::text(device.state)];
     }
     if (task.failedDevices == 0)
-        return tr("%n device(s): %1", static_cast<int>(task.devices.size())).arg(counted(states));
-    return tr("%1 of %2 failed: %3")
+        return Texts::tr("%n device(s): %1", nullptr, static_cast<int>(task.devices.size()))
+            .arg(counted(states));
+    return Texts::tr("%1 of %2 failed: %3")
         .arg(QLocale().toString(task.failedDevices),
              QLocale().toString(static_cast<int>(task.devices.size())), counted(causes));
 }
@@ -62,11 +63,11 @@ QString origin(const TaskRecord &task) {
     QStringList lines;
     const QString at = zonedTime(task.createdAt);
     if (task.user.isEmpty())
-        lines += tr("Started at %1").arg(at);
+        lines += Texts::tr("Started at %1").arg(at);
     else
-        lines += tr("Started by %1 at %2").arg(task.user, at);
+        lines += Texts::tr("Started by %1 at %2").arg(task.user, at);
     if (task.scheduledAt > 0)
-        lines += tr("Scheduled for %1").arg(zonedTime(task.scheduledAt));
+        lines += Texts::tr("Scheduled for %1").arg(zonedTime(task.scheduledAt));
     return lines.join(QLatin1Char('\n'));
 }
 
@@ -80,7 +81,7 @@ QString shortTime(qint64 unixMs) {
 
 QString zonedTime(qint64 unixMs) {
     if (unixMs <= 0)
-        return tr("an unknown time");
+        return Texts::tr("an unknown time");
     const QDateTime time = QDateTime::fromMSecsSinceEpoch(unixMs);
     const int minutes = time.offsetFromUtc() / 60;
     QString zone = QStringLiteral("UTC%1%2")

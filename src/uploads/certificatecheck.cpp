@@ -32,14 +32,14 @@ constexpr Text texts[] = {
     {Finding::Closed, QT_TRANSLATE_NOOP("CertificateCheck", "Key not opened by the password"), nullptr},
     {Finding::Mismatch, QT_TRANSLATE_NOOP("CertificateCheck", "Key of another certificate"), nullptr},
     {Finding::Expired, QT_TRANSLATE_NOOP("CertificateCheck", "Expired"),
-     QT_TRANSLATE_NOOP("CertificateCheck", "%n device(s) would get an expired certificate.")},
+     QT_TRANSLATE_N_NOOP("CertificateCheck", "%n device(s) would get an expired certificate.")},
     {Finding::NotYetValid, QT_TRANSLATE_NOOP("CertificateCheck", "Not yet valid"),
-     QT_TRANSLATE_NOOP("CertificateCheck", "%n device(s) would get a certificate that is not yet valid.")},
+     QT_TRANSLATE_N_NOOP("CertificateCheck", "%n device(s) would get a certificate that is not yet valid.")},
     {Finding::KeyInside, QT_TRANSLATE_NOOP("CertificateCheck", "File with a private key"),
-     QT_TRANSLATE_NOOP("CertificateCheck", "%n device(s) would get a file that holds a private key too.")},
+     QT_TRANSLATE_N_NOOP("CertificateCheck", "%n device(s) would get a file that holds a private key too.")},
     {Finding::NothingWaiting, QT_TRANSLATE_NOOP("CertificateCheck", "No key or request on the device"),
-     QT_TRANSLATE_NOOP("CertificateCheck", "%n device(s) will fail: no private key or certificate request "
-                                           "there to install a certificate for.")},
+     QT_TRANSLATE_N_NOOP("CertificateCheck", "%n device(s) will fail: no private key or certificate request "
+                                             "there to install a certificate for.")},
     {Finding::ExpiresSoon, QT_TRANSLATE_NOOP("CertificateCheck", "Expires soon"), nullptr},
 };
 

@@ -13,12 +13,13 @@ namespace CertificatePaths {
 
 namespace {
 
-constexpr const char *context = "CertificatePaths";
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(CertificatePaths)
+};
 
 QString filters() {
-    return QCoreApplication::translate(context, "Certificates and keys") +
-           QStringLiteral(" (*.pem *.crt *.cer *.der *.key);;") +
-           QCoreApplication::translate(context, "All files") + QStringLiteral(" (*)");
+    return Texts::tr("Certificates and keys") + QStringLiteral(" (*.pem *.crt *.cer *.der *.key);;") +
+           Texts::tr("All files") + QStringLiteral(" (*)");
 }
 
 void rememberFolder(const QString &path) {

@@ -6,8 +6,11 @@
 namespace CertificateValidities {
 
 namespace {
-constexpr const char *context = "CertificateValidities";
 constexpr qint64 dayMs = 86400000;
+
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(CertificateValidities)
+};
 } // namespace
 
 CertificateValidity of(qint64 from, qint64 until, qint64 now) {
@@ -23,17 +26,17 @@ CertificateValidity of(qint64 from, qint64 until, qint64 now) {
 QString text(CertificateValidity validity) {
     switch (validity) {
     case CertificateValidity::Unknown:
-        return QCoreApplication::translate(context, "Unknown");
+        return Texts::tr("Unknown");
     case CertificateValidity::NotYetValid:
-        return QCoreApplication::translate(context, "Not yet valid");
+        return Texts::tr("Not yet valid");
     case CertificateValidity::ExpiresSoon:
-        return QCoreApplication::translate(context, "Expires soon");
+        return Texts::tr("Expires soon");
     case CertificateValidity::Expired:
-        return QCoreApplication::translate(context, "Expired");
+        return Texts::tr("Expired");
     case CertificateValidity::Valid:
         break;
     }
-    return QCoreApplication::translate(context, "Valid");
+    return Texts::tr("Valid");
 }
 
 QString dateText(qint64 time) {

@@ -1,5 +1,7 @@
 #include "rolloutfields.h"
 
+#include "flowlayout.h"
+
 #include <QCheckBox>
 #include <QComboBox>
 #include <QHBoxLayout>
@@ -35,7 +37,9 @@ RolloutFields::RolloutFields(QWidget *parent)
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(8);
-    layout->addWidget(m_inWaves);
+    // Beside the first line of what may be two.
+    m_inWaves->setMinimumHeight(m_first->sizeHint().height());
+    layout->addWidget(m_inWaves, 0, Qt::AlignTop);
     layout->addWidget(buildDetails(), 1);
     connect(m_unit, &QComboBox::currentIndexChanged, this, &RolloutFields::onUnitChanged);
     connect(m_inWaves, &QCheckBox::toggled, this, [this] {
@@ -57,17 +61,19 @@ QSpinBox *RolloutFields::addSpinBox(const char *name, const QString &accessibleN
 }
 
 QWidget *RolloutFields::buildDetails() {
-    auto *layout = new QHBoxLayout(m_details);
-    layout->setContentsMargins(0, 0, 0, 0);
+    const auto word = [this](const QString &text) { return new QLabel(text, m_details); };
+    auto *layout = new FlowLayout(m_details);
     layout->setSpacing(6);
-    layout->addWidget(new QLabel(tr("first"), m_details));
-    layout->addWidget(m_first);
-    layout->addWidget(m_unit);
-    layout->addWidget(new QLabel(tr("wait"), m_details));
-    layout->addWidget(m_wait);
-    layout->addWidget(new QLabel(tr("go on if at most"), m_details));
-    layout->addWidget(m_failed);
-    layout->addWidget(new QLabel(tr("failed"), m_details), 1);
+    for (const std::initializer_list<QWidget *> &clause :
+         {std::initializer_list<QWidget *>{word(tr("first")), m_first, m_unit},
+          {word(tr("wait")), m_wait},
+          {word(tr("go on if at most")), m_failed, word(tr("failed"))}}) {
+        auto *line = new QHBoxLayout;
+        line->setSpacing(6);
+        for (QWidget *part : clause)
+            line->addWidget(part);
+        layout->addLayout(line);
+    }
     return m_details;
 }
 

@@ -13,7 +13,8 @@ constexpr int flags = Qt::AlignLeft | Qt::AlignTop | Qt::TextWordWrap;
 } // namespace
 
 WrappingCheckBox::WrappingCheckBox(const QString &text, QWidget *parent) : QCheckBox(text, parent) {
-    QSizePolicy policy(QSizePolicy::Preferred, QSizePolicy::Fixed);
+    // A fixed height would be that of one line.
+    QSizePolicy policy(QSizePolicy::Preferred, QSizePolicy::Minimum);
     policy.setHeightForWidth(true);
     setSizePolicy(policy);
 }
