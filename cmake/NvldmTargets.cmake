@@ -5,6 +5,19 @@ function(nvldm_compile_options target)
     target_compile_options(${target} PRIVATE
         -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wold-style-cast -Wcast-qual
         $<$<BOOL:${NVLDM_WERROR}>:-Werror>)
+    nvldm_release_options(${target})
+endfunction()
+
+# What is given to others names no folder of the machine that built it, so that the same sources make the same
+# bytes anywhere; on Linux it carries the hardening that the distribution expects of its programs.
+function(nvldm_release_options target)
+    target_compile_options(${target} PRIVATE
+        "$<$<CONFIG:Release>:-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=;-ffile-prefix-map=${PROJECT_BINARY_DIR}/=>")
+    if(NOT WIN32)
+        target_compile_options(${target} PRIVATE
+            "$<$<CONFIG:Release>:-fstack-protector-strong;-Wp,-D_FORTIFY_SOURCE=2>")
+        target_link_options(${target} PRIVATE "$<$<CONFIG:Release>:-Wl,-z,relro,-z,now>")
+    endif()
 endfunction()
 
 # A static library of one folder. PUBLIC and PRIVATE name what it may include: a header of a library that is

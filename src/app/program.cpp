@@ -27,7 +27,7 @@ constexpr int runnersEndMs = 10000;
 void setIdentity() {
     QCoreApplication::setOrganizationName(QStringLiteral("Norvell Inc."));
     QCoreApplication::setApplicationName(QStringLiteral("Norvell Device Manager"));
-    QCoreApplication::setApplicationVersion(QStringLiteral("v1.2.0.1"));
+    QCoreApplication::setApplicationVersion(QStringLiteral("v" NVLDM_VERSION));
 }
 
 QIcon applicationIcon() {
