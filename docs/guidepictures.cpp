@@ -161,7 +161,7 @@ private:
     void showDevices() {
         chooseDevices(3);
         saveFrame("device-page");
-        search("10.4.0.10-20");
+        search("10.20.0.0/24 NC-9381");
         saveFrame("searching");
         search({});
         auto *sites = part<QTreeWidget>("siteTree");
@@ -189,6 +189,15 @@ private:
         saveDialog("RestoreDeviceDialog", "restoring");
     }
 
+    /// Shows what a dialog has to say beyond its first sight, and nothing of this user.
+    void fill(const QWidget *form) const {
+        QTest::qWait(settleMs);
+        if (auto *waves = form->findChild<QAbstractButton *>("inWavesCheckBox"))
+            waves->setChecked(true);
+        if (form->objectName() == "ExportDebugInfoDialog")
+            type(form, "pathEdit", QDir::tempPath());
+    }
+
     void showUploads() {
         for (const auto &[action, name, picture] :
              {std::tuple("uploadFirmwareAction", "UploadFirmwareDialog", "firmware"),
@@ -198,6 +207,7 @@ private:
               std::tuple("certificateListAction", "CertificatesDialog", "certificates"),
               std::tuple("exportDebugInfoAction", "ExportDebugInfoDialog", "export-debug-info")}) {
             choose(action);
+            fill(dialog(name));
             saveDialog(name, picture);
         }
         press("quickSettingButton");
@@ -246,7 +256,10 @@ int main(int argc, char *argv[]) {
     return Program::run(argc, argv, [folder](QWidget &frame) {
         QTimer::singleShot(0, &frame, [&frame, folder] {
             Photographer(frame, folder).run();
-            frame.close();
+            // The event loop that is to end may not have begun: the splash screen waits for the frame.
+            auto *end = new QTimer(&frame);
+            QObject::connect(end, &QTimer::timeout, &frame, [] { QCoreApplication::quit(); });
+            end->start(settleMs);
         });
     });
 }

@@ -53,6 +53,7 @@ void AboutDialog::fillParts() {
         table->setItem(row, 1, cell(parts[row].version));
         table->setItem(row, 2, cell(parts[row].licence));
     }
+    table->horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
     table->setFixedHeight(table->horizontalHeader()->sizeHint().height() + table->verticalHeader()->length());
 }

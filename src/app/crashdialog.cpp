@@ -3,7 +3,6 @@
 #include <QDesktopServices>
 #include <QFile>
 #include <QFileInfo>
-#include <QFontDatabase>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPlainTextEdit>
@@ -47,7 +46,6 @@ QWidget *CrashDialog::buildBody(const QString &path) {
     text->setAccessibleName(tr("Report"));
     text->setReadOnly(true);
     text->setLineWrapMode(QPlainTextEdit::NoWrap);
-    text->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
     text->setMinimumSize(textSize);
     text->setTabChangesFocus(true);
     auto *layout = new QVBoxLayout(body);
