@@ -1,5 +1,7 @@
 #include "nettask.h"
 
+#include "crashcatcher.h"
+
 #include <QDeadlineTimer>
 #include <QDebug>
 
@@ -49,6 +51,7 @@ void NetTask::setUp(quintptr context, Job job, Preparation preparation) {
 }
 
 void NetTask::run() {
+    const CrashCatcher::ThreadGuard guard;
     try {
         if (m_preparation)
             m_preparation();

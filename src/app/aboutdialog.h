@@ -8,7 +8,7 @@ namespace Ui {
 class AboutDialog;
 }
 
-/// Name and version of the program.
+/// Name and version of the program, and whose work it is built on.
 class AboutDialog : public FramelessDialog {
     Q_OBJECT
 
@@ -17,5 +17,7 @@ public:
     ~AboutDialog() override;
 
 private:
+    void fillParts();
+
     std::unique_ptr<Ui::AboutDialog> m_ui;
 };

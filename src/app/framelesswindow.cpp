@@ -4,6 +4,8 @@
 #include "accountmanagementdialog.h"
 #include "accountsetupdialog.h"
 #include "confirmdialog.h"
+#include "crashdialog.h"
+#include "crashreport.h"
 #include "devicewindow.h"
 #include "exetaskmgr.h"
 #include "idlewatch.h"
@@ -24,6 +26,7 @@
 #include "titlebar.h"
 #include "transientmessage.h"
 #include "uploadtaskmgr.h"
+#include "userguide.h"
 #include "welcomepage.h"
 
 #include <QApplication>
@@ -66,7 +69,7 @@ FramelessWindow::FramelessWindow(QWidget *parent)
     probeLocalService();
     connectParts();
     qApp->installEventFilter(this);
-    QTimer::singleShot(0, this, &FramelessWindow::checkLoginDialog);
+    QTimer::singleShot(0, this, &FramelessWindow::begin);
 }
 
 FramelessWindow::~FramelessWindow() {
@@ -127,6 +130,7 @@ void FramelessWindow::connectParts() {
     connect(m_titleBar->restoreButton(), &QToolButton::clicked, this,
             &FramelessWindow::on_restoreButton_clicked);
     connect(m_titleBar->closeButton(), &QToolButton::clicked, this, &FramelessWindow::on_closeButton_clicked);
+    connect(m_titleBar->helpButton(), &QToolButton::clicked, this, &FramelessWindow::on_helpButton_clicked);
     connect(m_titleBar->accountManagementAction(), &QAction::triggered, this,
             &FramelessWindow::onAccontManagement);
     connect(m_titleBar->serviceManagementAction(), &QAction::triggered, this,
@@ -169,6 +173,19 @@ void FramelessWindow::setContent(MainWindow *content) {
     connect(content->deviceWindow(), &DeviceWindow::remoteServerChosen, this,
             &FramelessWindow::onRemoteServerChosen);
     connect(content->deviceWindow(), &DeviceWindow::allTasksDone, this, &FramelessWindow::logoutIfIdle);
+}
+
+/// What the last run has left to say comes before the login.
+void FramelessWindow::begin() {
+    const QString report = CrashReport::takePending();
+    if (report.isEmpty())
+        return checkLoginDialog();
+    auto *dialog = new CrashDialog(report, this);
+    connect(dialog, &QDialog::finished, this, [this] {
+        m_dialog = nullptr;
+        checkLoginDialog();
+    });
+    showDialog(dialog);
 }
 
 void FramelessWindow::checkLoginDialog() {
@@ -238,6 +255,19 @@ void FramelessWindow::onAbout() {
     auto *dialog = new AboutDialog(this);
     dialog->setAttribute(Qt::WA_DeleteOnClose);
     dialog->open();
+}
+
+void FramelessWindow::on_helpButton_clicked() {
+    openGuide(nullptr);
+}
+
+void FramelessWindow::openGuide(const QWidget *place) {
+    QString page = UserGuide::pageFor(place);
+    if (page.isEmpty() && m_loggedIn && m_content)
+        page = UserGuide::pageFor(m_content->currentPage());
+    if (!UserGuide::open(page))
+        TransientMessage::show(this, tr("The user guide cannot be opened. It is installed with the program."),
+                               TransientMessage::Kind::Error);
 }
 
 void FramelessWindow::onLogOff() {
@@ -356,10 +386,4 @@ void FramelessWindow::tellLogOff() {
             if (result != ApiOk)
                 qWarning("Encountered unexpected error when onLogOff() while FramelessWindow");
         });
-}
-
-bool FramelessWindow::eventFilter(QObject *watched, QEvent *event) {
-    if (event->type() == QEvent::MouseButtonPress && m_loggedIn)
-        m_idle->noteActivity();
-    return QWidget::eventFilter(watched, event);
 }

@@ -56,6 +56,8 @@ public slots:
     /// Opens the dialog about the remote-access service that fits.
     void validateOrbServiceAdded();
     void onAbout();
+    /// Shows the guide's page about what is open.
+    void on_helpButton_clicked();
     /// Ends the session and shows the login dialog.
     void onLogOff();
     /// Logs off unless somebody was active since the idle timer's last tick.
@@ -92,6 +94,8 @@ private:
     void onNotificationClicked(int type);
     void onRemoteServerChosen(const QString &serverId);
     void showDialog(FramelessDialog *dialog);
+    void begin();
+    void openGuide(const QWidget *place);
     Qt::Edges edgesAt(const QPoint &position) const;
 
     TitleBar *m_titleBar;

@@ -1,11 +1,14 @@
-// The frame as a window: its states, its buttons and the edges that resize it.
+// The frame as a window: its states, its buttons, the edges that resize it, and what
+// it sees of all input.
 
 #include "framelesswindow.h"
 
 #include "framelessdialog.h"
+#include "idlewatch.h"
 #include "resizeedges.h"
 #include "titlebar.h"
 
+#include <QKeyEvent>
 #include <QLayout>
 #include <QMouseEvent>
 #include <QTimer>
@@ -78,4 +81,16 @@ void FramelessWindow::mousePressEvent(QMouseEvent *event) {
 
 void FramelessWindow::mouseMoveEvent(QMouseEvent *event) {
     setCursor(ResizeEdges::cursorOf(edgesAt(event->position().toPoint())));
+}
+
+bool FramelessWindow::eventFilter(QObject *watched, QEvent *event) {
+    if (event->type() == QEvent::MouseButtonPress && m_loggedIn)
+        m_idle->noteActivity();
+    // The key goes to windows first, which know less about the place than the widget with the focus.
+    if (event->type() == QEvent::KeyPress && watched->isWidgetType() &&
+        static_cast<QKeyEvent *>(event)->matches(QKeySequence::HelpContents)) {
+        openGuide(static_cast<QWidget *>(watched));
+        return true;
+    }
+    return QWidget::eventFilter(watched, event);
 }

@@ -106,6 +106,10 @@ QWidget *MainWindow::buildRail() {
     return rail;
 }
 
+QWidget *MainWindow::currentPage() const {
+    return m_pages->currentWidget();
+}
+
 void MainWindow::startWork() {
     showPage(DevicePage);
     m_deviceWindow->startWork();

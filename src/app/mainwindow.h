@@ -28,6 +28,7 @@ public:
     LogWindow *logWindow() const { return m_logWindow; }
     SettingWindow *settingWindow() const { return m_settingWindow; }
     SidePanel *sidePanel() const { return m_sidePanel; }
+    QWidget *currentPage() const;
 
     /// Begins to work on the present session, on the device page.
     void startWork();

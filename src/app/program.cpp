@@ -1,6 +1,7 @@
 #include "program.h"
 
 #include "apppaths.h"
+#include "crashreport.h"
 #include "framelesswindow.h"
 #include "interfacelanguage.h"
 #include "localstore.h"
@@ -67,7 +68,10 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
     // The log's place depends on the identity, and the toolkit logs from the application's construction on.
     setIdentity();
     MessageLog::install();
+    ProcessSetup::keepMemoryPrivate();
     ProcessSetup::ignoreBrokenPipes();
+    CrashReport::install(QCoreApplication::applicationName() + QLatin1Char(' ') +
+                         QCoreApplication::applicationVersion());
 
     int status = 0;
     {

@@ -33,8 +33,6 @@ TitleBar::TitleBar(QWidget *parent) : WindowDragger(parent), m_menu(new PopupMen
     m_maximize = addButton("maximizeButton", QStringLiteral("icon_chrome_maximize_line"), tr("Maximize"));
     m_restore = addButton("restoreButton", QStringLiteral("icon_chrome_restore_line"), tr("Restore"));
     m_close = addButton("closeButton", QStringLiteral("icon_chrome_close_line"), tr("Close"));
-    // There is no guide to open yet.
-    m_help->setEnabled(false);
     buildMenu();
     setMaximized(false);
 }

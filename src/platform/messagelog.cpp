@@ -1,11 +1,13 @@
 #include "messagelog.h"
 
 #include "apppaths.h"
+#include "crashreport.h"
 #include "privatefiles.h"
 
 #include <QDateTime>
 #include <QFile>
 
+#include <atomic>
 #include <cstdio>
 #include <mutex>
 
@@ -15,7 +17,13 @@ namespace {
 
 constexpr QFileDevice::Permissions ownerOnly = QFileDevice::ReadOwner | QFileDevice::WriteOwner;
 
+// Noncharacters around a secret on its way into a line; whoever writes the line takes them out.
+constexpr QByteArrayView secretBegin("\xEF\xB7\x90");
+constexpr QByteArrayView secretEnd("\xEF\xB7\x91");
+constexpr QByteArrayView mask("***");
+
 std::mutex logMutex;
+std::atomic<bool> installed = false;
 
 /// Local time, with the zone's offset asked for once a minute: asking costs more than the whole line.
 QDateTime localNow() {
@@ -63,28 +71,50 @@ bool append(const QDateTime &time, const QByteArray &line) {
            file.write(line) == line.size();
 }
 
+QByteArray withoutMarks(QByteArray text) {
+    return text.replace(secretBegin, {}).replace(secretEnd, {});
+}
+
+QByteArray masked(QByteArray text) {
+    for (qsizetype begin = 0; (begin = text.indexOf(secretBegin, begin)) >= 0;) {
+        const qsizetype end = text.indexOf(secretEnd, begin);
+        text.replace(begin, (end < 0 ? text.size() : end + secretEnd.size()) - begin, mask);
+    }
+    return text;
+}
+
 void handle(QtMsgType type, const QMessageLogContext &context, const QString &message) {
-    const QByteArray text = message.toUtf8();
+    const QByteArray marked = message.toUtf8();
+    const QByteArray text = withoutMarks(marked);
     const std::lock_guard lock(logMutex);
     print(text);
     const QDateTime time = localNow();
-    QByteArray line = time.toString(QStringLiteral("yyyy-MM-dd hh:mm:ss.zzz ")).toUtf8();
-    line += severityLabel(type) + text + ", file: " + context.file +
-            ", line: " + QByteArray::number(context.line) + ", function: " + context.function + '\n';
+    const QByteArray begin =
+        time.toString(QStringLiteral("yyyy-MM-dd hh:mm:ss.zzz ")).toUtf8() + severityLabel(type);
+    const QByteArray line = begin + text + ", file: " + context.file +
+                            ", line: " + QByteArray::number(context.line) +
+                            ", function: " + context.function + '\n';
     // A message from inside a handler would bypass it, so this one is printed directly.
     if (!append(time, line))
         print("Failed to open log file");
+    CrashReport::remember(begin + masked(marked));
 }
 
 } // namespace
 
 void install() {
+    installed = true;
     qInstallMessageHandler(handle);
 }
 
 QByteArray secret(const QByteArray &text) {
     static const bool redact = qEnvironmentVariableIntValue("NVLDM_LOG_REDACT") == 1;
-    return redact && !text.isEmpty() ? QByteArray("***") : text;
+    if (text.isEmpty())
+        return text;
+    if (redact)
+        return mask.toByteArray();
+    // Other handlers than this one's know nothing of marks.
+    return installed ? secretBegin.toByteArray() + withoutMarks(text) + secretEnd.toByteArray() : text;
 }
 
 QByteArray secret(const QString &text) {

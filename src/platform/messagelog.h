@@ -11,7 +11,8 @@ namespace MessageLog {
 void install();
 
 /// The text itself, or a mask when NVLDM_LOG_REDACT=1 asks for it: for passwords, tokens and keys in log
-/// lines.
+/// lines. What a crash tells of the log is masked always: once the log is installed the text comes marked for
+/// that, which is seen nowhere in the log and makes the result unfit for anything else.
 QByteArray secret(const QByteArray &text);
 QByteArray secret(const QString &text);
 QByteArray secret(const std::string &text);

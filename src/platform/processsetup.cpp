@@ -2,11 +2,29 @@
 
 #include <csignal>
 
+#ifdef __unix__
+#include <sys/resource.h>
+#endif
+#ifdef __linux__
+#include <sys/prctl.h>
+#endif
+
 namespace ProcessSetup {
 
 void ignoreBrokenPipes() {
 #ifdef SIGPIPE
     std::signal(SIGPIPE, SIG_IGN);
+#endif
+}
+
+void keepMemoryPrivate() {
+#ifdef __unix__
+    const rlimit none{0, 0};
+    ::setrlimit(RLIMIT_CORE, &none);
+#endif
+#if defined(__linux__) && defined(NDEBUG)
+    // A limit does not hold where the system pipes images to a collector; debuggers need the other build.
+    ::prctl(PR_SET_DUMPABLE, 0, 0, 0, 0);
 #endif
 }
 

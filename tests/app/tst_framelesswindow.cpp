@@ -3,6 +3,7 @@
 #include "accountsetupdialog.h"
 #include "badgebutton.h"
 #include "clientstore.h"
+#include "crashdialog.h"
 #include "devicewindow.h"
 #include "emulatorprocess.h"
 #include "form.h"
@@ -23,9 +24,14 @@
 #include "welcomepage.h"
 
 #include <QComboBox>
+#include <QDesktopServices>
+#include <QDir>
 #include <QElapsedTimer>
 #include <QFile>
+#include <QFileInfo>
 #include <QListView>
+#include <QPlainTextEdit>
+#include <QPushButton>
 #include <QRadioButton>
 #include <QSignalSpy>
 #include <QTimer>
@@ -40,6 +46,19 @@ namespace {
 const QString email = QStringLiteral("admin@norvell.example");
 const QString password = QStringLiteral("Passw0rd!");
 constexpr int patienceMs = 15000;
+
+/// Takes the place of what the desktop shows files with.
+class Viewer : public QObject {
+    Q_OBJECT
+
+public:
+    Viewer() { QDesktopServices::setUrlHandler("file", this, "open"); }
+    ~Viewer() override { QDesktopServices::unsetUrlHandler("file"); }
+    QStringList opened;
+
+public slots:
+    void open(const QUrl &url) { opened << url.toLocalFile(); }
+};
 
 } // namespace
 
@@ -108,6 +127,53 @@ private slots:
         QTRY_COMPARE_WITH_TIMEOUT(shownRows(), 20, patienceMs);
         QVERIFY(m_window->isLoggedIn());
         QVERIFY(m_window->findChild<DeviceWindow *>()->isVisible());
+    }
+
+    void helpIsAboutThePlace() {
+        logIn();
+        const Viewer viewer;
+        const auto helpOf = [&](const char *name) {
+            QTest::keyClick(Form::part(m_window.get(), name), Qt::Key_F1);
+            return QFileInfo(viewer.opened.value(viewer.opened.size() - 1)).fileName();
+        };
+        titleBar()->helpButton()->click();
+        QCOMPARE(viewer.opened.size(), 1);
+        QCOMPARE(QFileInfo(viewer.opened[0]).fileName(), "device-page.html");
+        QCOMPARE(helpOf("siteTree"), "sites.html");
+        QCOMPARE(helpOf("deviceSearchEdit"), "searching.html");
+        QCOMPARE(helpOf("deviceButton"), "device-page.html");
+        Form::click(m_window.get(), "settingsButton");
+        QCOMPARE(helpOf("settingsButton"), "settings.html");
+        titleBar()->aboutAction()->trigger();
+        QTRY_VERIFY(Form::visible<AboutDialog>());
+        QTest::keyClick(Form::visible<AboutDialog>(), Qt::Key_F1);
+        titleBar()->logOffAction()->trigger();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QTest::keyClick(Form::visible<LoginDialog>(), Qt::Key_F1);
+        QCOMPARE(viewer.opened.size(), 7);
+        QCOMPARE(QFileInfo(viewer.opened[5]).fileName(), "settings.html");
+        QCOMPARE(QFileInfo(viewer.opened[6]).fileName(), "first-start.html");
+        for (const QString &page : viewer.opened)
+            QVERIFY2(QFileInfo(page).isFile(), qUtf8Printable(page));
+    }
+
+    void crashIsToldBeforeTheLogin() {
+        startService();
+        QVERIFY(QDir().mkpath(m_root.filePath("Logs")));
+        QVERIFY(m_root.write("Logs/crash-2026-01-02-120000-7.new.txt", "<b>Program</b> ended"));
+        openWindow();
+        QTRY_VERIFY(Form::visible<CrashDialog>());
+        auto *dialog = Form::visible<CrashDialog>();
+        QCOMPARE(Form::part<QPlainTextEdit>(dialog, "reportEdit")->toPlainText(), "<b>Program</b> ended");
+        const Viewer viewer;
+        Form::click(dialog, "showFolderButton");
+        QCOMPARE(viewer.opened, QStringList(m_root.filePath("Logs")));
+        QVERIFY(!Form::visible<LoginDialog>());
+        QTest::keyClick(dialog, Qt::Key_Return);
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        openWindow();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QVERIFY(!Form::visible<CrashDialog>());
     }
 
     void logOffEndsTheSession() {
