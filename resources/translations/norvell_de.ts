@@ -11,6 +11,26 @@
         <source>About</source>
         <translation>Info</translation>
     </message>
+    <message>
+        <source>The program is built with the work of others, under these licences:</source>
+        <translation>Das Programm baut auf der Arbeit anderer auf, unter diesen Lizenzen:</translation>
+    </message>
+    <message>
+        <source>Licences</source>
+        <translation>Lizenzen</translation>
+    </message>
+    <message>
+        <source>Component</source>
+        <translation>Bestandteil</translation>
+    </message>
+    <message>
+        <source>Version</source>
+        <translation>Version</translation>
+    </message>
+    <message>
+        <source>Licence</source>
+        <translation>Lizenz</translation>
+    </message>
 </context>
 <context>
     <name>AccountManagementDialog</name>
@@ -1411,6 +1431,29 @@
     </message>
 </context>
 <context>
+    <name>CrashDialog</name>
+    <message>
+        <source>Unexpected End</source>
+        <translation>Unerwartetes Ende</translation>
+    </message>
+    <message>
+        <source>The program ended unexpectedly the last time. This report was saved; it may help your support to find out why. Passwords are left out of it.</source>
+        <translation>Das Programm wurde beim letzten Mal unerwartet beendet. Dieser Bericht wurde gespeichert; er kann dem Support helfen, den Grund zu finden. Passwörter sind nicht darin.</translation>
+    </message>
+    <message>
+        <source>Report</source>
+        <translation>Bericht</translation>
+    </message>
+    <message>
+        <source>Show folder</source>
+        <translation>Ordner zeigen</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>Schließen</translation>
+    </message>
+</context>
+<context>
     <name>CredentialRules</name>
     <message>
         <source>The field can&apos;t be empty.</source>
@@ -2178,6 +2221,10 @@
     <message>
         <source>Session Timeout</source>
         <translation>Sitzung abgelaufen</translation>
+    </message>
+    <message>
+        <source>The user guide cannot be opened. It is installed with the program.</source>
+        <translation>Das Benutzerhandbuch kann nicht geöffnet werden. Es wird mit dem Programm installiert.</translation>
     </message>
 </context>
 <context>

@@ -11,6 +11,26 @@
         <source>About</source>
         <translation>バージョン情報</translation>
     </message>
+    <message>
+        <source>The program is built with the work of others, under these licences:</source>
+        <translation>このプログラムは、以下のライセンスによる他者の成果を利用しています:</translation>
+    </message>
+    <message>
+        <source>Licences</source>
+        <translation>ライセンス</translation>
+    </message>
+    <message>
+        <source>Component</source>
+        <translation>コンポーネント</translation>
+    </message>
+    <message>
+        <source>Version</source>
+        <translation>バージョン</translation>
+    </message>
+    <message>
+        <source>Licence</source>
+        <translation>ライセンス</translation>
+    </message>
 </context>
 <context>
     <name>AccountManagementDialog</name>
@@ -1391,6 +1411,29 @@
     </message>
 </context>
 <context>
+    <name>CrashDialog</name>
+    <message>
+        <source>Unexpected End</source>
+        <translation>予期しない終了</translation>
+    </message>
+    <message>
+        <source>The program ended unexpectedly the last time. This report was saved; it may help your support to find out why. Passwords are left out of it.</source>
+        <translation>前回、プログラムが予期せず終了しました。このレポートが保存されています。サポートでの原因調査に役立つことがあります。パスワードは含まれていません。</translation>
+    </message>
+    <message>
+        <source>Report</source>
+        <translation>レポート</translation>
+    </message>
+    <message>
+        <source>Show folder</source>
+        <translation>フォルダーを表示</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>閉じる</translation>
+    </message>
+</context>
+<context>
     <name>CredentialRules</name>
     <message>
         <source>The field can&apos;t be empty.</source>
@@ -2145,6 +2188,10 @@
     <message>
         <source>Session Timeout</source>
         <translation>セッションがタイムアウトしました</translation>
+    </message>
+    <message>
+        <source>The user guide cannot be opened. It is installed with the program.</source>
+        <translation>ユーザーガイドを開けません。ユーザーガイドはプログラムと一緒にインストールされます。</translation>
     </message>
 </context>
 <context>
