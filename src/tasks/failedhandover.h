@@ -7,5 +7,6 @@ struct FailedHandOver {
     QString ctid; ///< of its record
     QString serviceType;
     int devices = 0;
-    QString reason; ///< a whole sentence
+    QString reason;          ///< a whole sentence
+    bool isFollowed = false; ///< whoever inserted the record sees to it
 };

@@ -65,6 +65,8 @@ QToolButton *FailedTaskStrip::addButton(const char *name, const QString &text,
 
 void FailedTaskStrip::follow(TaskQueue *queue) {
     connect(queue, &TaskQueue::handOverFailed, this, [this, queue](const FailedHandOver &failure) {
+        if (failure.isFollowed)
+            return;
         m_entries.push_back({queue, failure});
         showFirst();
     });

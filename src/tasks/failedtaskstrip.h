@@ -12,7 +12,8 @@ class QToolButton;
 class TaskQueue;
 
 /// Tells of operations that did not begin, one after the other, each until the user starts it again or has
-/// seen enough of it. Hidden while there is none.
+/// seen enough of it. Those that somebody follows are told of and begun again elsewhere. Hidden while there
+/// is none.
 class FailedTaskStrip : public QFrame {
     Q_OBJECT
 

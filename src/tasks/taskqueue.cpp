@@ -116,9 +116,13 @@ bool TaskQueue::insert(const char *type, JSON record, QString *ctid) {
     }
     if (ctid)
         *ctid = QString::fromStdString(id);
+    QMetaObject::invokeMethod(this, &TaskQueue::startTimer);
+    return true;
+}
+
+void TaskQueue::startTimer() {
     if (!m_timer->isActive())
         m_timer->start();
-    return true;
 }
 
 void TaskQueue::onTimeout() {
@@ -211,10 +215,13 @@ void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Out
     else if (outcome.made || over)
         setState(family, step.record, family.failureState());
     if (outcome.result != ApiOk && !over && !step.transfer->isCancelled())
-        tell([this, failure = FailedHandOver{
-                        stringMember(step.record, "ctid"), QString::fromLatin1(family.serviceType),
-                        static_cast<int>(step.record.at(family.targets).size()),
-                        reasonOf(outcome.result, *step.transfer)}] { emit handOverFailed(failure); });
+        tell([this, failure = FailedHandOver{stringMember(step.record, "ctid"),
+                                             QString::fromLatin1(family.serviceType),
+                                             static_cast<int>(step.record.at(family.targets).size()),
+                                             reasonOf(outcome.result, *step.transfer)}]() mutable {
+            failure.isFollowed = m_followed.contains(failure.ctid);
+            emit handOverFailed(failure);
+        });
     complete(outcome.result);
 }
 
@@ -288,11 +295,19 @@ void TaskQueue::startAgain(const QString &ctid) {
     dismiss(ctid);
 }
 
+void TaskQueue::setFollowed(const QString &ctid, bool followed) {
+    if (followed)
+        m_followed.insert(ctid);
+    else
+        m_followed.remove(ctid);
+}
+
 void TaskQueue::dismiss(const QString &ctid) {
     m_records.wipeSecret(ctid.toStdString());
 }
 
 void TaskQueue::onSessionEnded() {
+    m_followed.clear();
     cancelSending();
     for (const JSON &record : m_records.leaveBehind(presentSession())) {
         const TaskFamily *family = familyOf(textMember(record, "type"));

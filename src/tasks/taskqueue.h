@@ -6,6 +6,7 @@
 #include "taskfamily.h"
 
 #include <QObject>
+#include <QSet>
 
 #include <atomic>
 #include <functional>
@@ -48,6 +49,9 @@ public:
 
     /// Does the work of a failed record again, as a new record.
     void startAgain(const QString &ctid);
+    /// Whoever inserted a record sees to what becomes of it, or does so no longer: nobody else offers to
+    /// start it again meanwhile.
+    void setFollowed(const QString &ctid, bool followed);
     /// A failed record will not be started again.
     void dismiss(const QString &ctid);
 
@@ -77,7 +81,7 @@ protected:
     TaskQueue(std::span<const TaskFamily> families, const char *walkError);
 
     /// Completes a record (id, type, state) and appends it. ctid: takes its id where it is not null. False,
-    /// and a line logged, for a type that the queue does not know or a state that is no text.
+    /// and a line logged, for a type that the queue does not know or a state that is no text. Any thread.
     bool insert(const char *type, JSON record, QString *ctid = nullptr);
 
 private:
@@ -92,6 +96,7 @@ private:
     void runStep(const TaskFamily &family, const JSON &record);
     Outcome perform(const TaskFamily &family, TaskStep &step);
     void finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome);
+    void startTimer();
     void complete(quint32 error);
     void setSending(Sending sending);
     void cancelSending();
@@ -115,6 +120,7 @@ private:
     Callable m_progress;
     Callable m_state;
     QTimer *m_timer;
+    QSet<QString> m_followed; ///< records that somebody sees to
     bool m_ticking = false;
     std::atomic<bool> m_stopping = false;
     NetTask m_worker{NetTask::Turn::Beside}; ///< last: its job uses the others until it has ended

@@ -3,15 +3,8 @@
 #include "certificatepaths.h"
 #include "certificatereader.h"
 #include "certificatevalidity.h"
-#include "plaintext.h"
 
 #include <QDateTime>
-#include <QHBoxLayout>
-#include <QLabel>
-#include <QLineEdit>
-#include <QPushButton>
-#include <QStyle>
-#include <QVBoxLayout>
 
 namespace {
 
@@ -32,37 +25,15 @@ QString doubtAbout(const CertificateFile &file) {
 
 } // namespace
 
-CaFileField::CaFileField(QWidget *parent)
-    : QWidget(parent),
-      m_reader(new CertificateReader(this)),
-      m_name(new QLineEdit(this)),
-      m_details(new QLabel(this)) {
-    m_name->setObjectName(QStringLiteral("caFileEdit"));
-    m_name->setAccessibleName(tr("CA certificate"));
-    m_name->setPlaceholderText(tr("Choose a file"));
-    m_name->setReadOnly(true);
-    auto *browse = new QPushButton(tr("Browse…"), this);
-    browse->setObjectName(QStringLiteral("caBrowseButton"));
-    browse->setAutoDefault(false);
-    m_details->setObjectName(QStringLiteral("caDetailsLabel"));
-    m_details->setTextFormat(Qt::PlainText);
-    m_details->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
-    tell({}, "quiet");
-    auto *line = new QHBoxLayout;
-    line->setSpacing(8);
-    line->addWidget(m_name, 1);
-    line->addWidget(browse);
-    auto *layout = new QVBoxLayout(this);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(4);
-    layout->addLayout(line);
-    layout->addWidget(m_details);
-    setFocusProxy(browse);
-    connect(browse, &QPushButton::clicked, this, [this] {
-        CertificatePaths::ask(this, tr("Choose a CA certificate"), CertificatePaths::Count::One,
-                              [this](const QStringList &paths) { take(paths.first()); });
-    });
+CaFileField::CaFileField(const QString &caption, QWidget *parent)
+    : PathField(caption, tr("Choose a file"), parent), m_reader(new CertificateReader(this)) {
+    say({}, Tone::Quiet);
     connect(m_reader, &CertificateReader::progressed, this, &CaFileField::changed);
+}
+
+void CaFileField::browse() {
+    CertificatePaths::ask(this, tr("Choose a CA certificate"), CertificatePaths::Count::One,
+                          [this](const QStringList &paths) { take(paths.first()); });
 }
 
 void CaFileField::take(const QString &path) {
@@ -74,25 +45,18 @@ bool CaFileField::isReading() const {
 }
 
 void CaFileField::onRead(const CertificateFilePtr &file) {
-    m_name->setText(file->name);
-    m_name->setToolTip(PlainText::toolTip(file->path));
+    showPath(file->path);
     const bool usable = file->error.isEmpty() && file->hasCertificate();
     m_file = usable ? file : nullptr;
     if (!usable)
-        return tell(file->error.isEmpty() ? tr("There is no certificate in the file.") : file->error,
-                    "warning");
+        return say(file->error.isEmpty() ? tr("There is no certificate in the file.") : file->error,
+                   Tone::Warning);
     const QString doubt = doubtAbout(*file);
     const QString details = tr("%1, valid from %2 to %3")
                                 .arg(file->subject, CertificateValidities::dateText(file->validFrom),
                                      CertificateValidities::dateText(file->validUntil));
-    tell(doubt.isEmpty() ? details : tr("%1 %2").arg(doubt, details), doubt.isEmpty() ? "quiet" : "warning");
-}
-
-void CaFileField::tell(const QString &text, const char *role) {
-    m_details->setProperty("role", role);
-    m_details->style()->unpolish(m_details);
-    m_details->style()->polish(m_details);
-    // The line keeps its place while there is nothing to tell.
-    m_details->setText(text.isEmpty() ? QStringLiteral(" ") : text);
-    m_details->setToolTip(PlainText::toolTip(text));
+    if (doubt.isEmpty())
+        say(details, Tone::Quiet);
+    else
+        say(tr("%1 %2").arg(doubt, details), Tone::Warning);
 }

@@ -4,7 +4,6 @@
 #include "certificatereader.h"
 #include "checktable.h"
 #include "icons.h"
-#include "notedelegate.h"
 #include "plaintext.h"
 #include "targetwarninglines.h"
 
@@ -16,8 +15,6 @@
 #include <QLocale>
 #include <QPushButton>
 #include <QToolButton>
-
-#include <nlohmann/json.hpp>
 
 namespace {
 
@@ -88,7 +85,6 @@ QWidget *CertificateBox::buildTable() {
     m_table->setAccessibleName(tr("Devices and their certificates"));
     m_table->showList(m_model, {140, 110, 145, 180, 175, 100}, -1);
     m_table->setSelectionMode(QAbstractItemView::ExtendedSelection);
-    m_table->setItemDelegateForColumn(CertificateModel::NoteColumn, new NoteDelegate(m_table));
     return m_table;
 }
 
@@ -261,28 +257,11 @@ std::vector<int> CertificateBox::selectedItems() const {
     return items;
 }
 
-JSON CertificateBox::deviceIds() const {
-    JSON ids = JSON::array();
+CertificateOrder CertificateBox::order() const {
+    CertificateOrder order;
+    order.entries.reserve(m_ready.size());
     for (const int item : m_ready)
-        ids.push_back(m_model->device(item).id.toStdString());
-    return ids;
-}
-
-JSON CertificateBox::files(CertificateFilePtr CertificatePair::*slot) const {
-    JSON list = JSON::array();
-    for (const int item : m_ready) {
-        const CertificateFilePtr &file = m_model->pair(item).*slot;
-        list.push_back({{"fpath", file->path.toStdString()},
-                        {"fname", file->name.toStdString()},
-                        {"d_mac", m_model->device(item).text(DeviceColumn::Mac).toStdString()}});
-    }
-    return list;
-}
-
-JSON CertificateBox::certificates() const {
-    return files(&CertificatePair::certificate);
-}
-
-JSON CertificateBox::privateKeys() const {
-    return files(&CertificatePair::key);
+        order.entries.push_back(
+            {m_model->targets()[static_cast<std::size_t>(item)].device, m_model->pair(item)});
+    return order;
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "certificatemodel.h"
-#include "json.h"
+#include "certificateorder.h"
 
 #include <QWidget>
 
@@ -38,10 +38,8 @@ public:
     int checkedCount() const { return m_model->checkedCount(); }
     /// How many devices the upload can serve.
     int readyCount() const { return static_cast<int>(m_ready.size()); }
-    /// The ids of those devices, and the lists of their files as the queue of uploads takes them.
-    JSON deviceIds() const;
-    JSON certificates() const;
-    JSON privateKeys() const;
+    /// Those devices with their files.
+    CertificateOrder order() const;
 
 signals:
     /// Other devices can be served now, or files are read.
@@ -62,7 +60,6 @@ private:
     void showState();
     void showSelection();
     std::vector<int> selectedItems() const;
-    JSON files(CertificateFilePtr CertificatePair::*slot) const;
 
     CertificateModel *m_model;
     CertificateReader *m_reader;

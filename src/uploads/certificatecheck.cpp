@@ -1,7 +1,6 @@
 #include "certificatecheck.h"
 
 #include "certificatevalidity.h"
-#include "macnames.h"
 
 #include <QCoreApplication>
 
@@ -16,6 +15,7 @@ using Finding = CertificateFinding;
 using Findings = CertificateFindings;
 
 constexpr const char *context = "CertificateCheck";
+constexpr qsizetype macDigits = 12;
 
 struct Text {
     Finding finding;
@@ -82,6 +82,12 @@ Findings judgeFiles(const CertificatePair &pair, CertificateNeeds needs) {
 
 } // namespace
 
+bool hasAddress(const DeviceRecord &device) {
+    const quint64 mac = device.sortKey(DeviceColumn::Mac);
+    // A shorter text is a number too, but no address.
+    return mac != 0 && mac != DeviceRecord::unknownKey && device.text(DeviceColumn::Mac).size() >= macDigits;
+}
+
 bool needsKey(CertificateNeeds needs) {
     return needs == CertificateNeeds::Pair || needs == CertificateNeeds::SealablePair;
 }
@@ -99,7 +105,7 @@ Findings judge(const CertificatePair &pair, const DeviceRecord &device, Certific
     if (needs == CertificateNeeds::Nothing)
         return {};
     Findings found = judgeFiles(pair, needs);
-    if (MacNames::of(device.text(DeviceColumn::Mac)) == 0)
+    if (!hasAddress(device))
         found |= Finding::NoAddress;
     if (pair.certificate)
         found |= judgeValidity(*pair.certificate, now);

@@ -53,6 +53,8 @@ bool blocks(CertificateFindings findings);
 /// The finding that weighs most, as its number.
 int first(CertificateFindings findings);
 
+/// Whether the name of a file can tell that it is for the device.
+bool hasAddress(const DeviceRecord &device);
 bool needsKey(CertificateNeeds needs);
 
 /// All findings there are, those that block first.

@@ -35,17 +35,20 @@ CertificateModel::CertificateModel(OperationTargets::List targets, QObject *pare
       m_pairs(m_targets.size()),
       m_findings(m_targets.size()),
       m_deviceNotes(m_targets.size()),
-      m_shareMac(m_targets.size()) {
+      m_isNameless(m_targets.size()) {
+    m_byMac.reserve(static_cast<int>(m_targets.size()));
     for (std::size_t item = 0; item < m_targets.size(); ++item) {
-        const quint64 mac = MacNames::of(m_targets[item].device->text(DeviceColumn::Mac));
-        m_shareMac[item] = m_byMac.contains(mac);
-        if (mac != 0 && !m_shareMac[item])
+        const quint64 mac = m_targets[item].device->sortKey(DeviceColumn::Mac);
+        m_isNameless[item] = !CertificateCheck::hasAddress(*m_targets[item].device) || m_byMac.contains(mac);
+        if (!m_isNameless[item])
             m_byMac.insert(mac, static_cast<int>(item));
     }
     setItemCount(static_cast<int>(m_targets.size()), true);
 }
 
 void CertificateModel::setNeeds(CertificateNeeds needs) {
+    if (m_needs == needs)
+        return;
     m_needs = needs;
     judgeAll();
 }
@@ -59,7 +62,7 @@ void CertificateModel::setDeviceWarnings(std::vector<TargetWarning> warnings) {
             note = note.isEmpty() ? warning.note : tr("%1, %2").arg(note, warning.note);
         }
     }
-    judgeAll();
+    tellFiles();
 }
 
 /// The place of the device whose address a name bears; -1 for none, or for more than one.
@@ -154,7 +157,7 @@ QStringList CertificateModel::encryptedKeys() const {
 
 void CertificateModel::judge(std::size_t item, qint64 now) {
     m_findings[item] = CertificateCheck::judge(m_pairs[item], *m_targets[item].device, m_needs, now);
-    if (m_shareMac[item] && m_needs != CertificateNeeds::Nothing)
+    if (m_isNameless[item] && m_needs != CertificateNeeds::Nothing)
         m_findings[item] |= CertificateFinding::NoAddress;
 }
 

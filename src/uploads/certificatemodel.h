@@ -83,6 +83,6 @@ private:
     std::vector<TargetWarning> m_deviceWarnings;
     std::vector<QString> m_deviceNotes;
     QHash<quint64, int> m_byMac;
-    std::vector<bool> m_shareMac; ///< with a device before them
+    std::vector<bool> m_isNameless; ///< without an address of their own that files can bear
     CertificateNeeds m_needs = CertificateNeeds::Nothing;
 };

@@ -6,8 +6,6 @@
 #include <QCoreApplication>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QMimeData>
-#include <QUrl>
 
 namespace CertificatePaths {
 
@@ -41,15 +39,6 @@ void ask(QWidget *parent, const QString &title, Count count,
         chosen(paths);
     });
     dialog->open();
-}
-
-QStringList dragged(const QMimeData *data) {
-    QStringList paths;
-    for (const QUrl &url : data->urls()) {
-        if (url.isLocalFile())
-            paths += url.toLocalFile();
-    }
-    return paths;
 }
 
 } // namespace CertificatePaths

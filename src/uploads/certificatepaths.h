@@ -4,7 +4,6 @@
 
 #include <functional>
 
-class QMimeData;
 class QWidget;
 
 /// The ways in which users point at certificate files.
@@ -16,8 +15,5 @@ enum class Count { One, Many };
 /// user gives it up.
 void ask(QWidget *parent, const QString &title, Count count,
          const std::function<void(const QStringList &paths)> &chosen);
-
-/// The files on this computer among what is dragged.
-QStringList dragged(const QMimeData *data);
 
 } // namespace CertificatePaths

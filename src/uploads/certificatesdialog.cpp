@@ -2,7 +2,7 @@
 
 #include "certificatelistmodel.h"
 #include "icons.h"
-#include "notedelegate.h"
+#include "rowdelegate.h"
 #include "theme.h"
 
 #include <QDateTime>
@@ -79,7 +79,7 @@ QWidget *CertificatesDialog::buildTable() {
     m_table->setObjectName(QStringLiteral("certificateTable"));
     m_table->setAccessibleName(windowTitle());
     m_table->setModel(m_model);
-    m_table->setItemDelegate(new NoteDelegate(m_table));
+    m_table->setItemDelegate(new RowDelegate(m_table));
     m_table->setSelectionBehavior(QAbstractItemView::SelectRows);
     m_table->setSelectionMode(QAbstractItemView::SingleSelection);
     m_table->setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);

@@ -1,7 +1,9 @@
 #include "certificateuploaddialog.h"
 
-#include "certificatepaths.h"
 #include "certificatesdialog.h"
+#include "pathfield.h"
+#include "queueing.h"
+#include "uploadtaskmgr.h"
 
 #include <QComboBox>
 #include <QDragEnterEvent>
@@ -133,20 +135,18 @@ void CertificateUploadDialog::onApply() {
     clearComplaint();
     if (!m_apply->isEnabled() || !areFieldsGood())
         return;
-    if (insert())
-        accept();
-    else
-        m_complaint.setText(tr("The upload could not be started."));
+    Queueing::post<UploadTaskMgr>(this, insertion(),
+                                  [this] { m_complaint.setText(tr("The upload could not be started.")); });
 }
 
 void CertificateUploadDialog::dragEnterEvent(QDragEnterEvent *event) {
-    if (takesFiles() && !CertificatePaths::dragged(event->mimeData()).isEmpty())
+    if (takesFiles() && !PathField::localPaths(*event->mimeData()).isEmpty())
         event->acceptProposedAction();
 }
 
 void CertificateUploadDialog::dropEvent(QDropEvent *event) {
     event->acceptProposedAction();
-    takeDropped(CertificatePaths::dragged(event->mimeData()), event->position().toPoint());
+    takeDropped(PathField::localPaths(*event->mimeData()), event->position().toPoint());
 }
 
 void CertificateUploadDialog::takeDropped(const QStringList &paths, const QPoint &) {

@@ -5,6 +5,7 @@
 #include "warningline.h"
 
 class QComboBox;
+class UploadTaskMgr;
 
 /// What the dialogs that give certificates to devices share: the choice of a method and its fields, below
 /// them the devices with their files, then the buttons. Files can be dropped anywhere on it.
@@ -33,8 +34,8 @@ protected:
     void clearComplaint() { m_complaint.setText({}); }
 
     virtual bool areFieldsGood() = 0;
-    /// Hands the upload over to its queue.
-    virtual bool insert() = 0;
+    /// What hands the upload over to its queue; called on a runner.
+    virtual std::function<bool(UploadTaskMgr &)> insertion() = 0;
     /// Takes files that were dropped at a place of the dialog.
     virtual void takeDropped(const QStringList &paths, const QPoint &place);
     virtual bool takesFiles() const { return m_box->needs() != CertificateNeeds::Nothing; }

@@ -2,23 +2,13 @@
 
 #include "exetaskmgr.h"
 #include "filefield.h"
-#include "localstore.h"
+#include "queueing.h"
 #include "targetbox.h"
 #include "tasktargets.h"
 
 #include <QLabel>
-#include <QStandardPaths>
 
 #include <nlohmann/json.hpp>
-
-namespace {
-
-QString proposedFolder() {
-    const QString last = CLocalStore::instance().defaultFilePath();
-    return last.isEmpty() ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation) : last;
-}
-
-} // namespace
 
 ExportDebugInfoDialog::ExportDebugInfoDialog(OperationTargets::List targets, QWidget *parent)
     : OperationDialog(tr("Export Debug Info"), parent),
@@ -34,19 +24,19 @@ ExportDebugInfoDialog::ExportDebugInfoDialog(OperationTargets::List targets, QWi
     note->setWordWrap(true);
     addPart(note);
     finish(std::move(targets), OperationTargets::Need::Authorization, tr("Export"), "exportButton");
-    connect(m_folder, &FileField::changed, this, &ExportDebugInfoDialog::updateAccept);
-    m_folder->setPath(proposedFolder());
+    connect(m_folder, &PathField::changed, this, &ExportDebugInfoDialog::updateAccept);
     m_folder->setFocus();
 }
 
 bool ExportDebugInfoDialog::isComplete() const {
-    return !m_folder->path().isEmpty();
+    return m_folder->file().isGood();
 }
 
 void ExportDebugInfoDialog::apply() {
-    if (ExeTaskMgr::instance().insertNewExportDebugInfoTask(TaskTargets::ids(targets().tickedIds()),
-                                                            m_folder->path()))
-        accept();
-    else
-        setComplaint(tr("The export could not be started."));
+    Queueing::post<ExeTaskMgr>(
+        this,
+        [folder = m_folder->file().path, ids = targets().tickedIds()](ExeTaskMgr &queue) {
+            return queue.insertNewExportDebugInfoTask(TaskTargets::ids(ids), folder);
+        },
+        [this] { setComplaint(tr("The export could not be started.")); });
 }

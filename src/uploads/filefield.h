@@ -1,25 +1,23 @@
 #pragma once
 
 #include "filecheck.h"
-
-#include <QWidget>
+#include "netjob.h"
+#include "pathfield.h"
 
 #include <functional>
 
-class QLabel;
-class QLineEdit;
-class QMimeData;
-class QPushButton;
-
-/// A field for a file or a folder of this computer, which is chosen from a file dialog or dropped. What is
-/// chosen is looked at beside the user-interface thread; the line below tells what was found.
-class FileField : public QWidget {
+/// A field for a file that is to be sent or a folder that files are to be put into, which is chosen from a
+/// file dialog or dropped. What is chosen is looked at beside the user-interface thread. A folder field
+/// begins with the folder that was used last.
+class FileField : public PathField {
     Q_OBJECT
 
 public:
     enum class Kind { File, Folder };
     /// Asks the user for a path and calls the function with it, or never.
     using AskPath = std::function<void(const std::function<void(const QString &path)> &chosen)>;
+    /// What is wrong with a good file all the same, as a sentence; empty for nothing.
+    using Judge = std::function<QString(const FileCheck &file)>;
 
     struct Texts {
         QString caption; ///< above the field
@@ -33,33 +31,29 @@ public:
     void acceptDropsOn(QWidget *area);
     /// Replaces the file dialog.
     void setAskPath(AskPath ask) { m_askPath = std::move(ask); }
+    void setJudge(Judge judge) { m_judge = std::move(judge); }
 
     void setPath(const QString &path);
-    /// What was chosen and found to be good; empty as long as there is no such thing.
-    QString path() const { return m_good ? m_path : QString(); }
-    QString fileName() const;
-
-signals:
-    /// Another path is good, or none any more.
-    void changed();
+    /// What was found; its path is empty while nothing is chosen or the look at it goes on.
+    const FileCheck &file() const { return m_file; }
+    bool isChecking() const { return m_isChecking; }
 
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
+    void browse() override;
 
 private:
-    enum class Tone { Quiet, Warning };
-
-    void browse(const QString &title);
+    void readLastFolder();
     void drop(const QMimeData &dropped);
-    void setDropping(bool on);
-    void onChecked(const FileCheck &check);
-    void say(const QString &text, Tone tone);
+    void onChecked(FileCheck found);
+    void onCheckEnded(int choice, const QString &path, JobEnd end);
 
     Kind m_kind;
-    QLineEdit *m_edit;
-    QPushButton *m_browse;
-    QLabel *m_state;
+    QString m_title;
+    QString m_lastFolder;
     AskPath m_askPath;
-    QString m_path;
-    bool m_good = false;
+    Judge m_judge;
+    FileCheck m_file;
+    bool m_isChecking = false;
+    int m_choice = 0; ///< counts what was chosen, so that a late look at an earlier path is dropped
 };

@@ -1,6 +1,5 @@
 #include "firmwareupload.h"
 
-#include "json.h"
 #include "uploadtaskmgr.h"
 
 #include <QRandomGenerator>
@@ -21,12 +20,9 @@ QString newId() {
     return QStringLiteral("FW%1").arg(number, 12, 16, QLatin1Char('0')).toUpper();
 }
 
-bool insert(const UploadFile &image, const QStringList &deviceIds, const QString &fwid,
-            const QString &actionTime, QString *ctid) {
-    JSON ids = JSON::array();
-    for (const QString &id : deviceIds)
-        ids.push_back(id.toStdString());
-    return UploadTaskMgr::instance().insertNewFWUploadTask(mode, image.path, image.name, ids, fwid,
+bool insert(const FileCheck &image, const JSON &deviceIds, const QString &fwid, const QString &actionTime,
+            QString *ctid) {
+    return UploadTaskMgr::instance().insertNewFWUploadTask(mode, image.path, image.name, deviceIds, fwid,
                                                            actionTime, ctid);
 }
 

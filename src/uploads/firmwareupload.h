@@ -1,8 +1,8 @@
 #pragma once
 
-#include "uploadfile.h"
+#include "filecheck.h"
 
-#include <QStringList>
+#include "json.h"
 
 /// Firmware on its way into the queue of uploads.
 namespace FirmwareUpload {
@@ -13,7 +13,7 @@ QString newId();
 
 /// Inserts an upload. actionTime: Unix ms as text, empty for now. False, with the reason in the log, where it
 /// was refused.
-bool insert(const UploadFile &image, const QStringList &deviceIds, const QString &fwid,
-            const QString &actionTime, QString *ctid = nullptr);
+bool insert(const FileCheck &image, const JSON &deviceIds, const QString &fwid, const QString &actionTime,
+            QString *ctid = nullptr);
 
 } // namespace FirmwareUpload

@@ -42,11 +42,4 @@ std::vector<quint64> in(const QString &text) {
     return found;
 }
 
-quint64 of(const QString &text) {
-    const QString trimmed = text.trimmed();
-    qsizetype at = 0;
-    const quint64 address = readFrom(trimmed, at);
-    return at == trimmed.size() ? address : 0;
-}
-
 } // namespace MacNames

@@ -11,7 +11,4 @@ namespace MacNames {
 /// with at most one other character between two of them. Several for a longer row of digits.
 std::vector<quint64> in(const QString &text);
 
-/// The address that a text is as a whole; 0 for any other text.
-quint64 of(const QString &text);
-
 } // namespace MacNames

@@ -6,33 +6,66 @@ namespace ModelGroups {
 
 namespace {
 
-QStringList versionsOf(const std::vector<int> &members, const OperationTargets::List &targets) {
-    QHash<QString, int> counts;
-    for (const int each : members)
-        ++counts[targets[static_cast<std::size_t>(each)].device->text(DeviceColumn::Firmware)];
-    QStringList versions = counts.keys();
+/// Gives every text the place at which it was met first.
+class Places {
+public:
+    explicit Places(QStringList &texts) : m_texts(texts) {}
+
+    int of(const QString &text) {
+        const auto found = m_places.constFind(text);
+        if (found != m_places.constEnd())
+            return *found;
+        m_texts += text;
+        return *m_places.insert(text, static_cast<int>(m_texts.size()) - 1);
+    }
+
+private:
+    QStringList &m_texts;
+    QHash<QString, int> m_places;
+};
+
+QStringList versionsOf(const Index &index, const std::vector<int> &targets, const ModelGroup &group) {
+    std::vector<int> counts(static_cast<std::size_t>(index.versions.size()));
+    QStringList versions;
+    for (const int member : group.targets) {
+        const int version =
+            index.versionOf[static_cast<std::size_t>(targets[static_cast<std::size_t>(member)])];
+        if (counts[static_cast<std::size_t>(version)]++ == 0)
+            versions += index.versions[version];
+    }
+    const auto countOf = [&](const QString &version) {
+        return counts[static_cast<std::size_t>(index.versions.indexOf(version))];
+    };
     std::sort(versions.begin(), versions.end(), [&](const QString &a, const QString &b) {
-        return counts[a] != counts[b] ? counts[a] > counts[b] : a < b;
+        return countOf(a) != countOf(b) ? countOf(a) > countOf(b) : a < b;
     });
     return versions;
 }
 
 } // namespace
 
-std::vector<ModelGroup> of(const OperationTargets::List &targets) {
-    std::vector<ModelGroup> groups;
-    QHash<QString, std::size_t> places;
-    for (std::size_t i = 0; i < targets.size(); ++i) {
-        const QString &model = targets[i].device->text(DeviceColumn::Model);
-        const std::size_t place = places.value(model, groups.size());
-        if (place == groups.size()) {
-            places.insert(model, place);
-            groups.push_back({model, {}, {}});
-        }
-        groups[place].targets.push_back(static_cast<int>(i));
+Index indexOf(const OperationTargets::List &targets) {
+    Index index;
+    Places models(index.models);
+    Places versions(index.versions);
+    for (const OperationTarget &target : targets) {
+        index.modelOf.push_back(models.of(target.device->text(DeviceColumn::Model)));
+        index.versionOf.push_back(versions.of(target.device->text(DeviceColumn::Firmware)));
     }
-    for (ModelGroup &group : groups)
-        group.versions = versionsOf(group.targets, targets);
+    return index;
+}
+
+std::vector<ModelGroup> of(const Index &index, const std::vector<int> &targets) {
+    std::vector<ModelGroup> groups(static_cast<std::size_t>(index.models.size()));
+    for (std::size_t i = 0; i < targets.size(); ++i) {
+        const int model = index.modelOf[static_cast<std::size_t>(targets[i])];
+        groups[static_cast<std::size_t>(model)].targets.push_back(static_cast<int>(i));
+    }
+    for (std::size_t i = 0; i < groups.size(); ++i) {
+        groups[i].model = index.models[static_cast<int>(i)];
+        groups[i].versions = versionsOf(index, targets, groups[i]);
+    }
+    std::erase_if(groups, [](const ModelGroup &group) { return group.targets.empty(); });
     std::stable_sort(groups.begin(), groups.end(), [](const ModelGroup &a, const ModelGroup &b) {
         return a.targets.size() > b.targets.size();
     });

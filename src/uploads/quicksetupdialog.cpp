@@ -1,6 +1,7 @@
 #include "quicksetupdialog.h"
 
 #include "exetaskmgr.h"
+#include "queueing.h"
 #include "targetbox.h"
 #include "tasktargets.h"
 #include "timesyncfields.h"
@@ -190,9 +191,9 @@ void QuickSetupDialog::apply() {
     }
     if (m_time->isChecked() && complain(m_timeFields->complain()))
         return;
-    if (ExeTaskMgr::instance().insertNewQuickSetupTask(TaskTargets::ids(targets().tickedIds()),
-                                                       settings(QDateTime::currentDateTimeUtc())))
-        accept();
-    else
-        setComplaint(tr("The setup could not be started."));
+    Queueing::post<ExeTaskMgr>(
+        this,
+        [settings = settings(QDateTime::currentDateTimeUtc()), ids = targets().tickedIds()](
+            ExeTaskMgr &queue) { return queue.insertNewQuickSetupTask(TaskTargets::ids(ids), settings); },
+        [this] { setComplaint(tr("The setup could not be started.")); });
 }

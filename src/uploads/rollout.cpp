@@ -4,19 +4,24 @@
 
 #include <QSet>
 
+#include <algorithm>
 #include <utility>
 
 namespace {
 
 constexpr qint64 minuteMs = 60 * 1000;
 
+bool isServed(const TaskDevice &device) {
+    return TaskState::isFinal(device.state) && !TaskState::isFailure(device.state) &&
+           device.state != TaskState::aborted;
+}
+
 /// The devices of a wave that its task has not served.
 QStringList notDone(const Rollout::Wave &wave, const TaskRecord *task) {
     QSet<QString> done;
     if (task) {
         for (const TaskDevice &device : task->devices) {
-            if (TaskState::isFinal(device.state) && !TaskState::isFailure(device.state) &&
-                device.state != TaskState::aborted)
+            if (isServed(device))
                 done.insert(device.target->id);
         }
     }
@@ -87,8 +92,9 @@ void Rollout::onHandOverFailed(const QString &ctid, const QString &reason) {
 void Rollout::follow() {
     const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
     const TaskRecordPtr task = m_surroundings.tasks()->find(m_progress.wave.tid);
-    if (task)
+    if (task && task != m_counted)
         count(*task);
+    m_counted = task;
     if (!isUploading)
         return;
     if (task && task->isFinal())
@@ -99,7 +105,8 @@ void Rollout::follow() {
 
 void Rollout::count(const TaskRecord &task) {
     Wave &wave = m_progress.wave;
-    const int done = wave.total() - static_cast<int>(notDone(wave, &task).size());
+    const auto served = std::count_if(task.devices.begin(), task.devices.end(), &isServed);
+    const int done = std::min(static_cast<int>(served), wave.total());
     // What a task that is over has left out will not come any more.
     const bool isOver = task.isFinal() && task.status != TaskState::aborted;
     const int failed = isOver ? wave.total() - done : std::min(task.failedDevices, wave.total() - done);

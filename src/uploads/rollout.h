@@ -106,4 +106,5 @@ private:
     RolloutPlanPtr m_plan;
     Surroundings m_surroundings;
     Progress m_progress;
+    TaskRecordPtr m_counted; ///< what the figures were taken from
 };

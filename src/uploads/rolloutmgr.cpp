@@ -5,11 +5,14 @@
 #include "netjob.h"
 #include "storewriter.h"
 #include "taskinfopool.h"
+#include "tasktargets.h"
 #include "uploadtaskmgr.h"
 
 #include <QCryptographicHash>
 #include <QDateTime>
 #include <QDebug>
+
+#include <nlohmann/json.hpp>
 
 #include <algorithm>
 
@@ -74,17 +77,20 @@ Rollout *RolloutMgr::add(RolloutPlanPtr plan) {
 
 /// Between the waves somebody may have put another image in the place of the first one.
 void RolloutMgr::upload(Rollout &rollout, const QStringList &deviceIds, const QString &actionTime) {
-    const UploadFile &image = rollout.plan().image;
+    const FileCheck &image = rollout.plan().image;
     NetJob::post(
         NetJob::createRunner("checking a firmware image", NetTask::Turn::Beside), &rollout,
-        [path = image.path] { return UploadFile::inspect(path); },
-        [&rollout, deviceIds, actionTime](const UploadFile &found) {
+        [path = image.path, deviceIds] {
+            return std::make_pair(FileCheck::ofFile(path), TaskTargets::ids(deviceIds));
+        },
+        [&rollout, actionTime](const std::pair<FileCheck, JSON> &prepared) {
+            const auto &[found, ids] = prepared;
             if (!found.isGood())
                 rollout.onNotBegun(found.problem);
             else if (!found.isSame(rollout.plan().image))
                 rollout.onNotBegun(tr("The image has changed since the rollout began."));
             else
-                insert(rollout, deviceIds, actionTime);
+                insert(rollout, ids, actionTime);
         },
         [&rollout](JobEnd end) {
             if (end != JobEnd::Delivered)
@@ -92,12 +98,13 @@ void RolloutMgr::upload(Rollout &rollout, const QStringList &deviceIds, const QS
         });
 }
 
-void RolloutMgr::insert(Rollout &rollout, const QStringList &deviceIds, const QString &actionTime) {
+void RolloutMgr::insert(Rollout &rollout, const JSON &deviceIds, const QString &actionTime) {
     QString ctid;
-    if (FirmwareUpload::insert(rollout.plan().image, deviceIds, rollout.plan().fwid, actionTime, &ctid))
-        rollout.onQueued(ctid);
-    else
-        rollout.onNotBegun(tr("The upload could not be started."));
+    if (!FirmwareUpload::insert(rollout.plan().image, deviceIds, rollout.plan().fwid, actionTime, &ctid))
+        return rollout.onNotBegun(tr("The upload could not be started."));
+    // The rollout offers to go on with it; begun again elsewhere, it would be sent twice.
+    UploadTaskMgr::instance().setFollowed(ctid, true);
+    rollout.onQueued(ctid);
 }
 
 std::vector<Rollout *> RolloutMgr::rollouts() const {
@@ -117,6 +124,7 @@ void RolloutMgr::dismiss(Rollout *rollout) {
                                     [rollout](const auto &each) { return each.get() == rollout; });
     if (found == m_rollouts.end())
         return;
+    UploadTaskMgr::instance().setFollowed(rollout->progress().wave.ctid, false);
     m_rollouts.erase(found);
     keep();
     emit changed();

@@ -36,7 +36,7 @@ private:
 
     Rollout *add(RolloutPlanPtr plan);
     static void upload(Rollout &rollout, const QStringList &deviceIds, const QString &actionTime);
-    static void insert(Rollout &rollout, const QStringList &deviceIds, const QString &actionTime);
+    static void insert(Rollout &rollout, const JSON &deviceIds, const QString &actionTime);
     void advanceAll();
     void onTaskListUpdated();
     void onSessionEnded();

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "uploadfile.h"
+#include "filecheck.h"
 
 #include <QStringList>
 
@@ -8,7 +8,7 @@
 
 /// What a rollout is to do. Never changed once it has begun, so threads share it freely.
 struct RolloutPlan {
-    UploadFile image;
+    FileCheck image;
     QString fwid;
     QString actionTime;        ///< of the first wave: Unix ms as text, empty for now
     QStringList deviceIds;     ///< those of the first wave in front

@@ -1,6 +1,6 @@
 #include "rolloutrecords.h"
 
-#include "json.h"
+#include "tasktargets.h"
 
 #include <QDebug>
 
@@ -11,13 +11,6 @@
 namespace RolloutRecords {
 
 namespace {
-
-JSON idList(const QStringList &ids) {
-    JSON list = JSON::array();
-    for (const QString &id : ids)
-        list.push_back(id.toStdString());
-    return list;
-}
 
 QStringList idsIn(const JSON &object, const char *name) {
     QStringList ids;
@@ -33,7 +26,7 @@ JSON planJson(const RolloutPlan &plan) {
             {"changed_at", plan.image.changedAt},
             {"fwid", plan.fwid.toStdString()},
             {"actm", plan.actionTime.toStdString()},
-            {"devices", idList(plan.deviceIds)},
+            {"devices", TaskTargets::ids(plan.deviceIds)},
             {"first", plan.firstCount},
             {"wait", plan.waitMinutes},
             {"most_failed", plan.mostFailedPercent}};
@@ -55,7 +48,7 @@ RolloutPlan planOf(const JSON &object) {
 }
 
 JSON waveJson(const Rollout::Wave &wave) {
-    return {{"devices", idList(wave.deviceIds)},
+    return {{"devices", TaskTargets::ids(wave.deviceIds)},
             {"tid", wave.tid.toStdString()},
             {"seen", wave.isSeen},
             {"scheduled_at", wave.scheduledAt},

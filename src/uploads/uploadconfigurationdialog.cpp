@@ -1,6 +1,7 @@
 #include "uploadconfigurationdialog.h"
 
 #include "filefield.h"
+#include "queueing.h"
 #include "targetbox.h"
 #include "tasktargets.h"
 #include "uploadtaskmgr.h"
@@ -18,19 +19,20 @@ UploadConfigurationDialog::UploadConfigurationDialog(OperationTargets::List targ
     m_file->acceptDropsOn(this);
     addPart(m_file);
     finish(std::move(targets), OperationTargets::Need::Authorization, tr("Upload"), "uploadButton");
-    connect(m_file, &FileField::changed, this, &UploadConfigurationDialog::updateAccept);
+    connect(m_file, &PathField::changed, this, &UploadConfigurationDialog::updateAccept);
     m_file->setFocus();
 }
 
 bool UploadConfigurationDialog::isComplete() const {
-    return !m_file->path().isEmpty();
+    return m_file->file().isGood();
 }
 
 void UploadConfigurationDialog::apply() {
-    if (UploadTaskMgr::instance().insertNewConfigFileUploadTask(QStringLiteral("manual"), m_file->fileName(),
-                                                                m_file->path(),
-                                                                TaskTargets::ids(targets().tickedIds())))
-        accept();
-    else
-        setComplaint(tr("The upload could not be started."));
+    Queueing::post<UploadTaskMgr>(
+        this,
+        [file = m_file->file(), ids = targets().tickedIds()](UploadTaskMgr &queue) {
+            return queue.insertNewConfigFileUploadTask(QStringLiteral("manual"), file.name, file.path,
+                                                       TaskTargets::ids(ids));
+        },
+        [this] { setComplaint(tr("The upload could not be started.")); });
 }

@@ -2,9 +2,11 @@
 
 #include "checktable.h"
 #include "credentialfields.h"
+#include "filefield.h"
 #include "firmwarehistory.h"
 #include "firmwareupload.h"
 #include "modelgroupmodel.h"
+#include "queueing.h"
 #include "rolloutfields.h"
 #include "rolloutmgr.h"
 #include "schedulefield.h"
@@ -12,8 +14,9 @@
 #include "storewriter.h"
 #include "targetbox.h"
 #include "taskinfopool.h"
+#include "tasktargets.h"
 #include "theme.h"
-#include "uploadfilefield.h"
+#include "uploadtaskmgr.h"
 
 #include <QCheckBox>
 #include <QHeaderView>
@@ -24,6 +27,7 @@
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
+#include <numeric>
 
 namespace {
 
@@ -49,14 +53,16 @@ int uploadLimitOf(const JSON &settings) {
 struct UploadFirmwareDialog::Start {
     bool isScheduled = false;
     bool onlyFailed = false;
-    QString folder;
-    QSet<QString> failed;
+    std::vector<bool> hasFailed; ///< the last upload, by target
+    ModelGroups::Index models;
 };
 
 UploadFirmwareDialog::UploadFirmwareDialog(OperationTargets::List targets, QWidget *parent)
     : OperationDialog(tr("Upload Firmware"), parent),
       m_all(std::make_shared<const OperationTargets::List>(std::move(targets))),
-      m_file(new UploadFileField(body())),
+      m_file(new FileField(FileField::Kind::File,
+                           {tr("Firmware file"), tr("Open Firmware Image"), tr("One file of up to 4 GiB.")},
+                           body())),
       m_table(new CheckTable(body())),
       m_groups(new ModelGroupModel(this)),
       m_schedule(new ScheduleField(body())),
@@ -65,7 +71,7 @@ UploadFirmwareDialog::UploadFirmwareDialog(OperationTargets::List targets, QWidg
     setObjectName(QStringLiteral("UploadFirmwareDialog"));
     content()->setFixedWidth(contentWidth);
     buildFile();
-    buildDevices(*m_all);
+    buildDevices();
     buildTimes();
     finish(tr("Upload"), "uploadButton");
     connect(&std::as_const(*this).targets(), &TargetBox::tickedChanged, this,
@@ -79,26 +85,29 @@ UploadFirmwareDialog::UploadFirmwareDialog(OperationTargets::List targets, QWidg
 UploadFirmwareDialog::~UploadFirmwareDialog() = default;
 
 void UploadFirmwareDialog::buildFile() {
-    m_file->setFileDialog(tr("Open Firmware Image"), tr("All Files(*)"),
-                          tr("Choose an image, or drop it here"));
     m_file->acceptDropsOn(this);
-    m_fileWarning = addField(tr("Firmware file"), m_file, "fileWarningLabel");
-    connect(m_file, &UploadFileField::changed, this, &UploadFirmwareDialog::onFileChanged);
-    connect(m_file, &UploadFileField::dropRefused, this,
-            [this](const QString &reason) { CredentialFields::tell(m_fileWarning, reason); });
+    m_file->setJudge([](const FileCheck &file) {
+        return FirmwareHead::parse(file.head).kind == FirmwareHead::Kind::Broken
+                   ? tr("The first line of this image is damaged; every device would refuse it.")
+                   : QString();
+    });
+    addPart(m_file);
+    connect(m_file, &PathField::changed, this, &UploadFirmwareDialog::onFileChanged);
 }
 
-void UploadFirmwareDialog::buildDevices(OperationTargets::List targets) {
+void UploadFirmwareDialog::buildDevices() {
     m_table->setObjectName(QStringLiteral("modelTable"));
     m_table->setAccessibleName(tr("Models of the devices"));
-    m_groups->setGroups(ModelGroups::of(targets));
+    m_shown.resize(m_all->size());
+    std::iota(m_shown.begin(), m_shown.end(), 0);
+    m_isUnticked.resize(m_all->size());
     m_table->showList(m_groups, {190, 100, 170}, -1);
     addPart(m_table);
     m_empty = label(tr("The last upload failed on none of the devices."), "quiet");
     m_empty->setObjectName(QStringLiteral("noDevicesLabel"));
     m_empty->hide();
     addPart(m_empty);
-    addTargets(std::move(targets), OperationTargets::Need::Authorization);
+    addTargets(*m_all, OperationTargets::Need::Authorization);
     connect(m_groups, &ModelGroupModel::groupToggled, this, &UploadFirmwareDialog::onGroupToggled);
     fitTable();
 }
@@ -125,19 +134,24 @@ void UploadFirmwareDialog::readStart() {
             QSet<QString> ids;
             for (const OperationTarget &target : *all)
                 ids.insert(target.device->id);
+            const QSet<QString> failed = FirmwareHistory::lastFailed(*tasks, ids);
+            std::vector<bool> hasFailed;
+            for (const OperationTarget &target : *all)
+                hasFailed.push_back(failed.contains(target.device->id));
             const CLocalStore &store = CLocalStore::instance();
-            return Start{store.isFWUploadScheduleOn(), store.isFwUploadOnlyApplyFail(),
-                         store.defaultFilePath(), FirmwareHistory::lastFailed(*tasks, ids)};
+            return std::make_shared<const Start>(Start{store.isFWUploadScheduleOn(),
+                                                       store.isFwUploadOnlyApplyFail(), std::move(hasFailed),
+                                                       ModelGroups::indexOf(*all)});
         },
-        [this](const Start &start) { onStartRead(start); });
+        [this](std::shared_ptr<const Start> start) { onStartRead(std::move(start)); });
 }
 
-void UploadFirmwareDialog::onStartRead(const Start &start) {
-    m_failed = start.failed;
-    m_file->setFolder(start.folder);
-    m_schedule->setScheduled(start.isScheduled || m_schedule->isScheduled());
+void UploadFirmwareDialog::onStartRead(std::shared_ptr<const Start> start) {
+    m_start = std::move(start);
+    showGroups();
+    m_schedule->setScheduled(m_start->isScheduled || m_schedule->isScheduled());
     m_onlyFailed->setEnabled(true);
-    m_onlyFailed->setChecked(start.onlyFailed);
+    m_onlyFailed->setChecked(m_start->onlyFailed);
 }
 
 void UploadFirmwareDialog::readUploadLimit() {
@@ -153,12 +167,7 @@ void UploadFirmwareDialog::readUploadLimit() {
 }
 
 void UploadFirmwareDialog::onFileChanged() {
-    const UploadFile &file = m_file->file();
-    m_head = FirmwareHead::parse(file.head);
-    QString problem = file.problem;
-    if (problem.isEmpty() && m_head.kind == FirmwareHead::Kind::Broken)
-        problem = tr("The first line of this image is damaged; every device would refuse it.");
-    CredentialFields::tell(m_fileWarning, problem);
+    m_head = FirmwareHead::parse(m_file->file().head);
     if (!m_file->isChecking())
         showImage();
     updateAccept();
@@ -201,50 +210,56 @@ void UploadFirmwareDialog::showMisfits() {
 
 void UploadFirmwareDialog::onOnlyFailedToggled() {
     noteUnticked();
-    OperationTargets::List shown;
-    for (const OperationTarget &target : *m_all) {
-        if (!m_onlyFailed->isChecked() || m_failed->contains(target.device->id))
-            shown.push_back(target);
+    m_shown.clear();
+    for (std::size_t place = 0; place < m_all->size(); ++place) {
+        if (!m_onlyFailed->isChecked() || m_start->hasFailed[place])
+            m_shown.push_back(static_cast<int>(place));
     }
-    showTargets(std::move(shown));
+    showTargets();
 }
 
 /// What the user has left out of those that are shown; what the image has kept out does not count.
 void UploadFirmwareDialog::noteUnticked() {
-    const OperationTargets::List &shown = targets().targets();
-    std::vector<bool> isWanted(shown.size());
-    for (const int each : targets().ticked())
-        isWanted[static_cast<std::size_t>(each)] = true;
-    for (const int each : m_leftOut)
-        isWanted[static_cast<std::size_t>(each)] = true;
-    for (std::size_t i = 0; i < shown.size(); ++i) {
-        if (!isWanted[i])
-            m_unticked.insert(shown[i].device->id);
-        else if (!m_unticked.isEmpty())
-            m_unticked.remove(shown[i].device->id);
+    for (const int place : m_shown)
+        m_isUnticked[static_cast<std::size_t>(place)] = true;
+    const std::vector<int> ticked = targets().ticked();
+    for (const std::vector<int> *wanted : {&ticked, &std::as_const(m_leftOut)}) {
+        for (const int each : *wanted)
+            m_isUnticked[static_cast<std::size_t>(m_shown[static_cast<std::size_t>(each)])] = false;
     }
 }
 
-void UploadFirmwareDialog::showTargets(OperationTargets::List shown) {
+void UploadFirmwareDialog::showTargets() {
+    OperationTargets::List shown;
+    shown.reserve(m_shown.size());
     std::vector<int> unticked;
-    for (std::size_t i = 0; i < shown.size(); ++i) {
-        if (m_unticked.contains(shown[i].device->id))
+    for (std::size_t i = 0; i < m_shown.size(); ++i) {
+        const auto place = static_cast<std::size_t>(m_shown[i]);
+        shown.push_back((*m_all)[place]);
+        if (m_isUnticked[place])
             unticked.push_back(static_cast<int>(i));
     }
     m_leftOut.clear();
-    m_groups->setGroups(ModelGroups::of(shown));
+    m_groups->setGroups({});
     replaceTargets(std::move(shown));
     targets().setTicked(unticked, false);
+    showGroups();
+}
+
+void UploadFirmwareDialog::showGroups() {
+    m_groups->setGroups(ModelGroups::of(m_start->models, m_shown));
     showImage();
+    onTicked();
     fitTable();
 }
 
 /// As many rows as there are models, as long as the dialog fits the smallest window.
 void UploadFirmwareDialog::fitTable() {
+    const bool isEmpty = m_start && m_groups->rowCount() == 0;
     const int rows = std::clamp(m_groups->rowCount(), fewestRows, mostRows);
     m_table->setFixedHeight(m_table->horizontalHeader()->height() + rows * Theme::rowHeight + 2);
-    m_table->setVisible(m_groups->rowCount() > 0);
-    m_empty->setVisible(m_groups->rowCount() == 0);
+    m_table->setVisible(!isEmpty);
+    m_empty->setVisible(isEmpty);
 }
 
 void UploadFirmwareDialog::onGroupToggled(int group, bool checked) {
@@ -263,8 +278,7 @@ void UploadFirmwareDialog::onTicked() {
 }
 
 bool UploadFirmwareDialog::isComplete() const {
-    return m_file->file().isGood() && !m_file->isChecking() && m_head.kind != FirmwareHead::Kind::Broken &&
-           m_schedule->problem().isEmpty();
+    return m_file->file().isGood() && m_schedule->problem().isEmpty();
 }
 
 void UploadFirmwareDialog::showAction() {
@@ -305,24 +319,27 @@ void UploadFirmwareDialog::keepChoices() const {
     });
 }
 
-bool UploadFirmwareDialog::startUpload() {
+void UploadFirmwareDialog::startUpload() {
     const qint64 time = m_schedule->time();
     const QString actionTime = time > 0 ? QString::number(time) : QString();
     if (!m_waves->isInWaves())
-        return FirmwareUpload::insert(m_file->file(), targets().tickedIds(), FirmwareUpload::newId(),
-                                      actionTime);
+        return Queueing::post<UploadTaskMgr>(
+            this,
+            [file = m_file->file(), ids = targets().tickedIds(), actionTime](UploadTaskMgr &) {
+                return FirmwareUpload::insert(file, TaskTargets::ids(ids), FirmwareUpload::newId(),
+                                              actionTime);
+            },
+            [this] { setComplaint(tr("The upload could not be started.")); });
     RolloutMgr::instance().start({m_file->file(), FirmwareUpload::newId(), actionTime, orderedIds(),
                                   m_waves->firstCount(), m_waves->waitMinutes(),
                                   m_waves->mostFailedPercent()});
-    return true;
+    accept();
 }
 
 void UploadFirmwareDialog::apply() {
     // It may have passed since it was chosen.
     if (!CredentialFields::tell(m_scheduleWarning, m_schedule->problem()))
         return m_schedule->setFocus();
-    if (!startUpload())
-        return setComplaint(tr("The upload could not be started."));
     keepChoices();
-    accept();
+    startUpload();
 }

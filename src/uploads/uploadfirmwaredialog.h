@@ -3,17 +3,15 @@
 #include "firmwarehead.h"
 #include "operationdialog.h"
 
-#include <QSet>
-
 #include <memory>
-#include <optional>
+#include <vector>
 
 class CheckTable;
 class ModelGroupModel;
 class QCheckBox;
 class RolloutFields;
 class ScheduleField;
-class UploadFileField;
+class FileField;
 
 /// Asks which firmware image devices are to get, when, and whether all of them at once, and puts the upload
 /// into the queue.
@@ -33,18 +31,19 @@ private:
     struct Start;
 
     void buildFile();
-    void buildDevices(OperationTargets::List targets);
+    void buildDevices();
     void buildTimes();
     void readStart();
     void readUploadLimit();
-    void onStartRead(const Start &start);
+    void onStartRead(std::shared_ptr<const Start> start);
 
     void onFileChanged();
     void onOnlyFailedToggled();
     void noteUnticked();
     void onTicked();
     void onGroupToggled(int group, bool checked);
-    void showTargets(OperationTargets::List targets);
+    void showTargets();
+    void showGroups();
     void showImage();
     void showMisfits();
     void fitTable();
@@ -53,16 +52,16 @@ private:
     std::vector<int> misfits() const;
     QStringList orderedIds() const;
     void keepChoices() const;
-    bool startUpload();
+    void startUpload();
 
     /// Those that the dialog was opened for; never changed, for a runner reads them too.
     const std::shared_ptr<const OperationTargets::List> m_all;
-    QSet<QString> m_unticked;              ///< while they are not among those that are shown
-    std::optional<QSet<QString>> m_failed; ///< devices whose last upload failed, once that is known
+    std::vector<int> m_shown;       ///< places of those that are shown among all
+    std::vector<bool> m_isUnticked; ///< of all, as they were when they were last shown
+    std::shared_ptr<const Start> m_start;
     FirmwareHead m_head;
     std::vector<int> m_leftOut; ///< what was unticked because the image does not fit
-    UploadFileField *m_file;
-    QLabel *m_fileWarning = nullptr;
+    FileField *m_file;
     CheckTable *m_table;
     ModelGroupModel *m_groups;
     QLabel *m_empty = nullptr;

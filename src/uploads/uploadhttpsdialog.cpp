@@ -133,18 +133,18 @@ bool UploadHttpsDialog::areFieldsGood() {
     return problem.isEmpty() || complain(wrong, problem);
 }
 
-bool UploadHttpsDialog::insert() {
-    UploadTaskMgr &queue = UploadTaskMgr::instance();
-    const QString mode = m_mode->currentData().toString();
-    const int port = m_port->value();
-    if (method() == Method::Install)
-        return queue.insertNewHttpsCertInstallTask(mode, port, box()->certificates(), box()->deviceIds());
-    if (method() == Method::Pair)
-        return queue.insertNewHttpsCertPKeysTask(mode, port, box()->certificates(), box()->privateKeys(),
-                                                 box()->deviceIds());
+std::function<bool(UploadTaskMgr &)> UploadHttpsDialog::insertion() {
     SelfSignedCert cert;
-    cert.mode = mode;
-    cert.httpsPort = port;
+    cert.mode = m_mode->currentData().toString();
+    cert.httpsPort = m_port->value();
     m_selfSigned->fill(cert);
-    return queue.insertNewHttpsSelfSignedCertTask(cert, box()->deviceIds());
+    return [method = method(), cert, order = box()->order()](UploadTaskMgr &queue) {
+        if (method == Method::Install)
+            return queue.insertNewHttpsCertInstallTask(cert.mode, cert.httpsPort, order.certificates(),
+                                                       order.deviceIds());
+        if (method == Method::Pair)
+            return queue.insertNewHttpsCertPKeysTask(cert.mode, cert.httpsPort, order.certificates(),
+                                                     order.privateKeys(), order.deviceIds());
+        return queue.insertNewHttpsSelfSignedCertTask(cert, order.deviceIds());
+    };
 }

@@ -22,7 +22,7 @@ public:
 
 protected:
     bool areFieldsGood() override;
-    bool insert() override;
+    std::function<bool(UploadTaskMgr &)> insertion() override;
 
 private:
     QWidget *buildFields();

@@ -38,7 +38,7 @@ UploadIeeeDialog::UploadIeeeDialog(OperationTargets::List targets, DeviceSnapsho
       m_identity(new QLineEdit(body())),
       m_password(makePassword("passEdit", body())),
       m_keyPassword(makePassword("keyPassEdit", body())),
-      m_ca(new CaFileField(body())),
+      m_ca(new CaFileField(tr("CA Certificate"), body())),
       m_typed(new QTimer(this)) {
     setObjectName(QStringLiteral("UploadIeeeDialog"));
     m_method->setObjectName(QStringLiteral("methodComboBox"));
@@ -52,7 +52,7 @@ UploadIeeeDialog::UploadIeeeDialog(OperationTargets::List targets, DeviceSnapsho
     box()->setDeviceWarnings(
         OperationTargets::warnings(box()->targets(), OperationTargets::Need::Authorization));
     connect(m_method, &QComboBox::currentIndexChanged, this, &UploadIeeeDialog::onMethodChanged);
-    connect(m_ca, &CaFileField::changed, this, [this] {
+    connect(m_ca, &PathField::changed, this, [this] {
         clearComplaint();
         updateAccept();
     });
@@ -84,7 +84,7 @@ QWidget *UploadIeeeDialog::buildFields() {
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(8);
     layout->addLayout(line);
-    layout->addWidget(captioned(tr("CA Certificate"), m_ca, fields));
+    layout->addWidget(m_ca);
     return fields;
 }
 
@@ -131,21 +131,22 @@ bool UploadIeeeDialog::areFieldsGood() {
     return true;
 }
 
-bool UploadIeeeDialog::insert() {
-    UploadTaskMgr &queue = UploadTaskMgr::instance();
-    const CertificateFile &ca = *m_ca->file();
-    const QString mode = modes[static_cast<int>(method())];
-    const QString identity = m_identity->text().trimmed();
-    const bool done =
-        method() == Method::Peap
-            ? queue.insertNewPeapTask(mode, ca.name, ca.path, identity, m_password->text(),
-                                      box()->deviceIds())
-            : queue.insertNewTlsTask(mode, ca.name, ca.path, identity, m_keyPassword->text(),
-                                     box()->certificates(), box()->privateKeys(), box()->deviceIds());
-    if (done) {
-        box()->forgetPassPhrase();
-        m_password->clear();
-        m_keyPassword->clear();
-    }
-    return done;
+std::function<bool(UploadTaskMgr &)> UploadIeeeDialog::insertion() {
+    const bool isPeap = method() == Method::Peap;
+    return [isPeap, mode = modes[static_cast<int>(method())], ca = m_ca->file(),
+            identity = m_identity->text().trimmed(),
+            password = isPeap ? m_password->text() : m_keyPassword->text(),
+            order = box()->order()](UploadTaskMgr &queue) {
+        return isPeap
+                   ? queue.insertNewPeapTask(mode, ca->name, ca->path, identity, password, order.deviceIds())
+                   : queue.insertNewTlsTask(mode, ca->name, ca->path, identity, password,
+                                            order.certificates(), order.privateKeys(), order.deviceIds());
+    };
+}
+
+void UploadIeeeDialog::accept() {
+    box()->forgetPassPhrase();
+    m_password->clear();
+    m_keyPassword->clear();
+    CertificateUploadDialog::accept();
 }

@@ -23,9 +23,12 @@ public:
     /// The method of a service task's type; the first one for a type of another dialog.
     static Method methodOf(const QString &serviceType);
 
+    /// Forgets the passwords first.
+    void accept() override;
+
 protected:
     bool areFieldsGood() override;
-    bool insert() override;
+    std::function<bool(UploadTaskMgr &)> insertion() override;
     void takeDropped(const QStringList &paths, const QPoint &place) override;
     bool takesFiles() const override { return true; }
     bool isReading() const override;

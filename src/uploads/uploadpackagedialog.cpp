@@ -1,6 +1,7 @@
 #include "uploadpackagedialog.h"
 
 #include "filefield.h"
+#include "queueing.h"
 #include "targetbox.h"
 #include "tasktargets.h"
 #include "uploadtaskmgr.h"
@@ -33,7 +34,7 @@ UploadPackageDialog::UploadPackageDialog(OperationTargets::List targets, QWidget
     addPart(m_file);
     addPart(m_card);
     finish(std::move(targets), OperationTargets::Need::Authorization, tr("Upload"), "uploadButton");
-    connect(m_file, &FileField::changed, this, &UploadPackageDialog::updateAccept);
+    connect(m_file, &PathField::changed, this, &UploadPackageDialog::updateAccept);
     connect(m_card, &QCheckBox::toggled, this, &UploadPackageDialog::showCardWarnings);
     m_file->setFocus();
 }
@@ -66,14 +67,16 @@ void UploadPackageDialog::showCardWarnings() {
 }
 
 bool UploadPackageDialog::isComplete() const {
-    return !m_file->path().isEmpty();
+    return m_file->file().isGood();
 }
 
 void UploadPackageDialog::apply() {
-    if (UploadTaskMgr::instance().insertNewPackageUploadTask(QStringLiteral("manual"), m_file->fileName(),
-                                                             m_file->path(), m_card->isChecked(),
-                                                             TaskTargets::ids(targets().tickedIds())))
-        accept();
-    else
-        setComplaint(tr("The upload could not be started."));
+    Queueing::post<UploadTaskMgr>(
+        this,
+        [file = m_file->file(), toCard = m_card->isChecked(),
+         ids = targets().tickedIds()](UploadTaskMgr &queue) {
+            return queue.insertNewPackageUploadTask(QStringLiteral("manual"), file.name, file.path, toCard,
+                                                    TaskTargets::ids(ids));
+        },
+        [this] { setComplaint(tr("The upload could not be started.")); });
 }

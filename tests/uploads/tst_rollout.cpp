@@ -281,7 +281,7 @@ void TestRollout::endsWithTheSessionAndNotWithTheProgram() {
     RolloutPlan image = plan();
     image.actionTime.clear();
     m_root.write("it's.bin", "image");
-    image.image = UploadFile::inspect(m_root.filePath("it's.bin"));
+    image.image = FileCheck::ofFile(m_root.filePath("it's.bin"));
     image.fwid = "FW00";
     rollouts.start(image);
     QTRY_COMPARE(service.rawSentTo("/v1/fwupl").size(), 1u);
@@ -315,7 +315,7 @@ void TestRollout::imageThatHasChangedIsNotSent() {
     FakeLists service;
     RolloutPlan image = plan();
     m_root.write("image.bin", "image");
-    image.image = UploadFile::inspect(m_root.filePath("image.bin"));
+    image.image = FileCheck::ofFile(m_root.filePath("image.bin"));
     m_root.write("image.bin", "another one");
     RolloutMgr::instance().start(image);
     Rollout &rollout = *RolloutMgr::instance().rollouts().at(0);
@@ -352,7 +352,7 @@ void TestRollout::wavesReachTheDevices() {
     };
     RolloutPlan waves;
     m_root.write("wave.bin", image);
-    waves.image = UploadFile::inspect(m_root.filePath("wave.bin"));
+    waves.image = FileCheck::ofFile(m_root.filePath("wave.bin"));
     for (const JSON &device : devices())
         waves.deviceIds += stringMember(device, "id");
     waves.deviceIds = waves.deviceIds.mid(0, 5);

@@ -72,9 +72,9 @@ bool drop(QWidget *widget, const QStringList &paths) {
     QCoreApplication::sendEvent(widget, &enter);
     if (!enter.isAccepted())
         return false;
-    QDropEvent event({5, 5}, Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    QDropEvent event({5, 5}, Qt::MoveAction | Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
     QCoreApplication::sendEvent(widget, &event);
-    return true;
+    return event.dropAction() == Qt::CopyAction;
 }
 
 } // namespace
@@ -120,9 +120,12 @@ void TestSmallUploads::fileIsLookedAt_data() {
     QTest::newRow("missing") << m_root.filePath("none") << "There is no such file." << false;
     QTest::newRow("folder") << m_root.path() << "This is a folder." << false;
     QTest::newRow("pipe") << pipe << "This is no plain file." << false;
+    QTest::newRow("damaged name") << m_root.filePath("a\uFFFDb")
+                                  << "The name of the file is damaged; give it another one." << false;
     QTest::newRow("empty") << file("empty", "") << "The file is empty." << false;
-    QTest::newRow("5 GiB") << huge << "The file is larger than 4 GiB." << false;
-    QTest::newRow("blank name") << file(" ") << "The file has a blank name." << false;
+    QTest::newRow("5 GiB") << huge << "The file has 5.0 GiB; the server takes 4 GiB at most." << false;
+    QTest::newRow("blank name") << file(" ") << "The name of the file is blank; give it another one."
+                                << false;
     QTest::newRow("unreadable") << "/proc/self/mem"
                                 << "The file is empty." << false;
     const QString closed = file("closed");
@@ -139,11 +142,11 @@ void TestSmallUploads::fileIsLookedAt() {
     FileField field(FileField::Kind::File, {"File", "Choose", "hint"}, nullptr);
     field.setAskPath([&](const auto &chosen) { chosen(path); });
     click(&field, "browseButton");
-    QCOMPARE(field.path(), QString());
-    QTRY_VERIFY(child<QLabel>(&field, "pathStateLabel")->text() != "Looking at it...");
-    QTEST(child<QLabel>(&field, "pathStateLabel")->text(), "told");
+    QVERIFY(field.file().path.isEmpty());
+    QTRY_VERIFY(child<QLabel>(&field, "fileStateLabel")->text() != "Looking at it...");
+    QTEST(child<QLabel>(&field, "fileStateLabel")->text(), "told");
     QFETCH(bool, good);
-    QCOMPARE(field.path(), good ? path : QString());
+    QCOMPARE(field.file().isGood(), good);
 }
 
 void TestSmallUploads::fileIsDropped() {
@@ -152,12 +155,12 @@ void TestSmallUploads::fileIsDropped() {
     const QString good = file("good.cfg");
     QVERIFY(!drop(&dialog, {"http://example.org/file"}));
     QVERIFY(drop(&dialog, {good, m_root.path()}));
-    QCOMPARE(child<QLabel>(&dialog, "pathStateLabel")->text(), QString("Only one file can be taken."));
+    QCOMPARE(child<QLabel>(&dialog, "fileStateLabel")->text(), QString("Only one file can be taken."));
     QVERIFY(drop(&dialog, {good}));
-    QTRY_COMPARE(dialog.fileField()->path(), good);
+    QTRY_COMPARE(dialog.fileField()->file().path, good);
     QVERIFY(child<QPushButton>(&dialog, "uploadButton")->isEnabled());
     QVERIFY(drop(&dialog, {m_root.path()}));
-    QTRY_COMPARE(child<QLabel>(&dialog, "pathStateLabel")->text(), QString("This is a folder."));
+    QTRY_COMPARE(child<QLabel>(&dialog, "fileStateLabel")->text(), QString("This is a folder."));
     QVERIFY(!child<QPushButton>(&dialog, "uploadButton")->isEnabled());
 }
 
@@ -200,9 +203,9 @@ void TestSmallUploads::exportProposesTheLastFolder() {
     QVERIFY(CLocalStore::instance().setDefaultFilePath(m_root.path()));
     QPointer dialog = new ExportDebugInfoDialog(targets({plain, plain}));
     dialog->open();
-    QTRY_COMPARE(dialog->folderField()->path(), m_root.path());
+    QTRY_COMPARE(dialog->folderField()->file().path, m_root.path());
     dialog->folderField()->setPath(file);
-    QTRY_COMPARE(child<QLabel>(dialog, "pathStateLabel")->text(), QString("This is no folder."));
+    QTRY_COMPARE(child<QLabel>(dialog, "fileStateLabel")->text(), QString("This is no folder."));
     QVERIFY(!child<QPushButton>(dialog, "exportButton")->isEnabled());
     dialog->folderField()->setPath(m_root.path());
     QTRY_VERIFY(child<QPushButton>(dialog, "exportButton")->isEnabled());

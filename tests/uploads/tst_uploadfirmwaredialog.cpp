@@ -1,7 +1,9 @@
 #include "uploadfirmwaredialog.h"
 
 #include "devicemaker.h"
+#include "failedtaskstrip.h"
 #include "fakelists.h"
+#include "filefield.h"
 #include "isolatedroot.h"
 #include "modelgroupmodel.h"
 #include "rolloutmgr.h"
@@ -10,13 +12,11 @@
 #include "storewriter.h"
 #include "targetbox.h"
 #include "taskinfopool.h"
-#include "uploadfilefield.h"
+#include "uploadtaskmgr.h"
 
 #include <QCheckBox>
 #include <QComboBox>
-#include <QDropEvent>
 #include <QLabel>
-#include <QMimeData>
 #include <QPointer>
 #include <QPushButton>
 #include <QRadioButton>
@@ -69,15 +69,13 @@ private slots:
 
     void imageIsJudged_data();
     void imageIsJudged();
-    void fileThatCannotBeSent_data();
-    void fileThatCannotBeSent();
     void anotherImageTicksTheGroupsAgain();
-    void droppedFiles();
     void groupsAndDevicesAreTickedTogether();
     void uploadsAtItsTime();
     void onlyDevicesWhoseLastUploadFailed();
     void limitOfTheServiceIsShown();
     void wavesAreFollowedInTheStrip();
+    void failedWaveIsOfferedOnce();
 
 private:
     void open() {
@@ -90,11 +88,11 @@ private:
     Part *part(const char *name) const {
         return m_dialog->findChild<Part *>(QLatin1String(name));
     }
-    UploadFileField *field() const { return m_dialog->findChild<UploadFileField *>(); }
+    FileField *field() const { return m_dialog->findChild<FileField *>(); }
     TargetBox *box() const { return m_dialog->findChild<TargetBox *>(); }
     QPushButton *accept() const { return part<QPushButton>("uploadButton"); }
     void choose(const QString &path) {
-        field()->choose(path);
+        field()->setPath(path);
         QTRY_VERIFY(!field()->isChecking());
     }
     void chooseImage(const QByteArray &content) {
@@ -123,10 +121,10 @@ void TestUploadFirmwareDialog::imageIsJudged_data() {
     row("NVLFW1 NR,NC 2.5.0\n", {"fits", "fits"}, 10, true);
     row("NVLFW1 NR-1 2.5.0\n", {other, other}, 0, false);
     row("anything", {unknownFit, unknownFit}, 10, true);
-    row("NVLFW1 NC-4210\n", {unknownFit, unknownFit}, 10, false);
-    row("NVLFW1 NC,,NR 2.5.0\n", {unknownFit, unknownFit}, 10, false);
-    row("NVLFW1 NC latest\n", {unknownFit, unknownFit}, 10, false);
-    row("NVLFW1 " + QByteArray(5000, 'N') + " 2.5.0\n", {unknownFit, unknownFit}, 10, false);
+    row("NVLFW1 NC-4210\n", {"", ""}, 10, false);
+    row("NVLFW1 NC,,NR 2.5.0\n", {"", ""}, 10, false);
+    row("NVLFW1 NC latest\n", {"", ""}, 10, false);
+    row("NVLFW1 " + QByteArray(5000, 'N') + " 2.5.0\n", {"", ""}, 10, false);
 }
 
 void TestUploadFirmwareDialog::imageIsJudged() {
@@ -138,33 +136,7 @@ void TestUploadFirmwareDialog::imageIsJudged() {
     QCOMPARE(box()->tickedCount(), ticked);
     QCOMPARE(accept()->text(), QStringLiteral("Upload to %1").arg(ticked));
     QTEST(accept()->isEnabled(), "accepted");
-}
-
-void TestUploadFirmwareDialog::fileThatCannotBeSent_data() {
-    QTest::addColumn<QString>("path");
-    QTest::addColumn<QString>("problem");
-    m_root.write("empty.bin", {});
-    m_root.write("huge.bin", "NVLFW1 NC 2.5.0\n");
-    QVERIFY(QFile::resize(m_root.filePath("huge.bin"), UploadFile::mostBytes + 1));
-    const QString odd = QStringLiteral("a\"b'\n").leftJustified(255, u'ü').left(130);
-    m_root.write(odd, "image");
-    QTest::newRow("missing") << m_root.filePath("nothing.bin") << "no such file";
-    QTest::newRow("folder") << m_root.path() << "folder";
-    QTest::newRow("no plain file") << "/dev/zero"
-                                   << "no plain file";
-    QTest::newRow("empty") << m_root.filePath("empty.bin") << "empty";
-    QTest::newRow("too large") << m_root.filePath("huge.bin") << "4 GiB at most";
-    QTest::newRow("odd name, and good") << m_root.filePath(odd) << "";
-}
-
-void TestUploadFirmwareDialog::fileThatCannotBeSent() {
-    QFETCH(const QString, path);
-    QFETCH(const QString, problem);
-    choose(path);
-    const auto *warning = part<QLabel>("fileWarningLabel");
-    QVERIFY2(warning->text().contains(problem), qUtf8Printable(warning->text()));
-    QCOMPARE(warning->isVisible(), !problem.isEmpty());
-    QCOMPARE(accept()->isEnabled(), problem.isEmpty());
+    QCOMPARE(part<QLabel>("fileStateLabel")->text().contains("damaged"), cell(0, 3).isEmpty());
 }
 
 void TestUploadFirmwareDialog::anotherImageTicksTheGroupsAgain() {
@@ -183,25 +155,6 @@ void TestUploadFirmwareDialog::anotherImageTicksTheGroupsAgain() {
     }
     QVERIFY2(told.join(' ').contains("6 device(s) will fail: the image is for another model group."),
              qUtf8Printable(told.join(' ')));
-}
-
-void TestUploadFirmwareDialog::droppedFiles() {
-    m_root.write("a.bin", "image");
-    const QUrl file = QUrl::fromLocalFile(m_root.filePath("a.bin"));
-    const auto drop = [&](const QList<QUrl> &urls) {
-        QMimeData data;
-        data.setUrls(urls);
-        QDragEnterEvent enter({20, 20}, Qt::MoveAction | Qt::CopyAction, &data, Qt::LeftButton, {});
-        QCoreApplication::sendEvent(m_dialog, &enter);
-        QDropEvent event({20, 20}, Qt::MoveAction | Qt::CopyAction, &data, Qt::LeftButton, {});
-        QCoreApplication::sendEvent(m_dialog, &event);
-        return event.isAccepted() && event.dropAction() == Qt::CopyAction;
-    };
-    QVERIFY(drop({file, file}) && drop({QUrl("https://a.example/a.bin")}));
-    QVERIFY(part<QLabel>("fileWarningLabel")->isVisible() && field()->file().path.isEmpty());
-    QVERIFY(drop({file}));
-    QTRY_VERIFY(accept()->isEnabled());
-    QCOMPARE(part<QLabel>("fileSizeLabel")->text(), "5 bytes");
 }
 
 void TestUploadFirmwareDialog::groupsAndDevicesAreTickedTogether() {
@@ -314,6 +267,25 @@ void TestUploadFirmwareDialog::wavesAreFollowedInTheStrip() {
     strip.findChild<QToolButton *>("stopRolloutButton")->click();
     strip.findChild<QToolButton *>("dismissRolloutButton")->click();
     QVERIFY(!strip.isVisible() && RolloutMgr::instance().rollouts().empty());
+}
+
+void TestUploadFirmwareDialog::failedWaveIsOfferedOnce() {
+    FailedTaskStrip failures;
+    failures.follow(&UploadTaskMgr::instance());
+    const auto countOfUploads = [this] { return m_service->sentTo("/v1/task/init").size(); };
+    chooseImage("NVLFW1 NC 2.5.0\n");
+    part<QCheckBox>("inWavesCheckBox")->click();
+    m_service->setTaskMade(json::object());
+    QTest::mouseClick(accept(), Qt::LeftButton);
+    Rollout &rollout = *RolloutMgr::instance().rollouts().at(0);
+    QTRY_COMPARE(rollout.state(), Rollout::State::Stopped);
+    QCOMPARE(rollout.progress().reason, Rollout::Reason::NotBegun);
+    QVERIFY2(failures.isHidden(), "the rollout offers it");
+    const std::size_t sent = countOfUploads();
+    rollout.goOn();
+    QTRY_COMPARE(rollout.state(), Rollout::State::Stopped);
+    QCOMPARE(countOfUploads(), sent + 1);
+    RolloutMgr::instance().dismiss(&rollout);
 }
 
 QTEST_MAIN(TestUploadFirmwareDialog)

@@ -258,7 +258,7 @@ private:
     /// Applies the dialog and gives what the service got there.
     std::string send(const char *path) {
         apply()->click();
-        if (m_dialog->isVisible())
+        if (!QTest::qWaitFor([this] { return !m_dialog || !m_dialog->isVisible(); }))
             qFatal("the upload was refused");
         UploadTaskMgr::instance().handlingTask();
         return m_service.rawSentTo(path).back();

@@ -1,0 +1,23 @@
+#pragma once
+
+#include "certificatecheck.h"
+#include "devicerecord.h"
+#include "json.h"
+
+#include <vector>
+
+/// Which devices get which files, in the forms that the queue of uploads takes. Any thread.
+struct CertificateOrder {
+    struct Entry {
+        DeviceRecordPtr device;
+        CertificatePair pair;
+    };
+    std::vector<Entry> entries;
+
+    JSON deviceIds() const;
+    JSON certificates() const;
+    JSON privateKeys() const;
+
+private:
+    JSON files(CertificateFilePtr CertificatePair::*slot) const;
+};
