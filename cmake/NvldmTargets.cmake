@@ -2,9 +2,17 @@
 
 function(nvldm_compile_options target)
     target_compile_features(${target} PUBLIC cxx_std_20)
-    target_compile_options(${target} PRIVATE
-        -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wold-style-cast -Wcast-qual
-        $<$<BOOL:${NVLDM_WERROR}>:-Werror>)
+    if(MSVC)
+        target_compile_options(${target} PRIVATE /W4 /permissive- /utf-8 $<$<BOOL:${NVLDM_WERROR}>:/WX>)
+    else()
+        target_compile_options(${target} PRIVATE
+            -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wold-style-cast -Wcast-qual
+            $<$<BOOL:${NVLDM_WERROR}>:-Werror>)
+    endif()
+    if(WIN32)
+        # The system's headers come with macros named min and max, and with an older socket interface.
+        target_compile_definitions(${target} PRIVATE NOMINMAX WIN32_LEAN_AND_MEAN)
+    endif()
 endfunction()
 
 # A static library of one folder. PUBLIC and PRIVATE name what it may include: a header of a library that is

@@ -80,7 +80,9 @@ make_with_cmake() {
 }
 
 make_openssl() {
-    local options="mingw64 shared no-tests no-engine no-legacy"
+    # A library that loads a configuration by itself would take it from a place that others may write to.
+    local options="mingw64 shared no-tests no-engine no-module no-autoload-config"
+    local settings='C:/Program Files/Common Files/SSL'
     unpack_source openssl || { echo "The source package openssl cannot be had." >&2; return 1; }
     # shellcheck disable=SC2086
     is_made openssl $options && return 0
@@ -89,8 +91,9 @@ make_openssl() {
     (
         rm -rf "$cache/build/openssl" && mkdir -p "$cache/build/openssl" && cd "$cache/build/openssl" &&
             "$cache/sources/openssl/Configure" $options --cross-compile-prefix=x86_64-w64-mingw32- \
-                --prefix="$sysroot" --libdir=lib --openssldir='C:/Program Files/Common Files/SSL' &&
-            make -j"$(nproc)" build_libs && make install_dev
+                --prefix="$sysroot" --libdir=lib &&
+            make -j"$(nproc)" OPENSSLDIR="$settings" MODULESDIR="$settings/modules" ENGINESDIR="$settings/engines" \
+                build_libs && make install_dev
     ) >"$cache/openssl.log" 2>&1 || {
         tail -n 40 "$cache/openssl.log" >&2
         echo "openssl could not be made; all of it stands in $cache/openssl.log" >&2
