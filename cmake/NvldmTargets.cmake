@@ -39,10 +39,14 @@ function(nvldm_qt_options target)
         QT_MESSAGELOGCONTEXT QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_DISABLE_DEPRECATED_BEFORE=0x060400)
 endfunction()
 
-# A Qt Test program, registered with ctest under its own name, off screen.
-#   nvldm_test(tst_name LIBS … [SOURCES …] [TIMEOUT s])
+# A Qt Test program, registered with ctest under its own name, off screen. One whose other side is written for POSIX
+# systems, as the scripted peers are, is left out on others.
+#   nvldm_test(tst_name [POSIX] LIBS … [SOURCES …] [TIMEOUT s])
 function(nvldm_test name)
-    cmake_parse_arguments(ARG "" "TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    cmake_parse_arguments(ARG "POSIX" "TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    if(ARG_POSIX AND NOT UNIX)
+        return()
+    endif()
     add_executable(${name} ${name}.cpp ${ARG_SOURCES})
     target_link_libraries(${name} PRIVATE ${ARG_LIBS} Qt6::Test)
     nvldm_compile_options(${name})
