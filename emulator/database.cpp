@@ -1,6 +1,7 @@
 #include "database.h"
 
 #include "platform.h"
+#include "utf8_path.h"
 
 #include <sqlite3.h>
 
@@ -11,11 +12,6 @@ namespace {
 // The cost of a lock that a reader from outside holds for a moment.
 constexpr int busyMs = 5000;
 
-std::string utf8(const std::filesystem::path &path) {
-    const std::u8string text = path.u8string();
-    return {text.begin(), text.end()};
-}
-
 } // namespace
 
 Database::Database(const std::filesystem::path &path) {
@@ -23,7 +19,7 @@ Database::Database(const std::filesystem::path &path) {
     if (sqlite3_open_v2(utf8(path).c_str(), &m_handle, SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOMUTEX,
                         nullptr) != SQLITE_OK) {
         sqlite3_close(m_handle);
-        throw DatabaseError("cannot open " + path.string());
+        throw DatabaseError("cannot open " + utf8(path));
     }
     sqlite3_busy_timeout(m_handle, busyMs);
 }

@@ -8,6 +8,7 @@
 #include "service.h"
 #include "service_files.h"
 #include "stop_signal.h"
+#include "utf8_path.h"
 
 #include <cstdlib>
 #include <filesystem>
@@ -23,7 +24,7 @@ using namespace std::chrono_literals;
 constexpr int usageStatus = 2;
 
 void useKeyOf(const std::filesystem::path &folder) {
-    const std::string path = folder.string();
+    const std::string path = emulator::utf8(folder);
     nvlcryptoSetKeyFolder(path.data(), path.size());
     if (!emulator::ciphersWork()) {
         throw std::runtime_error("the key file in " + path + " cannot be used");

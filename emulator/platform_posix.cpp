@@ -1,5 +1,7 @@
 #include "platform.h"
 
+#include "utf8_path.h"
+
 #include <fcntl.h>
 #include <poll.h>
 #include <signal.h>
@@ -60,14 +62,14 @@ std::optional<std::string> readInput(std::chrono::milliseconds time) {
 
 void makePrivateFolder(const std::filesystem::path &folder) {
     if (::mkdir(folder.c_str(), 0700) != 0 && !std::filesystem::is_directory(folder)) {
-        throw std::runtime_error("cannot make the folder " + folder.string());
+        throw std::runtime_error("cannot make the folder " + utf8(folder));
     }
 }
 
 void makePrivateFile(const std::filesystem::path &path) {
     const int file = openPrivate(path, O_RDWR);
     if (file < 0) {
-        throw std::runtime_error("cannot open " + path.string());
+        throw std::runtime_error("cannot open " + utf8(path));
     }
     ::close(file);
 }
@@ -78,7 +80,7 @@ void writePrivateFile(const std::filesystem::path &path, const std::string &text
         file >= 0 && ::write(file, text.data(), text.size()) == static_cast<ssize_t>(text.size());
     const bool closed = file >= 0 && ::close(file) == 0;
     if (!written || !closed) {
-        throw std::runtime_error("cannot write " + path.string());
+        throw std::runtime_error("cannot write " + utf8(path));
     }
 }
 
@@ -88,8 +90,7 @@ FileClaim::FileClaim(const std::filesystem::path &path) {
         if (file >= 0) {
             ::close(file);
         }
-        throw std::runtime_error("the folder " + path.parent_path().string() +
-                                 " cannot be used or is in use");
+        throw std::runtime_error("the folder " + utf8(path.parent_path()) + " cannot be used or is in use");
     }
     m_file = file;
 }

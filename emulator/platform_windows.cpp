@@ -1,6 +1,7 @@
 #include "platform.h"
 
 #include "owneraccess.h"
+#include "utf8_path.h"
 
 #include <windows.h>
 #include <winsock2.h>
@@ -70,13 +71,13 @@ std::optional<std::string> readInput(std::chrono::milliseconds time) {
 
 void makePrivateFolder(const std::filesystem::path &folder) {
     if (!OwnerAccess::makeFolder(folder.wstring()) && !std::filesystem::is_directory(folder)) {
-        throw std::runtime_error("cannot make the folder " + folder.string());
+        throw std::runtime_error("cannot make the folder " + utf8(folder));
     }
 }
 
 void makePrivateFile(const std::filesystem::path &path) {
     if (!OwnerAccess::makeFile(path.wstring()) && !std::filesystem::exists(path)) {
-        throw std::runtime_error("cannot open " + path.string());
+        throw std::runtime_error("cannot open " + utf8(path));
     }
 }
 
@@ -84,7 +85,7 @@ void writePrivateFile(const std::filesystem::path &path, const std::string &text
     makePrivateFile(path);
     std::ofstream file(path, std::ios::binary | std::ios::trunc);
     if (!file.write(text.data(), static_cast<std::streamsize>(text.size())).flush()) {
-        throw std::runtime_error("cannot write " + path.string());
+        throw std::runtime_error("cannot write " + utf8(path));
     }
 }
 
@@ -92,8 +93,7 @@ FileClaim::FileClaim(const std::filesystem::path &path) {
     const HANDLE file = ::CreateFileW(path.c_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, OPEN_ALWAYS,
                                       FILE_ATTRIBUTE_NORMAL, nullptr);
     if (file == INVALID_HANDLE_VALUE) {
-        throw std::runtime_error("the folder " + path.parent_path().string() +
-                                 " cannot be used or is in use");
+        throw std::runtime_error("the folder " + utf8(path.parent_path()) + " cannot be used or is in use");
     }
     m_file = reinterpret_cast<std::intptr_t>(file);
 }

@@ -32,7 +32,7 @@ ServiceFiles::ServiceFiles(std::filesystem::path folder)
 
 void ServiceFiles::discardStore() const {
     for (const char *suffix : {"", "-wal", "-shm"}) {
-        std::filesystem::remove(storePath().string() + suffix);
+        std::filesystem::remove(storePath() += suffix);
     }
 }
 
