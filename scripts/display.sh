@@ -36,11 +36,12 @@ await() {
 }
 
 await_window() {
-    timeout "$((${patience:-300} / 10))" xdotool search --sync --onlyvisible --name "$1" >/dev/null || {
-        picture failed
-        echo "No window with the title: $1" >&2
-        exit 1
-    }
+    local end=$((SECONDS + ${patience:-300} / 10))
+    # A window that goes while it is looked at ends the search, so it begins again.
+    until xdotool search --onlyvisible --name "$1" >/dev/null 2>&1; do
+        [ "$SECONDS" -lt "$end" ] || { picture failed; echo "No window with the title: $1" >&2; exit 1; }
+        sleep 0.2
+    done
     # The window manager still has to hand the focus over.
     sleep 1
 }
