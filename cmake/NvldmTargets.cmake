@@ -2,10 +2,18 @@
 
 function(nvldm_compile_options target)
     target_compile_features(${target} PUBLIC cxx_std_20)
-    target_compile_options(${target} PRIVATE
-        -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wold-style-cast -Wcast-qual
-        $<$<BOOL:${NVLDM_WERROR}>:-Werror>)
-    nvldm_release_options(${target})
+    if(MSVC)
+        target_compile_options(${target} PRIVATE /W4 /permissive- /utf-8 $<$<BOOL:${NVLDM_WERROR}>:/WX>)
+    else()
+        target_compile_options(${target} PRIVATE
+            -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wold-style-cast -Wcast-qual
+            $<$<BOOL:${NVLDM_WERROR}>:-Werror>)
+        nvldm_release_options(${target})
+    endif()
+    if(WIN32)
+        # The system's headers come with macros named min and max, and with an older socket interface.
+        target_compile_definitions(${target} PRIVATE NOMINMAX WIN32_LEAN_AND_MEAN)
+    endif()
 endfunction()
 
 # What is given to others names no folder of the machine that built it, so that the same sources make the same
@@ -44,10 +52,14 @@ function(nvldm_qt_options target)
         QT_MESSAGELOGCONTEXT QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_DISABLE_DEPRECATED_BEFORE=0x060400)
 endfunction()
 
-# A Qt Test program, registered with ctest under its own name, off screen.
-#   nvldm_test(tst_name LIBS … [SOURCES …] [TIMEOUT s])
+# A Qt Test program, registered with ctest under its own name, off screen. One whose other side is written for POSIX
+# systems, as the scripted peers are, is left out on others.
+#   nvldm_test(tst_name [POSIX] LIBS … [SOURCES …] [TIMEOUT s])
 function(nvldm_test name)
-    cmake_parse_arguments(ARG "" "TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    cmake_parse_arguments(ARG "POSIX" "TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    if(ARG_POSIX AND NOT UNIX)
+        return()
+    endif()
     add_executable(${name} ${name}.cpp ${ARG_SOURCES})
     target_link_libraries(${name} PRIVATE ${ARG_LIBS} Qt6::Test)
     nvldm_compile_options(${name})

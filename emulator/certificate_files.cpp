@@ -1,6 +1,7 @@
 #include "certificate_files.h"
 
 #include "answer.h"
+#include "clock.h"
 #include "credentials.h"
 #include "device_table.h"
 #include "records.h"
@@ -8,8 +9,6 @@
 #include <openssl/bio.h>
 #include <openssl/err.h>
 #include <openssl/pem.h>
-
-#include <ctime>
 
 namespace emulator {
 
@@ -109,7 +108,7 @@ std::int64_t expiryOf(const X509 &certificate) {
     if (ASN1_TIME_to_tm(X509_get0_notAfter(&certificate), &parts) != 1) {
         return 0;
     }
-    return static_cast<std::int64_t>(timegm(&parts)) * 1000;
+    return msOfUtc(parts);
 }
 
 CertificateFiles::CertificateFiles(std::span<const UploadedFile> files) {

@@ -5,16 +5,12 @@
 #include "device_commit.h"
 #include "faults.h"
 #include "fleet.h"
+#include "platform.h"
 #include "random.h"
 #include "service.h"
 #include "stop_signal.h"
 
-#include <poll.h>
-#include <signal.h>
-#include <unistd.h>
-
 #include <algorithm>
-#include <array>
 #include <charconv>
 #include <iostream>
 #include <optional>
@@ -126,18 +122,13 @@ Control::~Control() {
 
 void Control::readInput() {
     std::string pending;
-    std::array<char, 4096> chunk{};
     while (!m_stop.raised()) {
         // Waking up now and then keeps the reader from outliving the rest of the program.
-        pollfd input{STDIN_FILENO, POLLIN, 0};
-        if (::poll(&input, 1, 200) <= 0) {
-            continue;
-        }
-        const ssize_t count = ::read(STDIN_FILENO, chunk.data(), chunk.size());
-        if (count <= 0) {
+        const auto chunk = platform::readInput(std::chrono::milliseconds(200));
+        if (!chunk) {
             return;
         }
-        pending.append(chunk.data(), static_cast<std::size_t>(count));
+        pending += *chunk;
         for (auto end = pending.find('\n'); end != std::string::npos; end = pending.find('\n')) {
             const std::string line = pending.substr(0, end);
             pending.erase(0, end + 1);
@@ -157,7 +148,7 @@ std::string Control::answer(const std::string &line) {
 std::string Control::run(const Words &words) {
     const std::string command = words.empty() ? std::string() : words[0];
     if (command == "stop" && words.size() == 1) {
-        ::kill(::getpid(), SIGTERM);
+        platform::requestStop();
         return "ok";
     }
     if (command == "counts" && words.size() == 1) {

@@ -1,9 +1,9 @@
 #include "database.h"
 
-#include <sqlite3.h>
+#include "platform.h"
+#include "utf8_path.h"
 
-#include <fcntl.h>
-#include <unistd.h>
+#include <sqlite3.h>
 
 namespace emulator {
 
@@ -12,22 +12,14 @@ namespace {
 // The cost of a lock that a reader from outside holds for a moment.
 constexpr int busyMs = 5000;
 
-void makePrivateFile(const std::filesystem::path &path) {
-    const int file = ::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600);
-    if (file < 0) {
-        throw DatabaseError("cannot open " + path.string());
-    }
-    ::close(file);
-}
-
 } // namespace
 
 Database::Database(const std::filesystem::path &path) {
-    makePrivateFile(path);
-    if (sqlite3_open_v2(path.c_str(), &m_handle, SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOMUTEX, nullptr) !=
-        SQLITE_OK) {
+    platform::makePrivateFile(path);
+    if (sqlite3_open_v2(utf8(path).c_str(), &m_handle, SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOMUTEX,
+                        nullptr) != SQLITE_OK) {
         sqlite3_close(m_handle);
-        throw DatabaseError("cannot open " + path.string());
+        throw DatabaseError("cannot open " + utf8(path));
     }
     sqlite3_busy_timeout(m_handle, busyMs);
 }

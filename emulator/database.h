@@ -17,7 +17,8 @@ public:
     using std::runtime_error::runtime_error;
 };
 
-/// One connection to an SQLite file; for one thread at a time. Everything throws DatabaseError on failure.
+/// One connection to an SQLite file; for one thread at a time. Everything throws DatabaseError on failure, a
+/// file that cannot be made std::runtime_error.
 class Database {
 public:
     /// Makes the file, readable by its owner only, where there is none.

@@ -1,12 +1,11 @@
 #include "delivery.h"
 
+#include "platform.h"
 #include "stop_signal.h"
 
 #include <httplib.h>
 
 #include <openssl/ssl.h>
-#include <poll.h>
-#include <sys/socket.h>
 
 #include <memory>
 #include <thread>
@@ -16,22 +15,11 @@ namespace emulator {
 
 namespace {
 
+using platform::cutConnection;
 using std::chrono::milliseconds;
 
 int socketOf(const httplib::Request &request) {
     return request.ssl ? SSL_get_fd(request.ssl) : -1;
-}
-
-/// The library owns the descriptor and closes it later, so the connection is cut without closing it.
-void cutConnection(int descriptor) {
-    sockaddr nobody{};
-    nobody.sa_family = AF_UNSPEC;
-    ::connect(descriptor, &nobody, sizeof nobody);
-}
-
-bool callerHasLeft(int descriptor) {
-    pollfd watched{descriptor, POLLRDHUP, 0};
-    return ::poll(&watched, 1, 0) > 0 && (watched.revents & (POLLRDHUP | POLLHUP | POLLERR)) != 0;
 }
 
 /// Announces the whole body, sends a part of it and resets the connection.
@@ -53,7 +41,7 @@ void deliverPart(const httplib::Request &request, httplib::Response &response, s
 
 void holdUnanswered(const httplib::Request &request, const StopSignal &stop) {
     const int descriptor = socketOf(request);
-    while (!callerHasLeft(descriptor) && !stop.waitFor(milliseconds(100))) {
+    while (!platform::callerHasLeft(descriptor) && !stop.waitFor(milliseconds(100))) {
     }
     cutConnection(descriptor);
 }

@@ -2,6 +2,7 @@
 #include "firmware_image.h"
 #include "package_upload.h"
 #include "upload_orders.h"
+#include "utf8_path.h"
 
 namespace emulator {
 
@@ -36,7 +37,7 @@ Answer uploadFirmware(Service &service, const Call &call) {
 /// The caller runs on this machine and names the file instead of sending it.
 Answer readFirmware(Service &service, const Call &call) {
     const UploadedFile file =
-        localFile(filledTextMember(call.body, "local"), filledTextMember(call.body, "localn"));
+        localFile(pathOf(filledTextMember(call.body, "local")), filledTextMember(call.body, "localn"));
     UploadOrder order = orderOf(call, "deviceFWUpgrade");
     order.files = {&file, 1};
     startFirmware(service, order, file);

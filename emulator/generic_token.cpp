@@ -1,6 +1,7 @@
 #include "generic_token.h"
 
 #include "credentials.h"
+#include "utf8_path.h"
 
 #include <openssl/core_names.h>
 #include <openssl/crypto.h>
@@ -49,7 +50,7 @@ Key masterKey(const std::filesystem::path &folder) {
     const std::string text((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
     const auto bytes = fromHex(trimmed(text));
     if (!bytes || bytes->size() != Key().size()) {
-        throw std::runtime_error("the key file " + path.string() + " is malformed");
+        throw std::runtime_error("the key file " + utf8(path) + " is malformed");
     }
     return keyOf(*bytes);
 }

@@ -3,13 +3,12 @@
 #include "delivery.h"
 #include "dispatcher.h"
 #include "faults.h"
+#include "platform.h"
 #include "service.h"
 #include "spoil.h"
 #include "stop_signal.h"
 
 #include <httplib.h>
-
-#include <sys/socket.h>
 
 #include <iostream>
 #include <stdexcept>
@@ -38,10 +37,8 @@ void configure(httplib::SSLServer &server) {
     SSL_CTX_set_num_tickets(server.ssl_context(), 0);
     // The library would share the port with another server that asks for it; only a port whose last
     // connections are still dying may be taken again.
-    server.set_socket_options([](socket_t descriptor) {
-        const int on = 1;
-        ::setsockopt(descriptor, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on);
-    });
+    server.set_socket_options(
+        [](socket_t descriptor) { platform::reclaimPort(static_cast<std::intptr_t>(descriptor)); });
     server.new_task_queue = [] { return new httplib::ThreadPool(threads); };
     server.set_tcp_nodelay(true);
     server.set_keep_alive_timeout(2);

@@ -4,12 +4,11 @@
 #include "https_server.h"
 #include "nvlcrypto.h"
 #include "options.h"
+#include "platform.h"
 #include "service.h"
 #include "service_files.h"
 #include "stop_signal.h"
-
-#include <signal.h>
-#include <sys/stat.h>
+#include "utf8_path.h"
 
 #include <cstdlib>
 #include <filesystem>
@@ -24,18 +23,8 @@ using namespace std::chrono_literals;
 
 constexpr int usageStatus = 2;
 
-/// Blocked in every thread, so that the main thread alone takes them.
-sigset_t blockStopSignals() {
-    sigset_t stops;
-    sigemptyset(&stops);
-    sigaddset(&stops, SIGTERM);
-    sigaddset(&stops, SIGINT);
-    pthread_sigmask(SIG_BLOCK, &stops, nullptr);
-    return stops;
-}
-
 void useKeyOf(const std::filesystem::path &folder) {
-    const std::string path = folder.string();
+    const std::string path = emulator::utf8(folder);
     nvlcryptoSetKeyFolder(path.data(), path.size());
     if (!emulator::ciphersWork()) {
         throw std::runtime_error("the key file in " + path + " cannot be used");
@@ -62,7 +51,6 @@ void leaveWithin(const std::future<void> &ended, const emulator::ServiceFiles &f
 }
 
 int serve(const emulator::Options &options) {
-    const sigset_t stops = blockStopSignals();
     const emulator::ServiceFiles files(options.root);
     if (options.fresh) {
         files.discardStore();
@@ -86,8 +74,7 @@ int serve(const emulator::Options &options) {
     const emulator::Control control(service, faults, stop);
     server.waitUntilServing();
     std::cout << "nvldm-emulator: listening on https://" << options.host << ':' << port << std::endl;
-    int signal = 0;
-    sigwait(&stops, &signal);
+    emulator::platform::waitForStop();
     service.noteStop();
     stop.raise();
     server.stop();
@@ -113,8 +100,7 @@ int run(const emulator::Options &options) {
 } // namespace
 
 int main(int argc, char *argv[]) {
-    signal(SIGPIPE, SIG_IGN);
-    umask(077);
+    emulator::platform::prepare();
     try {
         return run(emulator::readOptions({argv + 1, argv + argc}));
     } catch (const emulator::UsageError &error) {

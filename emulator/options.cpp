@@ -1,5 +1,7 @@
 #include "options.h"
 
+#include "utf8_path.h"
+
 #include <charconv>
 #include <functional>
 #include <map>
@@ -171,7 +173,7 @@ Setters valueSetters(Options &options) {
         {"--devices", numberInto<std::size_t>("--devices", options.devices, 200000)},
         {"--sites", numberInto<std::size_t>("--sites", options.sites, 5000)},
         {"--seed", numberInto<std::uint64_t>("--seed", options.seed, UINT64_MAX)},
-        {"--root", [&](const std::string &text) { options.root = text; }},
+        {"--root", [&](const std::string &text) { options.root = pathOf(text); }},
         {"--latency", numberInto("--latency", options.latencyMs, longestMs)},
         {"--upload-limit", numberInto<std::uint64_t>("--upload-limit", options.uploadLimit, UINT64_MAX)},
         {"--life", numberInto("--life", options.lifeMs, longestMs)},

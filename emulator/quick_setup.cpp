@@ -1,11 +1,11 @@
 #include "quick_setup.h"
 
 #include "answer.h"
+#include "clock.h"
 
 #include <algorithm>
 #include <array>
 #include <cstdio>
-#include <ctime>
 #include <regex>
 
 namespace emulator {
@@ -83,9 +83,7 @@ std::string timeText(const Json &value) {
 
 /// What a synchronised clock of the zone shows now, in the record's form.
 std::string clockText(const std::string &zone, std::int64_t nowMs) {
-    const std::time_t seconds = nowMs / 1000 + minutesAhead(zone) * 60;
-    std::tm parts{};
-    gmtime_r(&seconds, &parts);
+    const std::tm parts = utcParts(nowMs + std::int64_t{minutesAhead(zone)} * 60000);
     std::array<char, 40> text{};
     std::strftime(text.data(), text.size(), "%Y/%m/%d %H:%M:%S", &parts);
     return text.data();

@@ -2,11 +2,6 @@
 
 #include "database.h"
 
-#include <fcntl.h>
-#include <sys/file.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
 #include <stdexcept>
 #include <string>
 #include <utility>
@@ -24,39 +19,20 @@ constexpr auto afterState = " \n"
                             "        CHECKPOINT         : 0x0\n"
                             "        WAIT_HINT          : 0x0\n";
 
-void writeAll(const std::filesystem::path &path, const std::string &text) {
-    const int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0600);
-    const bool written =
-        file >= 0 && ::write(file, text.data(), text.size()) == static_cast<ssize_t>(text.size());
-    const bool closed = file >= 0 && ::close(file) == 0;
-    if (!written || !closed) {
-        throw std::runtime_error("cannot write " + path.string());
-    }
+std::filesystem::path madeFolder(std::filesystem::path folder) {
+    std::filesystem::create_directories(folder.parent_path().empty() ? "." : folder.parent_path());
+    platform::makePrivateFolder(folder);
+    return folder;
 }
 
 } // namespace
 
-ServiceFiles::ServiceFiles(std::filesystem::path folder) : m_folder(std::move(folder)) {
-    std::filesystem::create_directories(m_folder.parent_path().empty() ? "." : m_folder.parent_path());
-    if (::mkdir(m_folder.c_str(), 0700) != 0 && !std::filesystem::is_directory(m_folder)) {
-        throw std::runtime_error("cannot make the folder " + m_folder.string());
-    }
-    m_lock = ::open((m_folder / "nvldm-emulator.lock").c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600);
-    if (m_lock < 0 || ::flock(m_lock, LOCK_EX | LOCK_NB) != 0) {
-        if (m_lock >= 0) {
-            ::close(m_lock);
-        }
-        throw std::runtime_error("the folder " + m_folder.string() + " cannot be used or is in use");
-    }
-}
-
-ServiceFiles::~ServiceFiles() {
-    ::close(m_lock);
-}
+ServiceFiles::ServiceFiles(std::filesystem::path folder)
+    : m_folder(madeFolder(std::move(folder))), m_claim(m_folder / "nvldm-emulator.lock") {}
 
 void ServiceFiles::discardStore() const {
     for (const char *suffix : {"", "-wal", "-shm"}) {
-        std::filesystem::remove(storePath().string() + suffix);
+        std::filesystem::remove(storePath() += suffix);
     }
 }
 
@@ -97,7 +73,7 @@ void ServiceFiles::writeStopped() const {
 void ServiceFiles::writeState(const char *state) const {
     const auto path = m_folder / "nvldm.state";
     const auto fresh = m_folder / "nvldm.state.new";
-    writeAll(fresh, std::string(beforeState) + state + afterState);
+    platform::writePrivateFile(fresh, std::string(beforeState) + state + afterState);
     std::filesystem::rename(fresh, path);
 }
 

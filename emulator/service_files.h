@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform.h"
+
 #include <filesystem>
 
 namespace emulator {
@@ -10,9 +12,6 @@ public:
     /// Makes the folder and claims it for this process. Throws std::runtime_error when that fails or another
     /// emulator has it.
     explicit ServiceFiles(std::filesystem::path folder);
-    ~ServiceFiles();
-    ServiceFiles(const ServiceFiles &) = delete;
-    ServiceFiles &operator=(const ServiceFiles &) = delete;
 
     std::filesystem::path storePath() const { return m_folder / "nvldm-emulator.sdb"; }
     void discardStore() const;
@@ -27,7 +26,7 @@ private:
     void writeState(const char *state) const;
 
     std::filesystem::path m_folder;
-    int m_lock = -1;
+    platform::FileClaim m_claim;
 };
 
 } // namespace emulator

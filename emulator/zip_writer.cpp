@@ -1,7 +1,8 @@
 #include "zip_writer.h"
 
+#include "clock.h"
+
 #include <array>
-#include <ctime>
 #include <utility>
 
 namespace emulator {
@@ -46,9 +47,7 @@ void put32(std::string &out, std::uint32_t value) {
 }
 
 std::uint32_t dosTimeOf(std::int64_t timeMs) {
-    const std::time_t seconds = timeMs / 1000;
-    std::tm parts{};
-    gmtime_r(&seconds, &parts);
+    const std::tm parts = utcParts(timeMs);
     // The format counts years from 1980 and seconds in twos.
     const auto date =
         static_cast<std::uint32_t>((parts.tm_year - 80) << 9 | (parts.tm_mon + 1) << 5 | parts.tm_mday);

@@ -1,5 +1,7 @@
 #include "answerhead.h"
 
+#include "socketlifeline.h"
+
 #include <openssl/err.h>
 #include <openssl/ssl.h>
 
@@ -7,29 +9,11 @@
 #include <cctype>
 #include <string_view>
 
-#ifdef _WIN32
-#include <winsock2.h>
-#else
-#include <poll.h>
-#endif
-
 namespace {
 
 /// The TLS record (16 KiB) that goes beyond it is still read.
 constexpr std::size_t headLimit = 16u << 10;
 constexpr int firstRefusal = 300;
-
-#ifdef _WIN32
-bool isReadable(int socket) {
-    WSAPOLLFD descriptor{static_cast<SOCKET>(socket), POLLIN, 0};
-    return WSAPoll(&descriptor, 1, 0) > 0;
-}
-#else
-bool isReadable(int socket) {
-    pollfd descriptor{socket, POLLIN, 0};
-    return ::poll(&descriptor, 1, 0) > 0;
-}
-#endif
 
 /// Of the beginning of an answer, "HTTP/1.1 413 …"; 0 when it is none.
 int statusOf(std::string_view text) {
@@ -53,7 +37,7 @@ void AnswerHead::watch(SSL_CTX *context) {
 }
 
 int AnswerHead::earlyRefusal() const {
-    if (!m_session || (SSL_pending(m_session) == 0 && !isReadable(SSL_get_fd(m_session))))
+    if (!m_session || (SSL_pending(m_session) == 0 && !isSocketReadable(SSL_get_fd(m_session))))
         return 0;
     char bytes[32];
     // In that mode it would wait for more when what has come is a session ticket alone.

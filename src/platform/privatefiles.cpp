@@ -4,11 +4,39 @@
 #include <QFile>
 #include <QFileInfo>
 
+#ifdef Q_OS_WIN
+#include "owneraccess.h"
+#endif
+
 namespace PrivateFiles {
 
 namespace {
+
+#ifdef Q_OS_WIN
+
+// The toolkit's permissions leave in force what the folder above grants to everybody.
+bool makeFolder(const QString &folder) {
+    return OwnerAccess::makeFolder(QDir::toNativeSeparators(folder).toStdWString());
+}
+
+bool makeFile(const QString &path) {
+    return OwnerAccess::makeFile(QDir::toNativeSeparators(path).toStdWString());
+}
+
+#else
+
 constexpr QFileDevice::Permissions ownerFile = QFileDevice::ReadOwner | QFileDevice::WriteOwner;
-constexpr QFileDevice::Permissions ownerFolder = ownerFile | QFileDevice::ExeOwner;
+
+bool makeFolder(const QString &folder) {
+    return QDir().mkdir(folder, ownerFile | QFileDevice::ExeOwner);
+}
+
+bool makeFile(const QString &path) {
+    return QFile(path).open(QIODevice::NewOnly | QIODevice::WriteOnly, ownerFile);
+}
+
+#endif
+
 } // namespace
 
 bool ensureFolder(const QString &folder) {
@@ -18,7 +46,7 @@ bool ensureFolder(const QString &folder) {
     if (!QFileInfo(parent).isDir() && !ensureFolder(parent))
         return false;
     // A second process may have made it in between; what counts is that it is there.
-    return QDir().mkdir(folder, ownerFolder) || QFileInfo(folder).isDir();
+    return makeFolder(folder) || QFileInfo(folder).isDir();
 }
 
 bool ensureFile(const QString &path) {
@@ -26,8 +54,7 @@ bool ensureFile(const QString &path) {
         return true;
     if (!ensureFolder(QFileInfo(path).absolutePath()))
         return false;
-    QFile file(path);
-    return file.open(QIODevice::NewOnly | QIODevice::WriteOnly, ownerFile) || QFileInfo::exists(path);
+    return makeFile(path) || QFileInfo::exists(path);
 }
 
 } // namespace PrivateFiles

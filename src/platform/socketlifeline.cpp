@@ -5,6 +5,7 @@
 #ifdef _WIN32
 #include <winsock2.h>
 #else
+#include <poll.h>
 #include <sys/socket.h>
 #include <unistd.h>
 #endif
@@ -30,6 +31,11 @@ void closeHandle(long long socket) {
 
 } // namespace
 
+bool isSocketReadable(long long socket) {
+    WSAPOLLFD descriptor{static_cast<SOCKET>(socket), POLLIN, 0};
+    return WSAPoll(&descriptor, 1, 0) > 0;
+}
+
 #else
 
 namespace {
@@ -45,6 +51,11 @@ void closeHandle(long long socket) {
 }
 
 } // namespace
+
+bool isSocketReadable(long long socket) {
+    pollfd descriptor{static_cast<int>(socket), POLLIN, 0};
+    return ::poll(&descriptor, 1, 0) > 0;
+}
 
 #endif
 

@@ -1,5 +1,8 @@
 #pragma once
 
+/// True when a read of the socket would not wait.
+bool isSocketReadable(long long socket);
+
 /// Ends the traffic of a socket from another thread, whatever its owner waits for at that moment.
 ///
 /// Holds a handle of its own, so that a number the owner has closed and the system has given out again is

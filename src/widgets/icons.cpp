@@ -23,6 +23,42 @@ QByteArray coloured(QByteArray svg, const QColor &colour) {
     return svg;
 }
 
+/// One of the sizes in which the build has drawn a picture: the smallest that need not be enlarged.
+QImage drawnFor(const QString &resource, QSize pixels) {
+    const qsizetype suffixAt = resource.lastIndexOf(u'.');
+    QImage image;
+    for (const char *size : {"", "@1.5x", "@2x", "@6x"}) {
+        const QImage larger(QString(resource).insert(suffixAt, QLatin1String(size)));
+        if (larger.isNull())
+            break;
+        image = larger;
+        if (image.width() >= pixels.width() && image.height() >= pixels.height())
+            break;
+    }
+    return image;
+}
+
+QImage drawn(const QString &resource, QSize pixels, const QColor &colour) {
+    // Converted before it is scaled: a scaled image that is converted in place would be painted as it was
+    // before.
+    QImage image = drawnFor(resource, pixels)
+                       .convertToFormat(QImage::Format_ARGB32_Premultiplied)
+                       .scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    if (colour.isValid()) {
+        QPainter painter(&image);
+        painter.setCompositionMode(QPainter::CompositionMode_SourceIn);
+        painter.fillRect(image.rect(), colour);
+    }
+    return image;
+}
+
+QImage drawnFromSvg(QByteArray svg, QSize pixels) {
+    QBuffer buffer(&svg);
+    QImageReader reader(&buffer, "svg");
+    reader.setScaledSize(pixels);
+    return reader.read();
+}
+
 /// The picture at a size in pixels, drawn once for each size and colour.
 QPixmap rendered(const QString &resource, QSize pixels, const QColor &colour) {
     const QString key = QStringLiteral("%1/%2x%3/%4")
@@ -36,11 +72,11 @@ QPixmap rendered(const QString &resource, QSize pixels, const QColor &colour) {
     QFile file(resource);
     if (!file.open(QIODevice::ReadOnly))
         return {};
-    QByteArray svg = coloured(file.readAll(), colour);
-    QBuffer buffer(&svg);
-    QImageReader reader(&buffer, "svg");
-    reader.setScaledSize(pixels);
-    picture = QPixmap::fromImage(reader.read());
+    const QByteArray content = file.readAll();
+    // Where the toolkit cannot draw this format the build has done it, under the same names.
+    const bool isDrawn = content.startsWith("\x89PNG");
+    picture = QPixmap::fromImage(isDrawn ? drawn(resource, pixels, colour)
+                                         : drawnFromSvg(coloured(content, colour), pixels));
     QPixmapCache::insert(key, picture);
     return picture;
 }

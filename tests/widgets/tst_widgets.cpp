@@ -1,5 +1,6 @@
 #include "countedtabwidget.h"
 #include "framelessdialog.h"
+#include "icons.h"
 #include "passwordedit.h"
 #include "plaintext.h"
 #include "theme.h"
@@ -11,6 +12,7 @@
 #include <QRegularExpression>
 #include <QSignalSpy>
 #include <QTabBar>
+#include <QTemporaryDir>
 #include <QTest>
 #include <QTextDocument>
 #include <QToolButton>
@@ -36,6 +38,29 @@ private slots:
         QTest::mouseClick(eye, Qt::LeftButton);
         QCOMPARE(edit.echoMode(), QLineEdit::Password);
         QCOMPARE(edit.text(), QStringLiteral("Passw0rd!"));
+    }
+
+    void picturesThatWereDrawnByTheBuild() {
+        QTemporaryDir folder;
+        const auto draw = [&](const QString &name, int side, const QColor &colour) {
+            QImage image(side, side, QImage::Format_ARGB32);
+            image.fill(colour);
+            QVERIFY(image.save(folder.filePath(name), "PNG"));
+        };
+        draw("mark.svg", 10, Qt::red);
+        draw("mark@1.5x.svg", 15, Qt::green);
+        draw("mark@2x.svg", 20, QColor(255, 255, 255, 128));
+        const auto centre = [&](int side, qreal ratio, const QColor &colour = {}) {
+            const QImage image =
+                Icons::pixmap(folder.filePath("mark.svg"), {side, side}, ratio, colour).toImage();
+            return image.pixelColor(image.rect().center());
+        };
+        QCOMPARE(centre(8, 1.0), QColor(Qt::red));
+        QCOMPARE(centre(10, 1.5), QColor(Qt::green));
+        // The largest is enlarged, and a colour takes the place of its own but for what shows through.
+        const QColor tinted = centre(30, 2.0, QColor(40, 80, 120));
+        QCOMPARE(tinted.alpha(), 128);
+        QVERIFY2(qAbs(tinted.red() - 40) <= 1 && qAbs(tinted.blue() - 120) <= 1, qPrintable(tinted.name()));
     }
 
     void dialogThatMustBeAnswered() {
