@@ -36,6 +36,13 @@ CertificateModel::CertificateModel(OperationTargets::List targets, QObject *pare
       m_findings(m_targets.size()),
       m_deviceNotes(m_targets.size()),
       m_isNameless(m_targets.size()) {
+    setItemCount(static_cast<int>(m_targets.size()), true);
+}
+
+/// Not before files are needed: tens of thousands of devices take their time.
+void CertificateModel::readAddresses() {
+    if (!m_byMac.isEmpty())
+        return;
     m_byMac.reserve(static_cast<int>(m_targets.size()));
     for (std::size_t item = 0; item < m_targets.size(); ++item) {
         const quint64 mac = m_targets[item].device->sortKey(DeviceColumn::Mac);
@@ -43,13 +50,14 @@ CertificateModel::CertificateModel(OperationTargets::List targets, QObject *pare
         if (!m_isNameless[item])
             m_byMac.insert(mac, static_cast<int>(item));
     }
-    setItemCount(static_cast<int>(m_targets.size()), true);
 }
 
 void CertificateModel::setNeeds(CertificateNeeds needs) {
     if (m_needs == needs)
         return;
     m_needs = needs;
+    if (needs != CertificateNeeds::Nothing)
+        readAddresses();
     judgeAll();
 }
 
@@ -97,6 +105,7 @@ void CertificateModel::give(CertificatePair &pair, const CertificateFilePtr &fil
 CertificateModel::Files CertificateModel::match(const Files &files) {
     const qint64 now = QDateTime::currentMSecsSinceEpoch();
     Files strangers;
+    readAddresses();
     for (const CertificateFilePtr &file : files) {
         const int owner = ownerOf(file->name);
         if (owner < 0) {

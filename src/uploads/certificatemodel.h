@@ -68,6 +68,7 @@ protected:
     int compare(int left, int right, int column, bool ascending) const override;
 
 private:
+    void readAddresses();
     int ownerOf(const QString &fileName) const;
     static void give(CertificatePair &pair, const CertificateFilePtr &file);
     void judge(std::size_t item, qint64 now);

@@ -24,21 +24,24 @@ private:
     QHash<QString, int> m_places;
 };
 
+/// The most frequent one first.
 QStringList versionsOf(const Index &index, const std::vector<int> &targets, const ModelGroup &group) {
-    std::vector<int> counts(static_cast<std::size_t>(index.versions.size()));
-    QStringList versions;
-    for (const int member : group.targets) {
-        const int version =
-            index.versionOf[static_cast<std::size_t>(targets[static_cast<std::size_t>(member)])];
-        if (counts[static_cast<std::size_t>(version)]++ == 0)
-            versions += index.versions[version];
+    std::vector<int> all;
+    for (const int member : group.targets)
+        all.push_back(index.versionOf[static_cast<std::size_t>(targets[static_cast<std::size_t>(member)])]);
+    std::sort(all.begin(), all.end());
+    std::vector<std::pair<std::ptrdiff_t, const QString *>> counts;
+    for (auto each = all.begin(); each != all.end();) {
+        const auto next = std::upper_bound(each, all.end(), *each);
+        counts.emplace_back(next - each, &index.versions[*each]);
+        each = next;
     }
-    const auto countOf = [&](const QString &version) {
-        return counts[static_cast<std::size_t>(index.versions.indexOf(version))];
-    };
-    std::sort(versions.begin(), versions.end(), [&](const QString &a, const QString &b) {
-        return countOf(a) != countOf(b) ? countOf(a) > countOf(b) : a < b;
+    std::sort(counts.begin(), counts.end(), [](const auto &a, const auto &b) {
+        return a.first != b.first ? a.first > b.first : *a.second < *b.second;
     });
+    QStringList versions;
+    for (const auto &[count, version] : counts)
+        versions += *version;
     return versions;
 }
 
