@@ -22,8 +22,9 @@ set(CPACK_DEBIAN_CLIENT_PACKAGE_NAME norvell-device-manager)
 set(CPACK_DEBIAN_CLIENT_PACKAGE_SECTION admin)
 # Its pictures are drawn by a plugin, which no program is linked with.
 set(CPACK_DEBIAN_CLIENT_PACKAGE_DEPENDS "libqt6svg6 (>= 6.4)")
-set(CPACK_DEBIAN_CLIENT_PACKAGE_RECOMMENDS "qt6-wayland, xdg-utils")
-set(CPACK_DEBIAN_CLIENT_PACKAGE_SUGGESTS norvell-device-manager-emulator)
+# So are the display, the guide's browser and the toolkit's own texts, without which the program still runs.
+set(CPACK_DEBIAN_CLIENT_PACKAGE_RECOMMENDS "qt6-wayland, xdg-utils, qt6-translations-l10n")
+set(CPACK_DEBIAN_CLIENT_PACKAGE_SUGGESTS "norvell-device-manager-emulator, fonts-noto-cjk")
 set(CPACK_DEBIAN_CLIENT_DESCRIPTION "desktop client for fleets of network cameras and recorders
 Shows and runs the devices of a device manager service: one window, one
 service at a time, up to 50000 devices. Devices stand in sites, and their
