@@ -197,7 +197,7 @@ void CertificateBox::pick(CertificateModel::Slot slot) {
 }
 
 void CertificateBox::onMatched(const CertificateModel::Files &files) {
-    for (const CertificateFilePtr &stranger : m_model->match(files))
+    for (const CertificateFilePtr &stranger : m_model->matchFiles(files))
         m_strangers +=
             stranger->error.isEmpty() ? stranger->name : tr("%1 (%2)").arg(stranger->name, stranger->error);
 }

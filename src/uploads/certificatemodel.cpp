@@ -102,7 +102,7 @@ void CertificateModel::give(CertificatePair &pair, const CertificateFilePtr &fil
     pair.refused.reset();
 }
 
-CertificateModel::Files CertificateModel::match(const Files &files) {
+CertificateModel::Files CertificateModel::matchFiles(const Files &files) {
     const qint64 now = QDateTime::currentMSecsSinceEpoch();
     Files strangers;
     readAddresses();

@@ -36,7 +36,7 @@ public:
 
     /// Gives each file to the device whose address its name bears, in place of one that the device had; the
     /// only device gets those that bear no address, too. Returns the files that are nobody's.
-    Files match(const Files &files);
+    Files matchFiles(const Files &files);
     enum class Slot { Certificate, Key };
     /// Gives devices a file, chosen for them by hand. False where it is not of the kind.
     bool assign(const std::vector<int> &items, const CertificateFilePtr &file, Slot slot);

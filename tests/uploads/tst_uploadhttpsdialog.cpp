@@ -104,11 +104,11 @@ private slots:
         QFETCH(QString, name);
         QFETCH(int, owner);
         CertificateModel model(targets(*devices(4)));
-        QCOMPARE(model.match({named(name)}).size(), owner < 0 ? 1u : 0u);
+        QCOMPARE(model.matchFiles({named(name)}).size(), owner < 0 ? 1u : 0u);
         for (int item = 0; item < 4; ++item)
             QCOMPARE(model.pair(item).certificate != nullptr, item == owner);
         CertificateModel alone(targets(*devices(1)));
-        alone.match({named(name)});
+        alone.matchFiles({named(name)});
         QTEST(alone.pair(0).certificate != nullptr, "onlyOnesOwn");
     }
 
