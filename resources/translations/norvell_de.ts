@@ -796,16 +796,8 @@
         <translation>Dies ist kein Zertifikat einer Zertifizierungsstelle.</translation>
     </message>
     <message>
-        <source>CA certificate</source>
-        <translation>CA-Zertifikat</translation>
-    </message>
-    <message>
         <source>Choose a file</source>
         <translation>Datei wählen</translation>
-    </message>
-    <message>
-        <source>Browse…</source>
-        <translation>Durchsuchen…</translation>
     </message>
     <message>
         <source>Choose a CA certificate</source>
@@ -2142,16 +2134,8 @@
         <translation>Dies ist keine gewöhnliche Datei.</translation>
     </message>
     <message>
-        <source>The file has a blank name.</source>
-        <translation>Der Name der Datei ist leer.</translation>
-    </message>
-    <message>
         <source>The file is empty.</source>
         <translation>Die Datei ist leer.</translation>
-    </message>
-    <message>
-        <source>The file is larger than 4 GiB.</source>
-        <translation>Die Datei ist größer als 4 GiB.</translation>
     </message>
     <message>
         <source>The file cannot be read.</source>
@@ -2169,13 +2153,21 @@
         <source>Nothing can be written to this folder.</source>
         <translation>In diesen Ordner kann nichts geschrieben werden.</translation>
     </message>
+    <message>
+        <source>The name of the file is damaged; give it another one.</source>
+        <translation>Der Name der Datei ist beschädigt; bitte einen anderen vergeben.</translation>
+    </message>
+    <message>
+        <source>The name of the file is blank; give it another one.</source>
+        <translation>Der Name der Datei ist leer; bitte einen anderen vergeben.</translation>
+    </message>
+    <message>
+        <source>The file has %1; the server takes %2 at most.</source>
+        <translation>Die Datei hat %1; der Server nimmt höchstens %2 an.</translation>
+    </message>
 </context>
 <context>
     <name>FileField</name>
-    <message>
-        <source>Browse...</source>
-        <translation>Durchsuchen ...</translation>
-    </message>
     <message>
         <source>Drop a file here or browse for it</source>
         <translation>Eine Datei hier ablegen oder nach ihr suchen</translation>
@@ -2183,10 +2175,6 @@
     <message>
         <source>Drop a folder here or browse for it</source>
         <translation>Einen Ordner hier ablegen oder nach ihm suchen</translation>
-    </message>
-    <message>
-        <source>All files (*)</source>
-        <translation>Alle Dateien (*)</translation>
     </message>
     <message>
         <source>Only one file can be taken.</source>
@@ -2207,6 +2195,14 @@
     <message>
         <source>Free: %1</source>
         <translation>Frei: %1</translation>
+    </message>
+    <message>
+        <source>All Files(*)</source>
+        <translation>Alle Dateien(*)</translation>
+    </message>
+    <message>
+        <source>It could not be looked at; choose it again.</source>
+        <translation>Die Auswahl konnte nicht geprüft werden; bitte erneut auswählen.</translation>
     </message>
 </context>
 <context>
@@ -2917,6 +2913,13 @@
     <message>
         <source>username</source>
         <translation>Benutzernamen</translation>
+    </message>
+</context>
+<context>
+    <name>PathField</name>
+    <message>
+        <source>Browse...</source>
+        <translation>Durchsuchen ...</translation>
     </message>
 </context>
 <context>
@@ -4934,60 +4937,6 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     </message>
 </context>
 <context>
-    <name>UploadFile</name>
-    <message>
-        <source>There is no such file.</source>
-        <translation>Die Datei ist nicht vorhanden.</translation>
-    </message>
-    <message>
-        <source>This is a folder, not a file.</source>
-        <translation>Dies ist ein Ordner, keine Datei.</translation>
-    </message>
-    <message>
-        <source>The file cannot be read.</source>
-        <translation>Die Datei kann nicht gelesen werden.</translation>
-    </message>
-    <message>
-        <source>This is no plain file.</source>
-        <translation>Dies ist keine gewöhnliche Datei.</translation>
-    </message>
-    <message>
-        <source>The file is empty.</source>
-        <translation>Die Datei ist leer.</translation>
-    </message>
-    <message>
-        <source>The file has %1; the server takes %2 at most.</source>
-        <translation>Die Datei hat %1; der Server nimmt höchstens %2 an.</translation>
-    </message>
-    <message>
-        <source>The name of the file is blank; give it another one.</source>
-        <translation>Der Name der Datei ist leer; bitte einen anderen vergeben.</translation>
-    </message>
-</context>
-<context>
-    <name>UploadFileField</name>
-    <message>
-        <source>Browse</source>
-        <translation>Durchsuchen</translation>
-    </message>
-    <message>
-        <source>Only one file can be uploaded at a time.</source>
-        <translation>Nur eine Datei kann auf einmal hochgeladen werden.</translation>
-    </message>
-    <message>
-        <source>Only a file of this computer can be uploaded.</source>
-        <translation>Nur eine Datei dieses Computers kann hochgeladen werden.</translation>
-    </message>
-    <message>
-        <source>The file could not be checked; choose it again.</source>
-        <translation>Die Datei konnte nicht geprüft werden; bitte erneut wählen.</translation>
-    </message>
-    <message>
-        <source>Checking...</source>
-        <translation>Wird geprüft ...</translation>
-    </message>
-</context>
-<context>
     <name>UploadFirmwareDialog</name>
     <message>
         <source>Upload Firmware</source>
@@ -5004,14 +4953,6 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>Open Firmware Image</source>
         <translation>Firmware-Image öffnen</translation>
-    </message>
-    <message>
-        <source>All Files(*)</source>
-        <translation>Alle Dateien(*)</translation>
-    </message>
-    <message>
-        <source>Choose an image, or drop it here</source>
-        <translation>Ein Image wählen oder hier ablegen</translation>
     </message>
     <message>
         <source>Firmware file</source>
@@ -5071,6 +5012,10 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>The upload could not be started.</source>
         <translation>Das Hochladen konnte nicht gestartet werden.</translation>
+    </message>
+    <message>
+        <source>One file of up to 4 GiB.</source>
+        <translation>Eine Datei von höchstens 4 GiB.</translation>
     </message>
 </context>
 <context>

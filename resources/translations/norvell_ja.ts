@@ -786,16 +786,8 @@
         <translation>認証局の証明書ではありません。</translation>
     </message>
     <message>
-        <source>CA certificate</source>
-        <translation>CA 証明書</translation>
-    </message>
-    <message>
         <source>Choose a file</source>
         <translation>ファイルを選択</translation>
-    </message>
-    <message>
-        <source>Browse…</source>
-        <translation>参照…</translation>
     </message>
     <message>
         <source>Choose a CA certificate</source>
@@ -2109,16 +2101,8 @@
         <translation>通常のファイルではありません。</translation>
     </message>
     <message>
-        <source>The file has a blank name.</source>
-        <translation>ファイル名が空白です。</translation>
-    </message>
-    <message>
         <source>The file is empty.</source>
         <translation>ファイルが空です。</translation>
-    </message>
-    <message>
-        <source>The file is larger than 4 GiB.</source>
-        <translation>ファイルが 4 GiB を超えています。</translation>
     </message>
     <message>
         <source>The file cannot be read.</source>
@@ -2136,13 +2120,21 @@
         <source>Nothing can be written to this folder.</source>
         <translation>このフォルダーには書き込めません。</translation>
     </message>
+    <message>
+        <source>The name of the file is damaged; give it another one.</source>
+        <translation>ファイル名が壊れています。別の名前を付けてください。</translation>
+    </message>
+    <message>
+        <source>The name of the file is blank; give it another one.</source>
+        <translation>ファイル名が空白です。別の名前を付けてください。</translation>
+    </message>
+    <message>
+        <source>The file has %1; the server takes %2 at most.</source>
+        <translation>ファイルは %1 です。サーバーが受け付けるのは %2 までです。</translation>
+    </message>
 </context>
 <context>
     <name>FileField</name>
-    <message>
-        <source>Browse...</source>
-        <translation>参照...</translation>
-    </message>
     <message>
         <source>Drop a file here or browse for it</source>
         <translation>ここにファイルをドロップするか、参照してください</translation>
@@ -2150,10 +2142,6 @@
     <message>
         <source>Drop a folder here or browse for it</source>
         <translation>ここにフォルダーをドロップするか、参照してください</translation>
-    </message>
-    <message>
-        <source>All files (*)</source>
-        <translation>すべてのファイル (*)</translation>
     </message>
     <message>
         <source>Only one file can be taken.</source>
@@ -2174,6 +2162,14 @@
     <message>
         <source>Free: %1</source>
         <translation>空き: %1</translation>
+    </message>
+    <message>
+        <source>All Files(*)</source>
+        <translation>すべてのファイル(*)</translation>
+    </message>
+    <message>
+        <source>It could not be looked at; choose it again.</source>
+        <translation>確認できませんでした。もう一度選択してください。</translation>
     </message>
 </context>
 <context>
@@ -2876,6 +2872,13 @@
     <message>
         <source>username</source>
         <translation>ユーザー名</translation>
+    </message>
+</context>
+<context>
+    <name>PathField</name>
+    <message>
+        <source>Browse...</source>
+        <translation>参照...</translation>
     </message>
 </context>
 <context>
@@ -4882,60 +4885,6 @@ What is done to devices shows here.</source>
     </message>
 </context>
 <context>
-    <name>UploadFile</name>
-    <message>
-        <source>There is no such file.</source>
-        <translation>ファイルが存在しません。</translation>
-    </message>
-    <message>
-        <source>This is a folder, not a file.</source>
-        <translation>ファイルではなくフォルダーです。</translation>
-    </message>
-    <message>
-        <source>The file cannot be read.</source>
-        <translation>ファイルを読み取れません。</translation>
-    </message>
-    <message>
-        <source>This is no plain file.</source>
-        <translation>通常のファイルではありません。</translation>
-    </message>
-    <message>
-        <source>The file is empty.</source>
-        <translation>ファイルが空です。</translation>
-    </message>
-    <message>
-        <source>The file has %1; the server takes %2 at most.</source>
-        <translation>ファイルは %1 です。サーバーが受け付けるのは %2 までです。</translation>
-    </message>
-    <message>
-        <source>The name of the file is blank; give it another one.</source>
-        <translation>ファイル名が空白です。別の名前を付けてください。</translation>
-    </message>
-</context>
-<context>
-    <name>UploadFileField</name>
-    <message>
-        <source>Browse</source>
-        <translation>参照</translation>
-    </message>
-    <message>
-        <source>Only one file can be uploaded at a time.</source>
-        <translation>一度にアップロードできるファイルは 1 つだけです。</translation>
-    </message>
-    <message>
-        <source>Only a file of this computer can be uploaded.</source>
-        <translation>アップロードできるのはこのコンピューターのファイルのみです。</translation>
-    </message>
-    <message>
-        <source>The file could not be checked; choose it again.</source>
-        <translation>ファイルを確認できませんでした。もう一度選択してください。</translation>
-    </message>
-    <message>
-        <source>Checking...</source>
-        <translation>確認しています...</translation>
-    </message>
-</context>
-<context>
     <name>UploadFirmwareDialog</name>
     <message>
         <source>Upload Firmware</source>
@@ -4952,14 +4901,6 @@ What is done to devices shows here.</source>
     <message>
         <source>Open Firmware Image</source>
         <translation>ファームウェアイメージを開く</translation>
-    </message>
-    <message>
-        <source>All Files(*)</source>
-        <translation>すべてのファイル(*)</translation>
-    </message>
-    <message>
-        <source>Choose an image, or drop it here</source>
-        <translation>イメージを選択するか、ここにドロップ</translation>
     </message>
     <message>
         <source>Firmware file</source>
@@ -5018,6 +4959,10 @@ What is done to devices shows here.</source>
     <message>
         <source>The upload could not be started.</source>
         <translation>アップロードを開始できませんでした。</translation>
+    </message>
+    <message>
+        <source>One file of up to 4 GiB.</source>
+        <translation>4 GiB までのファイル 1 つ。</translation>
     </message>
 </context>
 <context>
