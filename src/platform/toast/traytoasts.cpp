@@ -22,7 +22,10 @@ public:
         });
         m_icon.setToolTip(shortApplicationName(applicationName));
         // Without a picture the tray takes neither icon nor messages.
-        m_icon.setIcon(QApplication::style()->standardIcon(QStyle::SP_MessageBoxInformation));
+        const QIcon program = QApplication::windowIcon();
+        m_icon.setIcon(program.isNull()
+                           ? QApplication::style()->standardIcon(QStyle::SP_MessageBoxInformation)
+                           : program);
         m_icon.show();
         return true;
     }
