@@ -9,7 +9,6 @@
 #include "isolatedroot.h"
 #include "taskinfopool.h"
 #include "uploadieeedialog.h"
-#include "uploadtaskmgr.h"
 
 #include <QDateTime>
 #include <QLabel>
@@ -48,7 +47,7 @@ private slots:
         QTRY_VERIFY(button(dialog)->isEnabled());
         button(dialog)->click();
         QTRY_VERIFY(!dialog);
-        UploadTaskMgr::instance().handlingTask();
+        QTRY_COMPARE(m_service.rawSentTo("/v1/ie_peap").size(), 1u);
         QVERIFY(m_service.rawSentTo("/v1/ie_peap").back().find("ca_") != std::string::npos);
         const JSON device = m_service.sentTo("/v1/task/init").back()["devices"][0];
         QCOMPARE(stringMember(device, "identity"), QStringLiteral("me"));
@@ -82,7 +81,7 @@ private slots:
         QTest::keyClicks(dialog->findChild<QLineEdit *>("identityEdit"), "me");
         button(dialog)->click();
         QTRY_VERIFY(!dialog);
-        UploadTaskMgr::instance().handlingTask();
+        QTRY_COMPARE(m_service.rawSentTo("/v1/ie_tls").size(), 1u);
         const std::string form = m_service.rawSentTo("/v1/ie_tls").back();
         QVERIFY(form.find("pkey_02:00:00:00:00:01") != form.npos);
         QVERIFY(form.find("ENCRYPTED PRIVATE KEY") != form.npos);
