@@ -213,9 +213,9 @@ void measureCertificates(const OperationTargets::List &targets, const DeviceSnap
     auto *model = https->findChild<CertificateModel *>();
     for (std::size_t i = 0; i < portions.size(); ++i) {
         if (i == 0 || i + 1 == portions.size())
-            step("HTTPS: files", [&] { model->match(portions[i]); });
+            step("HTTPS: files", [&] { model->matchFiles(portions[i]); });
         else
-            model->match(portions[i]);
+            model->matchFiles(portions[i]);
     }
     step("HTTPS: mode", [&] { part<QComboBox>(https, "modeComboBox")->setCurrentIndex(1); });
     acceptTimed("HTTPS: apply", https, "applyButton");
