@@ -40,11 +40,10 @@ Json bodyOf(const Endpoint &endpoint, const Incoming &incoming) {
 } // namespace
 
 Dispatcher::Dispatcher(Service &service) : m_service(service) {
-    for (const auto &family :
-         {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(), taskEndpoints(),
-          alarmEndpoints(), logEndpoints(), commandEndpoints(), operationEndpoints(),
-          configurationEndpoints(), exportEndpoints(), uploadEndpoints(), certificateEndpoints(),
-          orbEndpoints()}) {
+    for (const auto &family : {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(),
+                               taskEndpoints(), alarmEndpoints(), logEndpoints(), commandEndpoints(),
+                               operationEndpoints(), configurationEndpoints(), exportEndpoints(),
+                               uploadEndpoints(), certificateEndpoints(), orbEndpoints()}) {
         for (const Endpoint &endpoint : family) {
             m_endpoints.emplace(endpoint.path, endpoint);
         }

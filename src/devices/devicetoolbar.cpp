@@ -156,10 +156,9 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
                             {"uploadConfigurationAction", tr("Upload Configuration File")}});
     auto *certificateMenu = new PopupMenu(uploadMenu);
     certificateMenu->setTitle(tr("Upload Certificate"));
-    addEntries(certificateMenu,
-               {{"uploadHttpsAction", tr("HTTPS")},
-                {"uploadIeeeAction", tr("IEEE 802.1x")},
-                {"certificateListAction", tr("Certificates in use")}});
+    addEntries(certificateMenu, {{"uploadHttpsAction", tr("HTTPS")},
+                                 {"uploadIeeeAction", tr("IEEE 802.1x")},
+                                 {"certificateListAction", tr("Certificates in use")}});
     uploadMenu->addMenu(certificateMenu);
     button(QStringLiteral("uploadButton"))->setMenu(uploadMenu);
     auto *configurationMenu = new PopupMenu(this);
