@@ -23,7 +23,6 @@ namespace {
 
 constexpr int tasks = 10000;
 constexpr int devicesPerTask = 100;
-constexpr int changed = 100;
 constexpr int texts = 100000;
 constexpr const char *account = "admin";
 

@@ -30,7 +30,7 @@ void nameIt(X509 *certificate) {
 
 ServerIdentity makeServerIdentity() {
     ServerIdentity identity;
-    identity.key.reset(EVP_EC_gen("P-256"));
+    identity.key.reset(EVP_PKEY_Q_keygen(nullptr, nullptr, "EC", "P-256"));
     identity.certificate.reset(X509_new());
     X509 *certificate = identity.certificate.get();
     require(identity.key && certificate);

@@ -35,7 +35,7 @@ std::string written(Write write) {
 }
 
 Identity makeIdentity() {
-    EVP_PKEY *key = EVP_EC_gen("P-256");
+    EVP_PKEY *key = EVP_PKEY_Q_keygen(nullptr, nullptr, "EC", "P-256");
     X509 *certificate = X509_new();
     ASN1_TIME_set(X509_getm_notBefore(certificate), 1700000000);
     ASN1_TIME_set(X509_getm_notAfter(certificate), 1900000000);

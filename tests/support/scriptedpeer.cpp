@@ -27,7 +27,8 @@ void require(bool done, const char *what) {
 
 /// A certificate for this run; clients of the service do not check it.
 void useOwnCertificate(SSL_CTX *context) {
-    const std::unique_ptr<EVP_PKEY, decltype(&EVP_PKEY_free)> key(EVP_EC_gen("P-256"), &EVP_PKEY_free);
+    const std::unique_ptr<EVP_PKEY, decltype(&EVP_PKEY_free)> key(
+        EVP_PKEY_Q_keygen(nullptr, nullptr, "EC", "P-256"), &EVP_PKEY_free);
     const std::unique_ptr<X509, decltype(&X509_free)> certificate(X509_new(), &X509_free);
     X509_set_version(certificate.get(), X509_VERSION_3);
     X509_gmtime_adj(X509_getm_notBefore(certificate.get()), 0);

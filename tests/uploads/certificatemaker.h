@@ -23,7 +23,7 @@ using Certificate = std::unique_ptr<X509, Freed<X509_free>>;
 using Bio = std::unique_ptr<BIO, Freed<BIO_free_all>>;
 
 inline Key makeKey() {
-    return Key(EVP_EC_gen("P-256"));
+    return Key(EVP_PKEY_Q_keygen(nullptr, nullptr, "EC", "P-256"));
 }
 
 /// Signed with its own key; the days count from now.
