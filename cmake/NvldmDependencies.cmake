@@ -1,6 +1,13 @@
 # Everything the project calls and did not write: packages of the distribution, never copies.
 
-find_package(Qt6 6.4 REQUIRED COMPONENTS Core Gui Widgets Network LinguistTools)
+find_package(Qt6 6.4 REQUIRED COMPONENTS Core Gui Widgets Network)
+# The tools of the translations run in the build: when that is for another system, they are the building machine's.
+if(CMAKE_CROSSCOMPILING)
+    find_package(Qt6LinguistTools 6.4 REQUIRED
+        PATHS "${QT_HOST_PATH_CMAKE_DIR}" NO_DEFAULT_PATH NO_CMAKE_FIND_ROOT_PATH)
+else()
+    find_package(Qt6LinguistTools 6.4 REQUIRED)
+endif()
 if(UNIX AND NOT APPLE)
     find_package(Qt6 6.4 REQUIRED COMPONENTS DBus)
 endif()
@@ -18,6 +25,7 @@ find_package(Threads REQUIRED)
 if(WIN32)
     find_package(httplib CONFIG REQUIRED)
     find_package(yaml-cpp CONFIG REQUIRED)
+    set(yamlcpp_VERSION ${yaml-cpp_VERSION})
     add_library(nvldm::httplib ALIAS httplib::httplib)
     if(TARGET yaml-cpp::yaml-cpp)
         add_library(nvldm::yamlcpp ALIAS yaml-cpp::yaml-cpp)

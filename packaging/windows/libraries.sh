@@ -65,7 +65,8 @@ make_with_cmake() {
     unpack_source "$name" || { echo "The source package $name cannot be had." >&2; return 1; }
     is_made "$name" "$@" && return 0
     say "making $name for Windows"
-    cmake -S "$cache/sources/$name" -B "$cache/build/$name" -G Ninja -DCMAKE_BUILD_TYPE=Release \
+    # What an interrupted run has configured may name another tree's toolchain file; its objects are still good.
+    cmake --fresh -S "$cache/sources/$name" -B "$cache/build/$name" -G Ninja -DCMAKE_BUILD_TYPE=Release \
         -DCMAKE_TOOLCHAIN_FILE="$toolchain" -DNVLDM_WINDOWS_SYSROOT="$sysroot" \
         -DCMAKE_INSTALL_PREFIX="$sysroot" -DCMAKE_INSTALL_LIBDIR=lib "$@" >"$cache/$name.log" 2>&1 &&
         cmake --build "$cache/build/$name" >>"$cache/$name.log" 2>&1 &&
