@@ -1,4 +1,4 @@
-# `cpack` makes a package of the client and one of the emulator.
+# `cpack` makes a package of the client and one of the emulator, and beside each one what was stripped off it.
 
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME norvell-device-manager)
@@ -6,7 +6,7 @@ set(CPACK_PACKAGE_VENDOR "Norvell Inc.")
 set(CPACK_PACKAGE_CONTACT "Norvell Inc. <packages@norvell.example>")
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})
 set(CPACK_VERBATIM_VARIABLES ON)
-set(CPACK_STRIP_FILES ON)
+set(CPACK_DEBIAN_DEBUGINFO_PACKAGE ON)
 set(CPACK_COMPONENTS_ALL client)
 if(NVLDM_BUILD_EMULATOR)
     list(APPEND CPACK_COMPONENTS_ALL emulator)

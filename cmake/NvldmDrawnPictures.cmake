@@ -26,6 +26,7 @@ function(nvldm_draw_pictures target base list)
             DEPENDS "${source}" VERBATIM)
         list(APPEND drawings ${made})
     endforeach()
-    qt_add_resources(${target} "nvldm_drawings" PREFIX "/" BASE "${drawn}" OPTIONS --no-compress FILES ${drawings})
+    qt_add_resources(${target} "nvldm_drawings" PREFIX "/" BASE "${drawn}" OPTIONS --no-compress --format-version 1
+        FILES ${drawings})
     set(${list} "${kept}" PARENT_SCOPE)
 endfunction()

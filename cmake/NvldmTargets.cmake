@@ -17,10 +17,11 @@ function(nvldm_compile_options target)
 endfunction()
 
 # What is given to others names no folder of the machine that built it, so that the same sources make the same
-# bytes anywhere; on Linux it carries the hardening that the distribution expects of its programs.
+# bytes anywhere; on Linux it carries the hardening that the distribution expects of its programs. The places in a
+# crash's text are looked up in what packaging takes off the programs and keeps.
 function(nvldm_release_options target)
     target_compile_options(${target} PRIVATE
-        "$<$<CONFIG:Release>:-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=;-ffile-prefix-map=${PROJECT_BINARY_DIR}/=>")
+        "$<$<CONFIG:Release>:-g1;-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=;-ffile-prefix-map=${PROJECT_BINARY_DIR}/=>")
     if(NOT WIN32)
         target_compile_options(${target} PRIVATE
             "$<$<CONFIG:Release>:-fstack-protector-strong;-Wp,-D_FORTIFY_SOURCE=2>")

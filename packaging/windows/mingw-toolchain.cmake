@@ -23,5 +23,10 @@ set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
 
+# Programs and libraries carry no time, so that the same sources give the same bytes.
+foreach(kind EXE SHARED MODULE)
+    set(CMAKE_${kind}_LINKER_FLAGS_INIT "-Wl,--no-insert-timestamp")
+endforeach()
+
 # Windows 10 and later; the older interfaces lack what the manifest asks for.
 add_compile_definitions(_WIN32_WINNT=0x0A00 WINVER=0x0A00)
