@@ -122,7 +122,7 @@ Control::~Control() {
 
 void Control::readInput() {
     std::string pending;
-    while (!m_stop.raised()) {
+    while (!m_stop.raised() && !m_stopWasAsked) {
         // Waking up now and then keeps the reader from outliving the rest of the program.
         const auto chunk = platform::readInput(std::chrono::milliseconds(200));
         if (!chunk) {
@@ -149,6 +149,8 @@ std::string Control::run(const Words &words) {
     const std::string command = words.empty() ? std::string() : words[0];
     if (command == "stop" && words.size() == 1) {
         platform::requestStop();
+        // The next line would be waited for where a system cannot tell whether there is one.
+        m_stopWasAsked = true;
         return "ok";
     }
     if (command == "counts" && words.size() == 1) {

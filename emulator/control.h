@@ -44,6 +44,7 @@ private:
     Service &m_service;
     Faults &m_faults;
     const StopSignal &m_stop;
+    bool m_stopWasAsked = false; ///< of the reading thread
     std::thread m_reader;
 };
 
