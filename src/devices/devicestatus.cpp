@@ -72,6 +72,16 @@ QString text(DeviceStatusCode code) {
                                 : blanks;
 }
 
+QString longestText() {
+    QString longest;
+    for (std::size_t code = 0; code < looks.size(); ++code) {
+        const QString each = text(static_cast<DeviceStatusCode>(code));
+        if (each.size() > longest.size())
+            longest = each;
+    }
+    return longest;
+}
+
 const QIcon &icon(DeviceStatusCode code) {
     static const std::array<QIcon, looks.size()> icons = loadIcons();
     static const QIcon none;

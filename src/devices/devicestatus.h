@@ -30,6 +30,8 @@ DeviceStatusCode codeOf(std::string_view connect, std::string_view auth, std::st
 
 /// The text of a code as the status column shows it, behind two blanks; just these for a code that is none.
 QString text(DeviceStatusCode code);
+/// The one of all texts with most letters.
+QString longestText();
 
 /// The icon of a code, or a null icon for a code that is none. User-interface thread.
 const QIcon &icon(DeviceStatusCode code);

@@ -266,7 +266,8 @@ void MainConsoleTable::fitColumns() {
     const QFontMetrics metrics = fontMetrics();
     const QFontMetrics headerMetrics(horizontalHeader()->font());
     for (int column = 0; column < deviceColumnCount; ++column) {
-        QString longest;
+        // Every device may come into every state.
+        QString longest = column == 0 ? DeviceStatus::longestText() : QString();
         for (int row = 0; row < std::min(rowCount(), widthSample); ++row) {
             const QString text = cellData(row, column, Qt::DisplayRole).toString();
             if (text.size() > longest.size())

@@ -10,6 +10,7 @@
 #include <QStyledItemDelegate>
 #include <QToolTip>
 
+#include <algorithm>
 #include <limits>
 #include <vector>
 
@@ -56,7 +57,10 @@ private:
         }
         if (shown == text.size() && sum <= width)
             return text;
-        return QFontMetrics(font).elidedText(text.left(longestShownText).simplified(), Qt::ElideRight, width);
+        // Blanks in front stay: a text that is cut begins where the others do.
+        QString line = text.left(longestShownText);
+        std::replace_if(line.begin(), line.end(), [](QChar each) { return each.isSpace(); }, QChar(u' '));
+        return QFontMetrics(font).elidedText(line, Qt::ElideRight, width);
     }
 
     void measureLetters(const QFont &font) const {
