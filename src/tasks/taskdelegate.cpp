@@ -7,7 +7,6 @@
 #include "tasktype.h"
 #include "theme.h"
 
-#include <QCoreApplication>
 #include <QPainter>
 
 namespace {
