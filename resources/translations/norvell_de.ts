@@ -483,6 +483,13 @@
     </message>
 </context>
 <context>
+    <name>AlarmModel</name>
+    <message>
+        <source>Unread</source>
+        <translation>Ungelesen</translation>
+    </message>
+</context>
+<context>
     <name>AlarmPanel</name>
     <message>
         <source>Copy</source>
@@ -2930,6 +2937,16 @@
     </message>
 </context>
 <context>
+    <name>QueueStrips</name>
+    <message numerus="yes">
+        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <translation>
+            <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
+            <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
     <name>QuickSetupDialog</name>
     <message>
         <source>Quick Setup</source>
@@ -3150,8 +3167,8 @@
 <context>
     <name>Rollout</name>
     <message>
-        <source>The client was closed before it began.</source>
-        <translation>Der Client wurde vor dem Beginn geschlossen.</translation>
+        <source>The session ended before it began.</source>
+        <translation>Die Sitzung war vor dem Beginn zu Ende.</translation>
     </message>
 </context>
 <context>
@@ -3228,6 +3245,13 @@
         <translation>
             <numerusform>Die Sitzung ist beendet, und mit ihr die Verteilung von %1. Gesendete Wellen laufen weiter.</numerusform>
             <numerusform>Die Sitzung ist beendet, und mit ihr die Verteilungen von %1. Gesendete Wellen laufen weiter.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The server has ended the session. The rollout(s) of %1 go on after the next log-in.</source>
+        <translation>
+            <numerusform>Der Server hat die Sitzung beendet. Die Verteilung von %1 geht nach der nächsten Anmeldung weiter.</numerusform>
+            <numerusform>Der Server hat die Sitzung beendet. Die Verteilungen von %1 gehen nach der nächsten Anmeldung weiter.</numerusform>
         </translation>
     </message>
 </context>
@@ -4176,20 +4200,6 @@
     </message>
 </context>
 <context>
-    <name>TaskDelegate</name>
-    <message>
-        <source>Scheduled for %1</source>
-        <translation>Geplant für %1</translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) · %1</source>
-        <translation>
-            <numerusform>%n Gerät · %1</numerusform>
-            <numerusform>%n Geräte · %1</numerusform>
-        </translation>
-    </message>
-</context>
-<context>
     <name>TaskPanel</name>
     <message>
         <source>Copy</source>
@@ -4424,6 +4434,13 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>an unknown time</source>
         <translation>unbekannter Zeitpunkt</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) · %1</source>
+        <translation>
+            <numerusform>%n Gerät · %1</numerusform>
+            <numerusform>%n Geräte · %1</numerusform>
+        </translation>
     </message>
 </context>
 <context>

@@ -475,6 +475,13 @@
     </message>
 </context>
 <context>
+    <name>AlarmModel</name>
+    <message>
+        <source>Unread</source>
+        <translation>未読</translation>
+    </message>
+</context>
+<context>
     <name>AlarmPanel</name>
     <message>
         <source>Copy</source>
@@ -2889,6 +2896,15 @@
     </message>
 </context>
 <context>
+    <name>QueueStrips</name>
+    <message numerus="yes">
+        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <translation>
+            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
     <name>QuickSetupDialog</name>
     <message>
         <source>Quick Setup</source>
@@ -3108,8 +3124,8 @@
 <context>
     <name>Rollout</name>
     <message>
-        <source>The client was closed before it began.</source>
-        <translation>開始前にクライアントが閉じられました。</translation>
+        <source>The session ended before it began.</source>
+        <translation>開始前にセッションが終了しました。</translation>
     </message>
 </context>
 <context>
@@ -3185,6 +3201,12 @@
         <source>The session has ended, and with it the rollout(s) of %1. Waves that were sent go on.</source>
         <translation>
             <numerusform>セッションが終了し、%1 の展開も終了しました。送信済みの段階は継続します。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The server has ended the session. The rollout(s) of %1 go on after the next log-in.</source>
+        <translation>
+            <numerusform>サーバーがセッションを終了しました。%1 の展開は次回のログイン後に再開します。</numerusform>
         </translation>
     </message>
 </context>
@@ -4128,19 +4150,6 @@
     </message>
 </context>
 <context>
-    <name>TaskDelegate</name>
-    <message>
-        <source>Scheduled for %1</source>
-        <translation>%1 に予定</translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) · %1</source>
-        <translation>
-            <numerusform>%n 台のデバイス · %1</numerusform>
-        </translation>
-    </message>
-</context>
-<context>
     <name>TaskPanel</name>
     <message>
         <source>Copy</source>
@@ -4374,6 +4383,12 @@ What is done to devices shows here.</source>
     <message>
         <source>an unknown time</source>
         <translation>時刻不明</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) · %1</source>
+        <translation>
+            <numerusform>%n 台のデバイス · %1</numerusform>
+        </translation>
     </message>
 </context>
 <context>

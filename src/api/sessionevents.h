@@ -11,6 +11,8 @@ public:
 
     /// Tells that the service does not know the session of this generation any more; once a session.
     void reportLost(quint64 generation);
+    /// True for a session that the service has ended, as told last.
+    bool wasLost(quint64 generation) const { return generation != 0 && generation == m_lastLost; }
 
 signals:
     /// The service has ended the present session: log off here, without asking it again.

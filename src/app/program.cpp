@@ -4,6 +4,7 @@
 #include "crashreport.h"
 #include "framelesswindow.h"
 #include "interfacelanguage.h"
+#include "lastfolder.h"
 #include "localstore.h"
 #include "mainwindow.h"
 #include "messagelog.h"
@@ -81,6 +82,7 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         QGuiApplication::setApplicationDisplayName(QCoreApplication::applicationName());
         QApplication::setWindowIcon(applicationIcon());
         Theme::installFonts();
+        LastFolder::load();
         InterfaceLanguage language;
         language.use(CLocalStore::instance().uiLanguage());
         application.setStyleSheet(Theme::styleSheet());

@@ -6,9 +6,9 @@
 #include "discoveredmodel.h"
 #include "filedialogs.h"
 #include "icons.h"
+#include "lastfolder.h"
 #include "pagereader.h"
 #include "sitelist.h"
-#include "storewriter.h"
 #include "transientmessage.h"
 #include "ui_adddevicedialog.h"
 
@@ -70,10 +70,6 @@ void logImported(const std::vector<DeviceRecordPtr> &imported, const std::vector
     });
 }
 
-QString folderOfFiles() {
-    return CLocalStore::instance().defaultFilePath();
-}
-
 } // namespace
 
 AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *parent)
@@ -85,14 +81,13 @@ AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *pare
     setObjectName(QStringLiteral("AddDeviceDialog"));
     setWindowTitle(tr("Add Device"));
     m_askOpenPath = [this](const auto &chosen) {
-        FileDialogs::askOpenPath(this, tr("Open File"), folderOfFiles(), QStringLiteral("csv File(*.csv)"),
+        FileDialogs::askOpenPath(this, tr("Open File"), LastFolder::path(), QStringLiteral("csv File(*.csv)"),
                                  chosen);
     };
     m_askSavePath = [this](const auto &chosen) {
-        const QString name = tr("Devices") + QStringLiteral(".csv");
-        const QString folder = folderOfFiles();
-        FileDialogs::askSavePath(this, tr("Save as"), folder.isEmpty() ? name : folder + u'/' + name,
-                                 QStringLiteral("csv File(*.csv)"), QStringLiteral("csv"), chosen);
+        const QString suggestion = LastFolder::file(tr("Devices") + QStringLiteral(".csv"));
+        FileDialogs::askSavePath(this, tr("Save as"), suggestion, QStringLiteral("csv File(*.csv)"),
+                                 QStringLiteral("csv"), chosen);
     };
     m_ui->discoveredTable->showList(m_model, {150, 170, 140, 170, 110}, DiscoveredModel::IpColumn);
     m_ui->searchEdit->addAction(
@@ -189,7 +184,7 @@ void AddDeviceDialog::onFound(const DeviceDiscovery::Search &search,
 /// Runs a job on a file beside the turn of the requests.
 template <typename Work, typename Done>
 void AddDeviceDialog::runOnFile(const QString &path, Work work, Done done) {
-    StoreWriter::post([path] { CLocalStore::instance().setDefaultFilePath(QFileInfo(path).absolutePath()); });
+    LastFolder::rememberFile(path);
     m_warning.setText({});
     m_onFile = true;
     const auto ended = [this](JobEnd end) {

@@ -1,5 +1,6 @@
 #include "deviceoperations.h"
 
+#include "devicesleft.h"
 #include "messagelog.h"
 #include "pagereader.h"
 #include "servicesession.h"
@@ -39,36 +40,18 @@ Outcome makeTask(ServiceSession &session, const QString &type, const QStringList
     return {result == ApiOk && tid.isEmpty() ? unsigned{ApiMissingData} : result, tid, {}};
 }
 
-/// Takes out the devices that the service has no more, and returns them.
-QStringList takeVanished(ServiceSession &session, QStringList &deviceIds) {
-    QSet<QString> known;
-    const unsigned result =
-        PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](const JSON &page) {
-            for (const JSON &device : page)
-                known.insert(stringMember(device, "id"));
-        });
-    QStringList vanished;
-    if (result == ApiOk)
-        deviceIds.removeIf([&](const QString &id) {
-            const bool gone = !known.contains(id);
-            if (gone)
-                vanished += id;
-            return gone;
-        });
-    return vanished;
-}
-
 /// Does something for devices, and once more for the rest when the service refuses because some of them are
-/// gone meanwhile: nobody wants a thousand devices left alone for one that was removed.
+/// gone meanwhile.
 template <typename Attempt>
 Outcome withoutVanished(ServiceSession &session, QStringList &deviceIds, Attempt attempt) {
     Outcome outcome = attempt();
     if (outcome.result != ApiServerError)
         return outcome;
-    const QStringList vanished = takeVanished(session, deviceIds);
-    if (!vanished.isEmpty() && !deviceIds.isEmpty())
+    const DevicesLeft left = DevicesLeft::among(deviceIds, session);
+    deviceIds = left.ids;
+    if (left.isWorthATry())
         outcome = attempt();
-    outcome.vanished = vanished;
+    outcome.vanished = left.vanished;
     return outcome;
 }
 

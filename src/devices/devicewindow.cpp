@@ -14,6 +14,7 @@
 #include "devicetoolbar.h"
 #include "filedialogs.h"
 #include "inventoryupdater.h"
+#include "lastfolder.h"
 #include "mainconsoletable.h"
 #include "messagelog.h"
 #include "noticebar.h"
@@ -24,14 +25,12 @@
 #include "setpassworddialog.h"
 #include "sitecommit.h"
 #include "sitetree.h"
-#include "storewriter.h"
 #include "targetbox.h"
 #include "taskinfopool.h"
 #include "transientmessage.h"
 
 #include <QComboBox>
 #include <QDebug>
-#include <QFileInfo>
 #include <QHBoxLayout>
 #include <QHeaderView>
 #include <QLineEdit>
@@ -391,15 +390,13 @@ void DeviceWindow::ask(ConfirmDialog::Kind kind, const std::function<void()> &ag
 }
 
 void DeviceWindow::exportDeviceList() {
-    const QString folder = CLocalStore::instance().defaultFilePath();
-    const QString name = tr("Device List") + QStringLiteral(".csv");
-    FileDialogs::askSavePath(
-        this, tr("Save as"), folder.isEmpty() ? name : folder + QLatin1Char('/') + name,
-        tr("CSV files (*.csv)"), QStringLiteral("csv"), [this](const QString &path) {
-            StoreWriter::post(
-                [path] { CLocalStore::instance().setDefaultFilePath(QFileInfo(path).absolutePath()); });
-            m_actions->exportList(path, m_inventory.snapshot(), m_tabs->currentTable()->shownDevices());
-        });
+    const QString suggestion = LastFolder::file(tr("Device List") + QStringLiteral(".csv"));
+    FileDialogs::askSavePath(this, tr("Save as"), suggestion, tr("CSV files (*.csv)"), QStringLiteral("csv"),
+                             [this](const QString &path) {
+                                 LastFolder::rememberFile(path);
+                                 m_actions->exportList(path, m_inventory.snapshot(),
+                                                       m_tabs->currentTable()->shownDevices());
+                             });
 }
 
 QHash<QString, QString> DeviceWindow::siteNames() const {

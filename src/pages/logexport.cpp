@@ -42,10 +42,15 @@ bool writeLines(QSaveFile &file, const LogList &list, const std::vector<int> &pl
 
 } // namespace
 
-bool write(const QString &path, const LogList &list, const std::vector<int> &places) {
+bool write(const QString &path, const LogList &list, const std::vector<int> &places,
+           const std::function<void()> &opened) {
     QSaveFile file(path);
-    if (file.open(QIODevice::WriteOnly) && writeLines(file, list, places) && file.commit())
-        return true;
+    if (file.open(QIODevice::WriteOnly)) {
+        if (opened)
+            opened();
+        if (writeLines(file, list, places) && file.commit())
+            return true;
+    }
     qWarning("The log could not be exported: %s", qUtf8Printable(file.errorString()));
     return false;
 }

@@ -2,6 +2,7 @@
 
 #include "filedialogs.h"
 #include "icons.h"
+#include "lastfolder.h"
 #include "logchart.h"
 #include "logexport.h"
 #include "logpager.h"
@@ -11,13 +12,16 @@
 #include "statepage.h"
 #include "waitingspinner.h"
 
+#include <QCoreApplication>
 #include <QDebug>
 #include <QHBoxLayout>
 #include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPlainTextEdit>
+#include <QPointer>
 #include <QPushButton>
+#include <QScopedValueRollback>
 #include <QShortcut>
 #include <QSignalBlocker>
 #include <QSplitter>
@@ -51,13 +55,12 @@ LogWindow::LogWindow(QWidget *parent)
       m_runner(new (std::nothrow) NetTask(NetTask::Turn::Beside)),
       m_list(noEntries()),
       m_sidebar(new LogSidebar(this)) {
+    qDebug("LogWindow constructor");
     setObjectName(QStringLiteral("LogWindow"));
     m_askSavePath = [this](const std::function<void(const QString &)> &chosen) {
-        const QString folder = CLocalStore::instance().defaultFilePath();
-        const QString name = tr("Log") + QStringLiteral(".csv");
-        FileDialogs::askSavePath(this, tr("Save as"),
-                                 folder.isEmpty() ? name : folder + QLatin1Char('/') + name,
-                                 tr("CSV files (*.csv)"), QStringLiteral("csv"), chosen);
+        const QString suggestion = LastFolder::file(tr("Log") + QStringLiteral(".csv"));
+        FileDialogs::askSavePath(this, tr("Save as"), suggestion, tr("CSV files (*.csv)"),
+                                 QStringLiteral("csv"), chosen);
     };
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
@@ -69,7 +72,9 @@ LogWindow::LogWindow(QWidget *parent)
     showState();
 }
 
-LogWindow::~LogWindow() = default;
+LogWindow::~LogWindow() {
+    qDebug("LogWindow destructor");
+}
 
 QWidget *LogWindow::buildContent() {
     auto *content = new QWidget(this);
@@ -205,7 +210,8 @@ void LogWindow::reset() {
     m_content = Content::None;
     m_bins = {};
     {
-        const QSignalBlocker blockers[] = {QSignalBlocker(m_sidebar), QSignalBlocker(m_search)};
+        const QSignalBlocker blocker(m_sidebar);
+        const QScopedValueRollback clearing(m_clearing, true);
         m_sidebar->reset();
         m_search->clear();
     }
@@ -299,12 +305,13 @@ void LogWindow::updateUI() {
 }
 
 void LogWindow::onFilterChanged() {
-    updateUI();
+    if (!m_clearing)
+        updateUI();
 }
 
 void LogWindow::clearFilters() {
     {
-        const QSignalBlocker blockers[] = {QSignalBlocker(m_sidebar), QSignalBlocker(m_search)};
+        const QScopedValueRollback clearing(m_clearing, true);
         m_sidebar->clearFilters();
         m_search->clear();
     }
@@ -384,10 +391,18 @@ void LogWindow::on_exportButton_clicked() {
 }
 
 void LogWindow::exportTo(const QString &path) {
-    emit export_button_clicked(tr("Exporting..."));
+    LastFolder::rememberFile(path);
+    const auto opened = [window = QPointer(this)] {
+        QMetaObject::invokeMethod(qApp, [window] {
+            if (window)
+                emit window->export_button_clicked(tr("Exporting..."));
+        });
+    };
     m_exporting = NetJob::post(
         NetJob::createRunner("exporting the log", NetTask::Turn::Beside), this,
-        [path, list = m_list, places = m_places] { return LogExport::write(path, *list, places); },
+        [path, list = m_list, places = m_places, opened] {
+            return LogExport::write(path, *list, places, opened);
+        },
         [this](bool written) {
             emit export_file_generated(written ? tr("Exported successfully!") : tr("Failed to export."),
                                        written);

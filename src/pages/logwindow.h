@@ -96,6 +96,7 @@ private:
     Content m_content = Content::None;
     bool m_searching = false;
     bool m_exporting = false;
+    bool m_clearing = false; ///< the filters, which is one change
 
     LogSidebar *m_sidebar;
     QLabel *m_count = nullptr;

@@ -142,6 +142,7 @@ Reading read(const JSON &object) {
         const JSON *raw = find(object, each.key);
         if (!raw)
             continue;
+        reading.offersNone = false;
         const QVariant shown = shownValue(*raw, each);
         if (shown.isValid())
             reading.values[QLatin1String(each.key)] = shown;

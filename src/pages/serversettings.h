@@ -28,7 +28,8 @@ QString name(const QString &key);
 
 struct Reading {
     QVariantMap values;
-    QStringList remarks; ///< for the user: values that could not be shown as they are
+    bool offersNone = true; ///< the service has nothing that the page knows
+    QStringList remarks;    ///< for the user: values that could not be shown as they are
 };
 
 /// Reads the settings of the service's object that the page knows. Numbers out of range are brought into it,

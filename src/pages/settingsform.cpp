@@ -2,6 +2,7 @@
 
 #include "filedialogs.h"
 #include "icons.h"
+#include "lastfolder.h"
 #include "serversettings.h"
 #include "wrappingcheckbox.h"
 
@@ -54,7 +55,15 @@ SettingsForm::SettingsForm(QWidget *parent) : QWidget(parent) {
     addServer(layout);
     addDeviceManagement(layout);
     layout->addStretch();
+    for (Field &field : m_fields)
+        field.first = field.value();
+    connect(this, &SettingsForm::edited, this, &SettingsForm::onEdited);
     showEnabled();
+}
+
+void SettingsForm::onEdited(const QString &key) {
+    for (Field &field : m_fields)
+        field.touched = field.touched || field.key == key;
 }
 
 void SettingsForm::addClient(QVBoxLayout *layout) {
@@ -117,7 +126,7 @@ QCheckBox *SettingsForm::addSwitch(QVBoxLayout *layout, const char *key, const c
     box->setObjectName(QLatin1String(name));
     addRow(layout)->addWidget(box);
     addField(
-        key, box, [box] { return QVariant(box->isChecked()); },
+        key, [box] { return QVariant(box->isChecked()); },
         [box](const QVariant &value) { box->setChecked(value.toBool()); });
     connect(box, &QCheckBox::toggled, this, [this, key] { emit edited(QLatin1String(key)); });
     return box;
@@ -143,7 +152,7 @@ QSpinBox *SettingsForm::makeNumber(const char *key, const char *name, const QStr
     box->setRange(1, most);
     box->setFixedWidth(numberWidth);
     addField(
-        key, box, [box] { return QVariant(box->value()); },
+        key, [box] { return QVariant(box->value()); },
         [box](const QVariant &value) { box->setValue(value.toInt()); });
     const int limit = ServerSettings::setting(QLatin1String(key)).most;
     connect(box, &QSpinBox::valueChanged, this, [this, box, key, limit](int value) {
@@ -179,7 +188,7 @@ void SettingsForm::addPath(QVBoxLayout *layout) {
     row->addWidget(m_path, 1);
     row->addWidget(button);
     addField(
-        "rp_download_path", m_path, [this] { return QVariant(m_path->text()); },
+        "rp_download_path", [this] { return QVariant(m_path->text()); },
         [this](const QVariant &value) { m_path->setText(value.toString()); });
     connect(m_path, &QLineEdit::textChanged, this,
             [this] { emit edited(QStringLiteral("rp_download_path")); });
@@ -187,7 +196,8 @@ void SettingsForm::addPath(QVBoxLayout *layout) {
 }
 
 void SettingsForm::browse() {
-    FileDialogs::askFolder(this, tr("Select Directory"), m_path->text(),
+    const QString begin = m_path->text().isEmpty() ? LastFolder::path() : m_path->text();
+    FileDialogs::askFolder(this, tr("Select Directory"), begin,
                            [this](const QString &folder) { m_path->setText(folder); });
 }
 
@@ -213,7 +223,7 @@ void SettingsForm::addLanguage(QVBoxLayout *layout) {
     hint->setWordWrap(true);
     addRow(layout)->addWidget(hint);
     addField(
-        "ui_lang", m_language, [this] { return m_language->currentData(); },
+        "ui_lang", [this] { return m_language->currentData(); },
         [this](const QVariant &value) {
             // A language that only another client has is kept, not replaced.
             if (m_language->findData(value) < 0)
@@ -224,15 +234,15 @@ void SettingsForm::addLanguage(QVBoxLayout *layout) {
             [this] { emit edited(QStringLiteral("ui_lang")); });
 }
 
-void SettingsForm::addField(const char *key, QWidget *control, std::function<QVariant()> value,
+void SettingsForm::addField(const char *key, std::function<QVariant()> value,
                             std::function<void(const QVariant &)> setValue) {
-    m_fields.push_back({QLatin1String(key), control, std::move(value), std::move(setValue)});
+    m_fields.push_back({QLatin1String(key), std::move(value), std::move(setValue)});
 }
 
 QVariantMap SettingsForm::values() const {
     QVariantMap values;
     for (const Field &field : m_fields) {
-        if (field.offered)
+        if (field.offered || field.touched)
             values[field.key] = field.value();
     }
     return values;
@@ -249,14 +259,21 @@ void SettingsForm::setValues(const QVariantMap &values) {
     showEnabled();
 }
 
+void SettingsForm::restore(const QVariantMap &values) {
+    QVariantMap all = values;
+    for (Field &field : m_fields) {
+        field.touched = false;
+        if (!all.contains(field.key))
+            all[field.key] = field.first;
+    }
+    setValues(all);
+}
+
 void SettingsForm::setOffered(const QStringList &keys) {
     for (Field &field : m_fields)
         field.offered = keys.contains(field.key);
-    showEnabled();
 }
 
 void SettingsForm::showEnabled() {
-    for (const Field &field : m_fields)
-        field.control->setEnabled(field.offered &&
-                                  (field.control != m_uploadLimit || m_uploadLimited->isChecked()));
+    m_uploadLimit->setEnabled(m_uploadLimited->isChecked());
 }

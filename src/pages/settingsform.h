@@ -19,11 +19,13 @@ class SettingsForm : public QWidget {
 public:
     explicit SettingsForm(QWidget *parent = nullptr);
 
-    /// What the controls hold, of the settings that are offered.
+    /// What the controls hold, of the settings that are offered and those that the user has changed.
     QVariantMap values() const;
     /// Sets controls; what is not named stays. Tells of no edit.
     void setValues(const QVariantMap &values);
-    /// Settings that the service does not have are switched off.
+    /// The same, and puts the others back to what they were at first: no change of the user's is left.
+    void restore(const QVariantMap &values);
+    /// Names the settings that the service has.
     void setOffered(const QStringList &keys);
 
 signals:
@@ -33,10 +35,11 @@ signals:
 private:
     struct Field {
         QString key;
-        QWidget *control;
         std::function<QVariant()> value;
         std::function<void(const QVariant &)> setValue;
-        bool offered = true;
+        QVariant first = {}; ///< its value before anything was set
+        bool offered = true; ///< the service has it
+        bool touched = false;
     };
 
     void addClient(QVBoxLayout *layout);
@@ -51,9 +54,10 @@ private:
     void addLanguage(QVBoxLayout *layout);
     void addUploadLimit(QVBoxLayout *layout);
     QSpinBox *makeNumber(const char *key, const char *name, const QString &accessibleName);
-    void addField(const char *key, QWidget *control, std::function<QVariant()> value,
+    void addField(const char *key, std::function<QVariant()> value,
                   std::function<void(const QVariant &)> setValue);
     void browse();
+    void onEdited(const QString &key);
     void showEnabled();
 
     std::vector<Field> m_fields;

@@ -1,5 +1,6 @@
 #include "settingwindow.h"
 
+#include "lastfolder.h"
 #include "localstore.h"
 #include "notifier.h"
 #include "servicerequest.h"
@@ -23,6 +24,7 @@
 
 SettingWindow::SettingWindow(QWidget *parent)
     : QWidget(parent), m_runner(new (std::nothrow) NetTask), m_form(new SettingsForm) {
+    qDebug("SettingWindow constructor");
     setObjectName(QStringLiteral("SettingWindow"));
     auto *scroll = new QScrollArea;
     scroll->setObjectName(QStringLiteral("settingsScroll"));
@@ -39,7 +41,9 @@ SettingWindow::SettingWindow(QWidget *parent)
     reset();
 }
 
-SettingWindow::~SettingWindow() = default;
+SettingWindow::~SettingWindow() {
+    qDebug("SettingWindow destructor");
+}
 
 QWidget *SettingWindow::buildNotice() {
     m_notice = new QFrame(this);
@@ -93,7 +97,7 @@ bool SettingWindow::hasUnsavedEdits() const {
 }
 
 void SettingWindow::discardEdits() {
-    m_form->setValues(m_loaded);
+    m_form->restore(m_loaded);
     enableButtons(false);
     m_status->clear();
 }
@@ -102,6 +106,7 @@ void SettingWindow::reset() {
     if (m_question)
         m_question->close();
     m_loaded.clear();
+    m_form->restore({});
     m_everLoaded = false;
     m_form->setEnabled(false);
     enableButtons(false);
@@ -115,15 +120,20 @@ void SettingWindow::loadConfig() {
     const bool started = ServiceRequest::post(
         m_runner.get(), this, &SettingWindow::load, [this](const Loaded &loaded) { onLoaded(loaded); },
         [this](JobEnd end) {
-            showBusy({});
-            if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                showNotice(tr("The settings could not be read: the client is busy, try again."), true);
-            // Another session may have begun while the answer for the last one was awaited.
-            if (end == JobEnd::SessionGone && CLocalStore::instance().loginInfo().isComplete())
-                loadConfig();
+            onJobEnded(end, tr("The settings could not be read: the client is busy, try again."), true);
         });
     if (started)
         showBusy(tr("Loading settings..."));
+}
+
+void SettingWindow::onJobEnded(JobEnd end, const QString &failure, bool offersRetry) {
+    showBusy({});
+    if (end == JobEnd::NotRun || end == JobEnd::Failed)
+        showNotice(failure, offersRetry);
+    // Another session may have begun while the answer for the last one was awaited, and the page was busy
+    // then.
+    if (end == JobEnd::SessionGone && CLocalStore::instance().loginInfo().isComplete())
+        loadConfig();
 }
 
 SettingWindow::Loaded SettingWindow::load(ServiceSession &session) {
@@ -154,7 +164,7 @@ void SettingWindow::onLoaded(const Loaded &loaded) {
     takeOver(loaded.reading.values);
     enableButtons(hasUnsavedEdits());
     QStringList remarks = loaded.reading.remarks;
-    if (loaded.reading.values.size() == 1)
+    if (loaded.reading.offersNone)
         remarks += tr("The server offers no settings.");
     else if (!remarks.isEmpty())
         m_apply->setEnabled(true);
@@ -190,9 +200,7 @@ void SettingWindow::saveConfig() {
         [loaded = m_loaded, wanted](ServiceSession &session) { return save(session, loaded, wanted); },
         [this, wanted](const Saved &saved) { onSaved(saved, wanted); },
         [this](JobEnd end) {
-            showBusy({});
-            if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                showNotice(tr("The settings could not be saved: the client is busy, try again."));
+            onJobEnded(end, tr("The settings could not be saved: the client is busy, try again."), false);
         });
     if (started)
         showBusy(tr("Saving settings..."));
@@ -203,8 +211,10 @@ SettingWindow::Saved SettingWindow::save(ServiceSession &session, const QVariant
     Saved saved;
     Loaded fresh = load(session);
     saved.loadResult = fresh.result;
-    if (fresh.result != ApiOk)
+    if (fresh.result != ApiOk) {
+        qWarning("HTTP API(saveServerSettings) failed!");
         return saved;
+    }
     for (const QString &key : ServerSettings::differences(loaded, fresh.reading.values)) {
         if (fresh.reading.values.value(key) != wanted.value(key))
             saved.changed += key;
@@ -228,7 +238,7 @@ void SettingWindow::onSaved(const Saved &saved, const QVariantMap &wanted) {
     const QString folderKey = QStringLiteral("rp_download_path");
     const QString folder = wanted.value(folderKey).toString();
     if (wanted.contains(folderKey) && folder != m_loaded.value(folderKey).toString())
-        StoreWriter::post([folder] { CLocalStore::instance().setDefaultFilePath(folder); });
+        LastFolder::rememberFolder(folder);
     takeOver(wanted);
     showNotice({});
     // What was changed while the answer was awaited is not saved.

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "nettask.h"
+#include "netjob.h"
 #include "serversettings.h"
 
 #include <QPointer>
@@ -62,6 +62,7 @@ private:
     void onEdited(const QString &key);
     void askWhoseValues(const Saved &saved, const QVariantMap &wanted);
     void takeOver(const QVariantMap &values);
+    void onJobEnded(JobEnd end, const QString &failure, bool offersRetry);
     void showNotice(const QString &text, bool offersRetry = false);
     void showBusy(const QString &text);
     void enableButtons(bool enabled);

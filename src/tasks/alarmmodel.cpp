@@ -70,6 +70,9 @@ QVariant AlarmModel::data(const QModelIndex &index, int role) const {
         return alarm.text();
     case Qt::ToolTipRole:
         return PlainText::toolTip(alarm.text() + QLatin1Char('\n') + TaskTexts::zonedTime(alarm.createdAt));
+    case Qt::AccessibleTextRole:
+        return TaskTexts::spoken({isMarked(index) ? tr("Unread") : QString(), alarm.text(), alarm.deviceIp,
+                                  TaskTexts::shortTime(alarm.createdAt)});
     default:
         return {};
     }

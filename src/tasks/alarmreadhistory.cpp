@@ -59,7 +59,8 @@ void AlarmReadHistory::markAllRead(const AlarmList &alarms) {
     const qsizetype before = m_read.size();
     for (const AlarmRecord &alarm : alarms)
         m_read.insert(alarm.alid);
-    if (m_read.size() != before || !std::exchange(m_olderRead, true))
+    const bool olderWereRead = std::exchange(m_olderRead, true);
+    if (m_read.size() != before || !olderWereRead)
         save();
 }
 

@@ -5,6 +5,8 @@
 #include "taskinfopool.h"
 #include "taskstate.h"
 
+#include <QDebug>
+
 #include <nlohmann/json.hpp>
 
 namespace {
@@ -14,7 +16,20 @@ constexpr qsizetype idsPerRequest = 1000;
 /// Alarms may come as fast as they are removed; then it ends all the same.
 constexpr int mostAlarmPages = 20;
 
-using RemoveCall = unsigned (CApiClient::*)(const JSON &);
+/// A call that removes what is named, with its name for the log.
+struct RemoveCall {
+    const char *name;
+    unsigned (CApiClient::*method)(const JSON &);
+};
+constexpr RemoveCall removeTaskStatus = {"removeTaskStatus", &CApiClient::removeTaskStatus};
+constexpr RemoveCall removeAlarmInfo = {"removeAlarmInfo", &CApiClient::removeAlarmInfo};
+
+/// Logs a failure; the result again.
+unsigned logged(const char *method, unsigned result) {
+    if (result != ApiOk)
+        qWarning("HTTP API(%s) failed! (%u)", method, result);
+    return result;
+}
 
 JSON idArray(const QStringList &ids) {
     JSON array = JSON::array();
@@ -26,7 +41,8 @@ JSON idArray(const QStringList &ids) {
 unsigned removeInParts(ServiceSession &session, RemoveCall remove, const QStringList &ids) {
     for (qsizetype first = 0; first < ids.size(); first += idsPerRequest) {
         const JSON part = idArray(ids.mid(first, idsPerRequest));
-        const unsigned result = session.call([&](CApiClient &client) { return (client.*remove)(part); });
+        const unsigned result = logged(
+            remove.name, session.call([&](CApiClient &client) { return (client.*remove.method)(part); }));
         if (result != ApiOk)
             return result;
     }
@@ -35,7 +51,7 @@ unsigned removeInParts(ServiceSession &session, RemoveCall remove, const QString
 
 /// One task that is gone already makes the service refuse them all; then those that are left go without it.
 unsigned removeTasksOf(ServiceSession &session, const QStringList &tids) {
-    const unsigned result = removeInParts(session, &CApiClient::removeTaskStatus, tids);
+    const unsigned result = removeInParts(session, removeTaskStatus, tids);
     if (result != ApiServerError)
         return result;
     CTaskInfoPool &pool = CTaskInfoPool::instance();
@@ -45,7 +61,7 @@ unsigned removeTasksOf(ServiceSession &session, const QStringList &tids) {
         if (pool.taskList()->find(tid))
             left += tid;
     }
-    return left.size() < tids.size() ? removeInParts(session, &CApiClient::removeTaskStatus, left) : result;
+    return left.size() < tids.size() ? removeInParts(session, removeTaskStatus, left) : result;
 }
 
 unsigned cancelTasksOf(ServiceSession &session, const QStringList &tids) {
@@ -60,9 +76,9 @@ unsigned cancelTasksOf(ServiceSession &session, const QStringList &tids) {
 unsigned removeAlarmPages(ServiceSession &session) {
     for (int page = 0; page < mostAlarmPages; ++page) {
         JSON answer;
-        unsigned result = session.call([&](CApiClient &client) {
+        unsigned result = logged("listAlarmInfo", session.call([&](CApiClient &client) {
             return client.listAlarmInfo(0, static_cast<int>(idsPerRequest), answer);
-        });
+        }));
         if (result != ApiOk)
             return result;
         QStringList ids;
@@ -70,7 +86,7 @@ unsigned removeAlarmPages(ServiceSession &session) {
             ids += alarm.alid;
         if (ids.isEmpty())
             break;
-        result = removeInParts(session, &CApiClient::removeAlarmInfo, ids);
+        result = removeInParts(session, removeAlarmInfo, ids);
         if (result != ApiOk)
             return result;
     }
@@ -94,8 +110,7 @@ void ListActions::removeTasks(const QStringList &tids) {
 }
 
 void ListActions::removeAlarms(const QStringList &alids) {
-    run([alids](
-            ServiceSession &session) { return removeInParts(session, &CApiClient::removeAlarmInfo, alids); },
+    run([alids](ServiceSession &session) { return removeInParts(session, removeAlarmInfo, alids); },
         [] { CTaskInfoPool::instance().loadAlarmInfo(); }, tr("The alarms could not be deleted: %1."));
 }
 

@@ -1,6 +1,7 @@
 #include "pendingexports.h"
 
 #include "storewriter.h"
+#include "taskrecord.h"
 
 #include <QDebug>
 
@@ -15,8 +16,6 @@ namespace {
 constexpr std::size_t mostEntries = 500;
 constexpr auto firstPause = 30s;
 constexpr int mostDoublings = 7;
-/// A task may be missing from a list for once, when others were removed while it was read page by page.
-constexpr int listsLacking = 3;
 
 PendingExport fromJson(const JSON &value) {
     const auto asked = value.is_object() ? value.find("asked") : value.end();
@@ -97,7 +96,7 @@ bool PendingExports::isLost(const PendingExport &pending, bool listed) {
     if (!entry)
         return false;
     entry->lacking = listed ? 0 : entry->lacking + 1;
-    return entry->lacking >= listsLacking;
+    return entry->lacking >= listsWithoutAGoneTask;
 }
 
 PendingExports::Entry *PendingExports::find(const PendingExport &pending) {

@@ -3,6 +3,7 @@
 #include "exetaskmgr.h"
 #include "failedtaskstrip.h"
 #include "transferstrip.h"
+#include "transientmessage.h"
 #include "uploadtaskmgr.h"
 
 #include <QVBoxLayout>
@@ -11,6 +12,13 @@ QueueStrips::QueueStrips(QWidget *parent) : QWidget(parent) {
     auto *failed = new FailedTaskStrip(this);
     failed->follow(&UploadTaskMgr::instance());
     failed->follow(&ExeTaskMgr::instance());
+    for (const TaskQueue *queue : {static_cast<TaskQueue *>(&UploadTaskMgr::instance()),
+                                   static_cast<TaskQueue *>(&ExeTaskMgr::instance())})
+        connect(queue, &TaskQueue::devicesLeftOut, this, [this](const QString &, int count) {
+            TransientMessage::show(
+                this,
+                tr("%n device(s) were left out: the server does not manage them any more.", nullptr, count));
+        });
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);

@@ -7,9 +7,6 @@
 
 namespace {
 
-/// A task may be missing from a list for once, when others were removed while it was read page by page.
-constexpr quint64 roundsKept = 3;
-
 struct Texts {
     Q_DECLARE_TR_FUNCTIONS(TaskAnnouncer)
 };
@@ -55,7 +52,8 @@ std::vector<TaskAnnouncer::Announcement> TaskAnnouncer::follow(const TaskList &t
         if (const QString text = first ? QString() : message(task->type, task->state); !text.isEmpty())
             announcements.push_back({text, task->tid});
     }
-    m_seen.removeIf([this](const auto &entry) { return entry.value().round + roundsKept < m_round; });
+    m_seen.removeIf(
+        [this](const auto &entry) { return entry.value().round + listsWithoutAGoneTask <= m_round; });
     return announcements;
 }
 

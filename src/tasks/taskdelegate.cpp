@@ -7,7 +7,6 @@
 #include "tasktype.h"
 #include "theme.h"
 
-#include <QCoreApplication>
 #include <QPainter>
 
 namespace {
@@ -47,11 +46,6 @@ void paintBar(QPainter *painter, const QRect &place, int percent) {
                       Theme::accent);
 }
 
-/// The states that say little about a failed task; its causes say more.
-QString stateText(const TaskRecord &task) {
-    return task.isFinal() && task.failedDevices > 0 ? TaskTexts::summary(task) : TaskState::text(task.state);
-}
-
 } // namespace
 
 QSize TaskDelegate::sizeHint(const QStyleOptionViewItem &, const QModelIndex &) const {
@@ -81,21 +75,16 @@ void TaskDelegate::paint(QPainter *painter, const QStyleOptionViewItem &option,
 
 void TaskDelegate::paintTask(QPainter *painter, QRect place, const QFont &font,
                              const TaskRecord &task) const {
-    const bool scheduled = task.status == TaskState::scheduled && task.scheduledAt > 0;
     const QFont small = RowPainter::smaller(font);
     const QRect first = line(place, 0);
     const QRect rest =
         RowPainter::paintRight(painter, first, small, Theme::textQuiet, TaskTexts::shortTime(task.createdAt));
     RowPainter::paintText(painter, rest, RowPainter::bold(font), Theme::text, TaskType::title(task.type));
 
-    QString text =
-        scheduled ? tr("Scheduled for %1").arg(TaskTexts::zonedTime(task.scheduledAt)) : stateText(task);
-    if (!task.isFinal() || task.failedDevices == 0)
-        text = tr("%n device(s) · %1", nullptr, static_cast<int>(task.devices.size())).arg(text);
-    paintState(painter, line(place, 1), small, task.state, text);
+    paintState(painter, line(place, 1), small, task.state, TaskTexts::standing(task));
     if (!task.user.isEmpty())
         RowPainter::paintText(painter, line(place, 2), small, Theme::textQuiet, task.user);
-    if (!task.isFinal() && !scheduled)
+    if (TaskTexts::showsProgress(task))
         paintBar(painter, QRect(place.left(), place.bottom() - 5, place.width(), barHeight), task.progress);
 }
 
@@ -114,7 +103,7 @@ void TaskDelegate::paintDevice(QPainter *painter, QRect place, const QFont &font
     const bool final = TaskState::isFinal(device.state);
     QRect rest = final ? first
                        : RowPainter::paintRight(painter, first, small, Theme::textQuiet,
-                                                QStringLiteral("%1 %").arg(device.progress));
+                                                TaskTexts::percent(device.progress));
     RowPainter::paintText(painter, rest, small, Theme::textStrong, TaskTexts::target(*device.target));
     paintState(painter, first.translated(0, lineHeight), small, device.state, TaskState::text(device.state));
     if (!final)

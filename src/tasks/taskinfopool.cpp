@@ -121,30 +121,30 @@ void CTaskInfoPool::readTasks(ServiceSession &session) {
         });
     if (result != ApiOk) {
         qDebug("HTTP API(listTaskStatus) failed! (%u)", result);
-        return tell(&CTaskInfoPool::taskListFailed);
+        return tell(session, &CTaskInfoPool::taskListFailed);
     }
     if (unreadable > 0)
         qWarning("%d task records have no id and were left out", unreadable);
     // Nothing but garbage is no list, and certainly no empty one.
     if (unreadable > 0 && records.empty())
-        return tell(&CTaskInfoPool::taskListFailed);
+        return tell(session, &CTaskInfoPool::taskListFailed);
     const auto tasks = std::make_shared<const TaskList>(std::move(records));
-    if (!takeTasks(session, tasks))
+    if (!takeTasks(session, tasks, differs(*tasks, *previous)))
         return;
     logTasks(*tasks, *previous);
-    if (!m_tasksChanged && differs(*tasks, *previous))
-        m_tasksChanged = true;
-    m_taskListLoaded = true;
     m_parser.forgetUnused();
-    tell(&CTaskInfoPool::taskListUpdated);
+    tell(session, &CTaskInfoPool::taskListUpdated);
 }
 
 /// False when the session has ended meanwhile: its tasks are nobody's then.
-bool CTaskInfoPool::takeTasks(const ServiceSession &session, TaskListPtr tasks) {
+bool CTaskInfoPool::takeTasks(const ServiceSession &session, TaskListPtr tasks, bool changed) {
     const std::lock_guard lock(m_mutex);
     if (!session.isPresent())
         return false;
     m_tasks = std::move(tasks);
+    m_taskListLoaded = true;
+    if (changed)
+        m_tasksChanged = true;
     return true;
 }
 
@@ -158,7 +158,7 @@ void CTaskInfoPool::readAlarms(ServiceSession &session) {
         session.call([&](CApiClient &client) { return client.listAlarmInfo(0, alarmLimit, answer); });
     if (result != ApiOk) {
         qWarning("HTTP API(loadAlarmInfoList) failed! (%u)", result);
-        return tell(&CTaskInfoPool::alarmListFailed);
+        return tell(session, &CTaskInfoPool::alarmListFailed);
     }
     try {
         auto alarms = std::make_shared<const AlarmList>(AlarmRecords::parse(answer.at("items")));
@@ -169,10 +169,10 @@ void CTaskInfoPool::readAlarms(ServiceSession &session) {
         m_alarmTotal = totalOf(answer.at("total_items"));
         m_alarmListLoaded = true;
     } catch (...) {
-        tell(&CTaskInfoPool::alarmListFailed);
+        tell(session, &CTaskInfoPool::alarmListFailed);
         throw;
     }
-    tell(&CTaskInfoPool::alarmListUpdated);
+    tell(session, &CTaskInfoPool::alarmListUpdated);
 }
 
 unsigned CTaskInfoPool::updateTaskState(ServiceSession &session, const QString &tid, const QString &state) {
@@ -189,10 +189,14 @@ unsigned CTaskInfoPool::updateTaskState(ServiceSession &session, const QString &
     return result;
 }
 
-/// Fetches end on their own threads; who listens lives in the user-interface thread.
-void CTaskInfoPool::tell(void (CTaskInfoPool::*signal)()) {
-    QMetaObject::invokeMethod(
-        this, [this, signal] { (this->*signal)(); }, Qt::QueuedConnection);
+/// Fetches end on their own threads; who listens lives in the user-interface thread. There the session may
+/// end before its turn comes, and the lists are those of no session then.
+void CTaskInfoPool::tell(const ServiceSession &session, void (CTaskInfoPool::*signal)()) {
+    const auto emitOwn = [this, signal, generation = session.login().generation] {
+        if (CLocalStore::instance().loginInfo().generation == generation)
+            (this->*signal)();
+    };
+    QMetaObject::invokeMethod(this, emitOwn, Qt::QueuedConnection);
 }
 
 TaskListPtr CTaskInfoPool::taskList() const {
@@ -224,10 +228,10 @@ void CTaskInfoPool::clear() {
         const std::lock_guard lock(m_mutex);
         m_tasks = std::make_shared<TaskList>();
         m_alarms = std::make_shared<AlarmList>();
+        m_alarmTotal = 0;
+        m_alarmListLoaded = false;
+        m_taskListLoaded = false;
+        m_tasksChanged = false;
     }
-    m_alarmTotal = 0;
-    m_alarmListLoaded = false;
-    m_taskListLoaded = false;
-    m_tasksChanged = false;
     emit cleared();
 }

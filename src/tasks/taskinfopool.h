@@ -67,8 +67,8 @@ private:
     void startPostWork();
     void readTasks(ServiceSession &session);
     void readAlarms(ServiceSession &session);
-    bool takeTasks(const ServiceSession &session, TaskListPtr tasks);
-    void tell(void (CTaskInfoPool::*signal)());
+    bool takeTasks(const ServiceSession &session, TaskListPtr tasks, bool changed);
+    void tell(const ServiceSession &session, void (CTaskInfoPool::*signal)());
 
     NetTask m_taskRunner;
     NetTask m_alarmRunner;
@@ -76,7 +76,7 @@ private:
     std::mutex m_fetch; ///< held for a whole fetch of tasks, so that an older list never replaces a newer one
     TaskParser m_parser;
 
-    mutable std::mutex m_mutex; ///< for the two lists, which are swapped under it
+    mutable std::mutex m_mutex; ///< for the two lists, which are swapped under it with what is told of them
     TaskListPtr m_tasks;
     AlarmListPtr m_alarms;
     std::atomic<int> m_alarmTotal = 0;

@@ -197,7 +197,10 @@ QVariant TaskModel::taskData(const TaskRecord &task, int role) const {
             QStringList{TaskType::title(task.type), TaskState::text(task.state), TaskTexts::origin(task)}
                 .join(QLatin1Char('\n')));
     case Qt::AccessibleTextRole:
-        return QStringLiteral("%1, %2").arg(TaskType::title(task.type), TaskState::text(task.state));
+        return TaskTexts::spoken(
+            {TaskType::title(task.type), TaskTexts::standing(task),
+             TaskTexts::showsProgress(task) ? TaskTexts::percent(task.progress) : QString(), task.user,
+             TaskTexts::shortTime(task.createdAt)});
     default:
         return {};
     }
@@ -210,6 +213,10 @@ QVariant TaskModel::deviceData(const TaskDevice &device, int role) const {
     case Qt::ToolTipRole:
         return PlainText::toolTip(TaskTexts::target(*device.target) + QLatin1Char('\n') +
                                   TaskState::text(device.state));
+    case Qt::AccessibleTextRole:
+        return TaskTexts::spoken(
+            {TaskTexts::target(*device.target), TaskState::text(device.state),
+             TaskState::isFinal(device.state) ? QString() : TaskTexts::percent(device.progress)});
     default:
         return {};
     }

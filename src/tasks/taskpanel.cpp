@@ -51,13 +51,14 @@ bool isUnfinished(const TaskRecord &task) {
 }
 
 bool hasFailures(const TaskRecord &task) {
-    return task.isFinal() && task.failedDevices > 0;
+    return task.isFinal() && std::any_of(task.devices.begin(), task.devices.end(),
+                                         [&](const auto &device) { return task.hasFailedOn(device); });
 }
 
 QStringList failedDevices(const TaskRecord &task) {
     QStringList ids;
     for (const TaskDevice &device : task.devices) {
-        if (TaskState::isFailure(device.state))
+        if (task.hasFailedOn(device))
             ids += device.target->id;
     }
     return ids;
@@ -242,7 +243,7 @@ void TaskPanel::onTaskListUpdated() {
     const TaskListPtr tasks = CTaskInfoPool::instance().taskList();
     for (const TaskAnnouncer::Announcement &each : m_announcer.follow(*tasks))
         Notifier::instance().ShowMessage(each.text, Notifier::Task, each.tid);
-    TaskRepeats::instance().keepOnly(*tasks);
+    TaskRepeats::instance().follow(*tasks);
     filterTasks();
 }
 

@@ -1,5 +1,6 @@
 #include "taskqueue.h"
 
+#include "devicesleft.h"
 #include "messagelog.h"
 #include "servicesession.h"
 #include "sessionevents.h"
@@ -58,6 +59,17 @@ QStringList idTexts(const JSON &devices) {
             texts += QString::fromStdString(id.get_ref<const std::string &>());
     }
     return texts;
+}
+
+/// Takes the other devices out of a record, and the files of theirs.
+void keepOnly(const TaskFamily &family, JSON &record, const QStringList &deviceIds,
+              const QSet<QString> &macs) {
+    JSON &devices = record[family.targets];
+    devices = TaskTargets::only(devices, deviceIds);
+    for (const char *member : {"cert", "pkey"}) {
+        if (const auto files = record.find(member); files != record.end())
+            *files = TaskTargets::onlyFilesOf(*files, macs);
+    }
 }
 
 QString reasonOf(unsigned result, const Transfer &transfer) {
@@ -148,7 +160,7 @@ void TaskQueue::handlingTask() {
     }
 }
 
-void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
+void TaskQueue::runStep(const TaskFamily &family, JSON &record) {
     ServiceSession session(CLocalStore::instance().loginInfo());
     // Queued in a session that has ended: it must not run as somebody else, or on another server.
     if (QueuedRecords::sessionOf(record) != session.login().generation) {
@@ -160,7 +172,7 @@ void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
     setState(family, record, family.workingState());
     Outcome outcome;
     try {
-        outcome = perform(family, step);
+        outcome = perform(family, step, record);
     } catch (const std::exception &error) {
         qWarning("%s%s", family.lines.exception, error.what());
         outcome.made = !step.tid.empty();
@@ -172,23 +184,21 @@ void TaskQueue::runStep(const TaskFamily &family, const JSON &record) {
     finish(family, step, outcome);
 }
 
-TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step) {
+TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step, JSON &record) {
     const LoginInfo &login = step.session.login();
     qDebug("API access info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
            static_cast<int>(login.port), qUtf8Printable(login.account),
            MessageLog::secret(login.token).constData());
-    const JSON devices = family.devices(step.record);
-    JSON task;
-    unsigned result = step.session.call(
-        [&](CApiClient &client) { return client.newTaskState(family.serviceType, devices, task); });
-    step.tid = result == ApiOk ? textMember(task, "tid") : "";
-    if (step.tid.empty())
-        return {result == ApiOk ? unsigned(ApiMissingData) : result, false};
+    unsigned result = makeTask(family, step, record);
+    if (result != ApiOk) {
+        qWarning("HTTP API(newTaskState) failed! (%u)", result);
+        return {result, false};
+    }
     // The new task is to be seen before its work begins, and a repetition is only kept for tasks in the list.
     CTaskInfoPool::instance().fetchTaskStatuses(step.session);
     const QString tid = QString::fromStdString(step.tid);
     setSending({nameOf(family, step), step.transfer, tid});
-    tell([this, &family, ctid = stringMember(step.record, "ctid"), tid] {
+    tell(step, [this, &family, ctid = stringMember(step.record, "ctid"), tid] {
         rememberRepeat(family, ctid, tid);
         emit serviceTaskMade(ctid, tid);
     });
@@ -204,10 +214,36 @@ TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step) 
     return {result, true};
 }
 
+/// Makes the record's task, if need be without the devices that the service has no more: these leave the
+/// record then.
+unsigned TaskQueue::makeTask(const TaskFamily &family, TaskStep &step, JSON &record) {
+    const auto attempt = [&] {
+        const JSON devices = family.devices(record);
+        JSON task;
+        const unsigned result = step.session.call(
+            [&](CApiClient &client) { return client.newTaskState(family.serviceType, devices, task); });
+        step.tid = result == ApiOk ? textMember(task, "tid") : "";
+        return result == ApiOk && step.tid.empty() ? unsigned(ApiMissingData) : result;
+    };
+    unsigned result = attempt();
+    if (result != ApiServerError)
+        return result;
+    const DevicesLeft left = DevicesLeft::among(idTexts(record.at(family.targets)), step.session);
+    if (!left.isWorthATry())
+        return result;
+    keepOnly(family, record, left.ids, left.macs);
+    result = attempt();
+    if (result == ApiOk)
+        tell(step, [this, ctid = stringMember(record, "ctid"), count = left.vanished.size()] {
+            emit devicesLeftOut(ctid, static_cast<int>(count));
+        });
+    return result;
+}
+
 void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome) {
     const bool over = step.session.isLost() || !step.session.isPresent();
     if (step.session.isLost())
-        tell([generation = step.session.login().generation] {
+        tell(step, [generation = step.session.login().generation] {
             SessionEvents::instance().reportLost(generation);
         });
     if (outcome.result == ApiOk)
@@ -215,10 +251,10 @@ void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Out
     else if (outcome.made || over)
         setState(family, step.record, family.failureState());
     if (outcome.result != ApiOk && !over && !step.transfer->isCancelled())
-        tell([this, failure = FailedHandOver{stringMember(step.record, "ctid"),
-                                             QString::fromLatin1(family.serviceType),
-                                             static_cast<int>(step.record.at(family.targets).size()),
-                                             reasonOf(outcome.result, *step.transfer)}]() mutable {
+        tell(step, [this, failure = FailedHandOver{stringMember(step.record, "ctid"),
+                                                   QString::fromLatin1(family.serviceType),
+                                                   static_cast<int>(step.record.at(family.targets).size()),
+                                                   reasonOf(outcome.result, *step.transfer)}]() mutable {
             failure.isFollowed = m_followed.contains(failure.ctid);
             emit handOverFailed(failure);
         });
@@ -241,9 +277,13 @@ void TaskQueue::setState(const TaskFamily &family, const JSON &record, const cha
         if (!m_records.setState(ctid, state,
                                 isOver ? QueuedRecords::Secret::Wipe : QueuedRecords::Secret::Keep))
             return;
-        tell([this, ctid = QString::fromStdString(ctid), state = QString::fromLatin1(state)] {
-            emit recordChanged(ctid, state);
-        });
+        // A session that ends is what changes most records at once.
+        QMetaObject::invokeMethod(
+            this,
+            [this, ctid = QString::fromStdString(ctid), state = QString::fromLatin1(state)] {
+                emit recordChanged(ctid, state);
+            },
+            Qt::QueuedConnection);
     } catch (const std::exception &error) {
         qWarning("%s%s", family.lines.update, error.what());
     } catch (...) {
@@ -270,10 +310,7 @@ void TaskQueue::repeat(const QString &ctid, const QString &tid, const QStringLis
         return;
     if (family->asksAgain)
         return emit dialogNeeded(QString::fromLatin1(family->serviceType), deviceIds);
-    JSON &devices = record[family->targets];
-    devices = TaskTargets::only(devices, deviceIds);
-    if (const auto files = record.find("cert"); files != record.end())
-        *files = TaskTargets::onlyFilesOf(*files, macsOf(tid, deviceIds));
+    keepOnly(*family, record, deviceIds, macsOf(tid, deviceIds));
     insertAgain(*family, std::move(record));
 }
 
@@ -345,8 +382,12 @@ void TaskQueue::cancelSending() {
         transfer->cancel();
 }
 
-/// Who listens lives in the user-interface thread.
+/// Who listens lives in the user-interface thread, and hears nothing of a session that has ended by then.
 template <typename Told>
-void TaskQueue::tell(Told told) {
-    QMetaObject::invokeMethod(this, std::move(told), Qt::QueuedConnection);
+void TaskQueue::tell(const TaskStep &step, Told told) {
+    auto tellOwn = [told = std::move(told), generation = step.session.login().generation]() mutable {
+        if (presentSession() == generation)
+            told();
+    };
+    QMetaObject::invokeMethod(this, std::move(tellOwn), Qt::QueuedConnection);
 }

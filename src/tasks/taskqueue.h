@@ -71,6 +71,8 @@ signals:
     /// The record's task is on the service; tid is its id there.
     void serviceTaskMade(const QString &ctid, const QString &tid);
     void handOverFailed(const FailedHandOver &failure);
+    /// A record's task was made without those of its devices that the service has no more.
+    void devicesLeftOut(const QString &ctid, int count);
     /// A record can only be repeated with a password or a key that is not kept: whoever can ask for it opens
     /// that dialog for the devices.
     void dialogNeeded(const QString &serviceType, const QStringList &deviceIds);
@@ -93,8 +95,9 @@ private:
     void onQuit();
 
     const TaskFamily *familyOf(std::string_view type) const;
-    void runStep(const TaskFamily &family, const JSON &record);
-    Outcome perform(const TaskFamily &family, TaskStep &step);
+    void runStep(const TaskFamily &family, JSON &record);
+    Outcome perform(const TaskFamily &family, TaskStep &step, JSON &record);
+    unsigned makeTask(const TaskFamily &family, TaskStep &step, JSON &record);
     void finish(const TaskFamily &family, const TaskStep &step, const Outcome &outcome);
     void startTimer();
     void complete(quint32 error);
@@ -105,7 +108,7 @@ private:
     void repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds);
     void insertAgain(const TaskFamily &family, JSON record);
     template <typename Told>
-    void tell(Told told);
+    void tell(const TaskStep &step, Told told);
 
     std::span<const TaskFamily> m_families;
     const char *m_walkError;

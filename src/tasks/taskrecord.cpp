@@ -82,6 +82,11 @@ bool TaskRecord::isFailed() const {
     return failedDevices > 0 || TaskState::isFailure(status) || TaskState::isFailure(state);
 }
 
+bool TaskRecord::hasFailedOn(const TaskDevice &device) const {
+    return TaskState::isFailure(device.state) ||
+           (isFinal() && status == TaskState::failed && !TaskState::isFinal(device.state));
+}
+
 TaskList::TaskList(std::vector<TaskRecordPtr> records) {
     m_records.reserve(records.size());
     m_byTid.reserve(records.size());

@@ -46,9 +46,15 @@ struct TaskRecord {
 
     /// True when nothing more happens to it.
     bool isFinal() const;
-    /// True for a task that is not final and has a chance to go on by itself.
+    /// True where something of it has failed.
     bool isFailed() const;
+    /// True where it has failed on one of its devices: as a whole it may fail before it has come to some.
+    bool hasFailedOn(const TaskDevice &device) const;
 };
+
+/// A task may be missing from a list for once, when others were removed while it was read page by page: it is
+/// gone when so many in a row lack it.
+inline constexpr int listsWithoutAGoneTask = 3;
 
 using TaskRecordPtr = std::shared_ptr<const TaskRecord>;
 

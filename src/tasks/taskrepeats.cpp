@@ -8,14 +8,18 @@ TaskRepeats &TaskRepeats::instance() {
 }
 
 void TaskRepeats::remember(const QString &tid, Repeat repeat) {
-    m_repeats.insert(tid, std::move(repeat));
+    m_entries.insert(tid, {std::move(repeat)});
 }
 
 const TaskRepeats::Repeat *TaskRepeats::find(const QString &tid) const {
-    const auto found = m_repeats.find(tid);
-    return found == m_repeats.end() ? nullptr : &*found;
+    const auto found = m_entries.constFind(tid);
+    return found == m_entries.cend() ? nullptr : &found->repeat;
 }
 
-void TaskRepeats::keepOnly(const TaskList &tasks) {
-    m_repeats.removeIf([&](const auto &entry) { return !tasks.find(entry.key()); });
+void TaskRepeats::follow(const TaskList &tasks) {
+    m_entries.removeIf([&](auto each) {
+        Entry &entry = each.value();
+        entry.lacking = tasks.find(each.key()) ? 0 : entry.lacking + 1;
+        return entry.lacking >= listsWithoutAGoneTask;
+    });
 }

@@ -23,10 +23,15 @@ public:
     void remember(const QString &tid, Repeat repeat);
     /// Null for a task whose parameters are not known here.
     const Repeat *find(const QString &tid) const;
-    /// Forgets the tasks that the service has no more.
-    void keepOnly(const TaskList &tasks);
-    void clear() { m_repeats.clear(); }
+    /// Takes a new list in, and forgets the tasks that the service has no more.
+    void follow(const TaskList &tasks);
+    void clear() { m_entries.clear(); }
 
 private:
-    QHash<QString, Repeat> m_repeats;
+    struct Entry {
+        Repeat repeat;
+        int lacking = 0; ///< lists in a row
+    };
+
+    QHash<QString, Entry> m_entries;
 };

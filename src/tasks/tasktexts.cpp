@@ -36,6 +36,10 @@ int rank(const TaskDevice &device) {
     return TaskState::isFinal(device.state) ? 2 : 1;
 }
 
+bool isScheduled(const TaskRecord &task) {
+    return task.status == TaskState::scheduled && task.scheduledAt > 0;
+}
+
 QString orDashes(const QString &text) {
     return text.isEmpty() ? QStringLiteral("--") : text;
 }
@@ -57,6 +61,28 @@ QString summary(const TaskRecord &task) {
     return Texts::tr("%1 of %2 failed: %3")
         .arg(QLocale().toString(task.failedDevices),
              QLocale().toString(static_cast<int>(task.devices.size())), counted(causes));
+}
+
+QString standing(const TaskRecord &task) {
+    // The state says little about a failed task; its causes say more.
+    if (task.isFinal() && task.failedDevices > 0)
+        return summary(task);
+    const QString state = isScheduled(task) ? Texts::tr("Scheduled for %1").arg(zonedTime(task.scheduledAt))
+                                            : TaskState::text(task.state);
+    return Texts::tr("%n device(s) · %1", nullptr, static_cast<int>(task.devices.size())).arg(state);
+}
+
+bool showsProgress(const TaskRecord &task) {
+    return !task.isFinal() && !isScheduled(task);
+}
+
+QString percent(int progress) {
+    return QStringLiteral("%1 %").arg(progress);
+}
+
+QString spoken(QStringList parts) {
+    parts.removeAll(QString());
+    return parts.join(QStringLiteral(", "));
 }
 
 QString origin(const TaskRecord &task) {
@@ -99,7 +125,7 @@ QString target(const TaskTarget &target) {
 
 QString copyLine(const TaskDevice &device) {
     return QStringList{device.target->model, device.target->ip, device.target->mac,
-                       TaskState::text(device.state), QStringLiteral("%1 %").arg(device.progress)}
+                       TaskState::text(device.state), percent(device.progress)}
         .join(QLatin1Char('\t'));
 }
 

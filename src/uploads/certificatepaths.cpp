@@ -1,11 +1,9 @@
 #include "certificatepaths.h"
 
-#include "localstore.h"
-#include "storewriter.h"
+#include "filedialogs.h"
+#include "lastfolder.h"
 
 #include <QCoreApplication>
-#include <QFileDialog>
-#include <QFileInfo>
 
 namespace CertificatePaths {
 
@@ -20,25 +18,21 @@ QString filters() {
            Texts::tr("All files") + QStringLiteral(" (*)");
 }
 
-void rememberFolder(const QString &path) {
-    StoreWriter::post([path] { CLocalStore::instance().setDefaultFilePath(QFileInfo(path).absolutePath()); });
-}
-
 } // namespace
 
 void ask(QWidget *parent, const QString &title, Count count,
          const std::function<void(const QStringList &)> &chosen) {
-    auto *dialog = new QFileDialog(parent, title, CLocalStore::instance().defaultFilePath(), filters());
-    dialog->setObjectName(QStringLiteral("openFileDialog"));
-    dialog->setAttribute(Qt::WA_DeleteOnClose);
-    dialog->setFileMode(count == Count::Many ? QFileDialog::ExistingFiles : QFileDialog::ExistingFile);
-    QObject::connect(dialog, &QFileDialog::filesSelected, parent, [chosen](const QStringList &paths) {
+    const auto take = [chosen](const QStringList &paths) {
         if (paths.isEmpty())
             return;
-        rememberFolder(paths.first());
+        LastFolder::rememberFile(paths.first());
         chosen(paths);
-    });
-    dialog->open();
+    };
+    if (count == Count::Many)
+        FileDialogs::askOpenPaths(parent, title, LastFolder::path(), filters(), take);
+    else
+        FileDialogs::askOpenPath(parent, title, LastFolder::path(), filters(),
+                                 [take](const QString &path) { take({path}); });
 }
 
 } // namespace CertificatePaths

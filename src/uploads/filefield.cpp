@@ -1,14 +1,11 @@
 #include "filefield.h"
 
 #include "filedialogs.h"
-#include "localstore.h"
-#include "storewriter.h"
+#include "lastfolder.h"
 
 #include <QDropEvent>
-#include <QFileInfo>
 #include <QLocale>
 #include <QMimeData>
-#include <QStandardPaths>
 
 FileField::FileField(Kind kind, const Texts &texts, QWidget *parent)
     : PathField(texts.caption,
@@ -18,19 +15,8 @@ FileField::FileField(Kind kind, const Texts &texts, QWidget *parent)
       m_kind(kind),
       m_title(texts.title) {
     say(texts.hint, Tone::Quiet);
-    readLastFolder();
-}
-
-void FileField::readLastFolder() {
-    NetJob::post(
-        NetJob::createRunner("reading the last folder", NetTask::Turn::Beside), this,
-        [] { return CLocalStore::instance().defaultFilePath(); },
-        [this](const QString &folder) {
-            m_lastFolder = folder;
-            const QString usual = QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation);
-            if (m_kind == Kind::Folder && m_choice == 0)
-                setPath(folder.isEmpty() ? usual : folder);
-        });
+    if (kind == Kind::Folder)
+        setPath(LastFolder::path());
 }
 
 void FileField::acceptDropsOn(QWidget *area) {
@@ -43,9 +29,10 @@ void FileField::browse() {
     if (m_askPath)
         m_askPath(chosen);
     else if (m_kind == Kind::Folder)
-        FileDialogs::askFolder(this, m_title, m_file.path.isEmpty() ? m_lastFolder : m_file.path, chosen);
+        FileDialogs::askFolder(this, m_title, m_file.path.isEmpty() ? LastFolder::path() : m_file.path,
+                               chosen);
     else
-        FileDialogs::askOpenPath(this, m_title, m_lastFolder, tr("All Files(*)"), chosen);
+        FileDialogs::askOpenPath(this, m_title, LastFolder::path(), tr("All Files(*)"), chosen);
 }
 
 bool FileField::eventFilter(QObject *watched, QEvent *event) {
@@ -124,9 +111,10 @@ void FileField::onChecked(FileCheck found) {
         say(m_file.problem, Tone::Warning);
     else
         say(m_kind == Kind::File ? tr("Size: %1").arg(size) : tr("Free: %1").arg(size), Tone::Quiet);
-    if (m_file.isGood()) {
-        m_lastFolder = m_kind == Kind::File ? QFileInfo(m_file.path).absolutePath() : m_file.path;
-        StoreWriter::post([folder = m_lastFolder] { CLocalStore::instance().setDefaultFilePath(folder); });
-    }
+    // A folder that was only offered is nobody's choice.
+    if (m_file.isGood() && m_kind == Kind::File)
+        LastFolder::rememberFile(m_file.path);
+    else if (m_file.isGood() && m_file.path != LastFolder::path())
+        LastFolder::rememberFolder(m_file.path);
     emit changed();
 }

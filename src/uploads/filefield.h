@@ -43,14 +43,12 @@ protected:
     void browse() override;
 
 private:
-    void readLastFolder();
     void drop(const QMimeData &dropped);
     void onChecked(FileCheck found);
     void onCheckEnded(int choice, const QString &path, JobEnd end);
 
     Kind m_kind;
     QString m_title;
-    QString m_lastFolder;
     AskPath m_askPath;
     Judge m_judge;
     FileCheck m_file;

@@ -45,9 +45,9 @@ void Rollout::begin() {
 void Rollout::resume(const Progress &progress) {
     m_progress = progress;
     const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
-    // What the queue of that run held is gone with it.
+    // What the queue of that session held is gone with it.
     if (isUploading && m_progress.wave.tid.isEmpty())
-        return halt(Reason::NotBegun, tr("The client was closed before it began."));
+        return halt(Reason::NotBegun, tr("The session ended before it began."));
     advance();
 }
 
@@ -91,7 +91,9 @@ void Rollout::onHandOverFailed(const QString &ctid, const QString &reason) {
 /// The figures are followed in a stopped rollout too: its devices are at work all the same.
 void Rollout::follow() {
     const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
-    const TaskRecordPtr task = m_surroundings.tasks()->find(m_progress.wave.tid);
+    const TaskListPtr tasks = m_surroundings.tasks();
+    const TaskRecordPtr task = tasks->find(m_progress.wave.tid);
+    const bool isGone = isTaskGone(tasks, task);
     if (task && task != m_counted)
         count(*task);
     m_counted = task;
@@ -99,8 +101,17 @@ void Rollout::follow() {
         return;
     if (task && task->isFinal())
         return onWaveEnded(*task);
-    if (!task && m_progress.wave.isSeen)
+    if (isGone)
         halt(Reason::TaskGone);
+}
+
+bool Rollout::isTaskGone(const TaskListPtr &tasks, const TaskRecordPtr &task) {
+    const bool isNewList = std::exchange(m_followed, tasks) != tasks;
+    if (task || !m_progress.wave.isSeen)
+        m_lacking = 0;
+    else if (isNewList)
+        ++m_lacking;
+    return m_lacking >= listsWithoutAGoneTask;
 }
 
 void Rollout::count(const TaskRecord &task) {
@@ -131,10 +142,11 @@ void Rollout::onWaveEnded(const TaskRecord &task) {
 }
 
 void Rollout::judgeFirstWave() {
-    const Wave &wave = m_progress.wave;
     if (m_plan->rest().isEmpty())
         return setState(State::Done);
-    if (qint64{wave.failed} * 100 > qint64{m_plan->mostFailedPercent} * wave.total())
+    // The wave may have been the rest of one that was repeated.
+    const qint64 failed = m_progress.earlierFailed + m_progress.wave.failed;
+    if (failed * 100 > qint64{m_plan->mostFailedPercent} * m_plan->firstWave().size())
         return halt(Reason::TooManyFailed);
     m_progress.waitUntil = m_surroundings.now() + m_plan->waitMinutes * minuteMs;
     setState(State::Waiting);

@@ -62,7 +62,7 @@ public:
     Rollout(RolloutPlanPtr plan, Surroundings surroundings, QObject *parent = nullptr);
 
     void begin();
-    /// Goes on from where an earlier run of the program has left it.
+    /// Goes on from where an earlier session has left it.
     void resume(const Progress &progress);
     void advance();
 
@@ -96,6 +96,7 @@ signals:
 private:
     void beginWave(State state, const QStringList &deviceIds);
     void follow();
+    bool isTaskGone(const TaskListPtr &tasks, const TaskRecordPtr &task);
     void count(const TaskRecord &task);
     void onWaveEnded(const TaskRecord &task);
     void judgeFirstWave();
@@ -107,4 +108,6 @@ private:
     Surroundings m_surroundings;
     Progress m_progress;
     TaskRecordPtr m_counted; ///< what the figures were taken from
+    TaskListPtr m_followed;  ///< the last list that was looked at
+    int m_lacking = 0;       ///< lists in a row without the wave's task
 };

@@ -3,6 +3,7 @@
 #include "firmwareupload.h"
 #include "localstore.h"
 #include "netjob.h"
+#include "sessionevents.h"
 #include "storewriter.h"
 #include "taskinfopool.h"
 #include "tasktargets.h"
@@ -182,7 +183,9 @@ void RolloutMgr::keep() {
     });
 }
 
+/// A user who logs off is done with them; a session that the service has ended goes on with the next log-in.
 void RolloutMgr::onSessionEnded() {
+    const bool comesBack = m_restored && SessionEvents::instance().wasLost(m_generation);
     QStringList names;
     for (const auto &each : m_rollouts) {
         if (each->state() != Rollout::State::Done)
@@ -190,13 +193,18 @@ void RolloutMgr::onSessionEnded() {
     }
     m_timer.stop();
     m_rollouts.clear();
-    keep();
+    if (!comesBack)
+        keep();
     m_restored = false;
     emit changed();
     if (names.isEmpty())
         return;
     qWarning("The session has ended before %d rollout(s)", static_cast<int>(names.size()));
-    emit dropped(tr("The session has ended, and with it the rollout(s) of %1. Waves that were sent go on.",
-                    nullptr, static_cast<int>(names.size()))
-                     .arg(names.join(QStringLiteral(", "))));
+    const int count = static_cast<int>(names.size());
+    const QString message =
+        comesBack ? tr("The server has ended the session. The rollout(s) of %1 go on after the next log-in.",
+                       nullptr, count)
+                  : tr("The session has ended, and with it the rollout(s) of %1. Waves that were sent go on.",
+                       nullptr, count);
+    emit dropped(message.arg(names.join(QStringLiteral(", "))));
 }

@@ -7,8 +7,9 @@
 
 #include <memory>
 
-/// The rollouts of the session. They outlive the dialog that has begun them, end with the session, and come
-/// back when the program is started again and the same account logs in to the same server.
+/// The rollouts of the session. They outlive the dialog that has begun them and end when the user logs off.
+/// When the program is closed, or the service ends the session, they come back as soon as the same account
+/// logs in to the same server.
 /// User-interface thread.
 class RolloutMgr : public QObject {
     Q_OBJECT

@@ -161,6 +161,8 @@ void UploadFirmwareDialog::readUploadLimit() {
             JSON settings;
             const unsigned result =
                 session.call([&](CApiClient &client) { return client.loadServerSettings(settings); });
+            if (result != ApiOk)
+                qWarning("HTTP API(loadServerSettings) failed! (%u)", result);
             return result == ApiOk && settings.is_object() ? uploadLimitOf(settings) : 0;
         },
         [this](int limit) { setFootNote(limit > 0 ? tr("%1 at a time").arg(number(limit)) : QString()); });

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <QString>
+#include <QStringList>
 
 #include <functional>
 
@@ -12,6 +12,10 @@ namespace FileDialogs {
 /// An existing file. folder: where to begin; filter: as QFileDialog takes it.
 void askOpenPath(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
                  const std::function<void(const QString &path)> &chosen);
+
+/// The same for any number of files.
+void askOpenPaths(QWidget *parent, const QString &title, const QString &folder, const QString &filter,
+                  const std::function<void(const QStringList &paths)> &chosen);
 
 /// filter: as QFileDialog takes it. suggestion: folder and name; a missing suffix is added.
 void askSavePath(QWidget *parent, const QString &title, const QString &suggestion, const QString &filter,

@@ -11,11 +11,16 @@ class FakeService {
 public:
     FakeService() {
         m_peer.follow([this](const ScriptedPeer::Request &request) { return answer(request); });
+        logIn();
+    }
+    ~FakeService() { CLocalStore::instance().clearLoginInfo(); }
+
+    /// Begins a session, in place of an earlier one.
+    void logIn() {
         const std::string cipher = Ciphers::sealSecret("session-token_0123456789").value_or("");
         CLocalStore::instance().setLoginInfo("127.0.0.1", m_peer.port(), "admin",
                                              QByteArray::fromStdString(cipher));
     }
-    ~FakeService() { CLocalStore::instance().clearLoginInfo(); }
 
     void setLog(std::vector<nlohmann::json> items) {
         const std::lock_guard lock(m_mutex);

@@ -1,5 +1,6 @@
 #include "fakeservice.h"
 #include "isolatedroot.h"
+#include "lastfolder.h"
 #include "logcapture.h"
 #include "logchart.h"
 #include "logtable.h"
@@ -127,6 +128,8 @@ private slots:
         find<QPushButton>("clearFiltersButton")->click();
         QCOMPARE(text("countLabel"), QStringLiteral("3 Logs Found"));
         QCOMPARE(find<QLineEdit>("logSearchEdit")->text(), QString());
+        const auto *cross = find<QLineEdit>("logSearchEdit")->findChild<QToolButton *>();
+        QTRY_VERIFY2(!cross->isVisible() || !cross->isEnabled(), "there is nothing left to clear");
     }
 
     void sortsTheWholeResultAndTurnsPages() {
@@ -240,8 +243,10 @@ private slots:
                                           ",System,Audit,\"a, \"\"b\"\" c\",x@y,\n");
         find<QLineEdit>("logSearchEdit")->setText("nothing");
         QCOMPARE(exported("empty.csv"), QByteArray("Date/Time,Source,Type,Description,User,\n"));
+        QCOMPARE(LastFolder::path(), m_root.path());
         QSignalSpy ended(m_window.get(), &LogWindow::export_file_generated);
-        exported("no such folder/log.csv");
+        QCOMPARE(exported("no such folder/log.csv"), QByteArray("no beginning"));
+        QCOMPARE(ended.count(), 1);
         QCOMPARE(ended.at(0).at(0).toString(), QStringLiteral("Failed to export."));
         QVERIFY(!ended.at(0).at(1).toBool());
     }
@@ -292,8 +297,10 @@ private:
         QSignalSpy begun(m_window.get(), &LogWindow::export_button_clicked);
         QSignalSpy ended(m_window.get(), &LogWindow::export_file_generated);
         find<QPushButton>("exportButton")->click();
-        if (begun.size() != 1 || (ended.isEmpty() && !ended.wait()))
+        if (ended.isEmpty() && !ended.wait())
             return "no export";
+        if (begun.size() != 1)
+            return "no beginning";
         return m_root.read(name);
     }
     template <typename T>

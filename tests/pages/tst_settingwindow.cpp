@@ -142,21 +142,19 @@ private slots:
         QTest::addColumn<QByteArray>("settings");
         QTest::addColumn<int>("days");
         QTest::addColumn<QString>("told"); // a part of it; empty where there is nothing to tell
-        QTest::addColumn<bool>("editable");
-        const auto row = [](const char *name, const char *settings, int days, const char *told,
-                            bool editable = true) {
-            QTest::newRow(name) << QByteArray(settings) << days << QString::fromLatin1(told) << editable;
+        const auto row = [](const char *name, const char *settings, int days, const char *told) {
+            QTest::newRow(name) << QByteArray(settings) << days << QString::fromLatin1(told);
         };
         row("the alias", R"({"days":45})", 45, "");
         row("too many", R"({"log_keepdays":5000})", 1095, "the server has 5000, shown is 1095");
         row("too few", R"({"log_keepdays":-1e30})", 1, "shown is 1");
         row("a text", R"({"log_keepdays":"45"})", 45, "the server has \"45\", shown is 45");
         row("a fraction", R"({"log_keepdays":45.5})", 45, "shown is 45");
-        row("no number", R"({"log_keepdays":[45]})", 30, "value [45] cannot be shown", false);
-        row("null", R"({"log_keepdays":null,"nf_alarms":{},"rp_download_path":[]})", 30, "cannot be shown",
-            false);
-        row("nothing", "{}", 30, "offers no settings", false);
-        row("no object", "[1]", 30, "offers no settings", false);
+        row("no number", R"({"log_keepdays":[45]})", 30, "value [45] cannot be shown");
+        row("null", R"({"log_keepdays":null,"nf_alarms":{},"rp_download_path":[]})", 30, "cannot be shown");
+        row("nothing", "{}", 30, "offers no settings");
+        row("no object", "[1]", 30, "offers no settings");
+        row("one of them", R"({"svr_fw_upload_limit_enabled":true})", 30, "");
     }
     void oddValuesAreToldAndShown() {
         QFETCH(QByteArray, settings);
@@ -164,10 +162,41 @@ private slots:
         m_service->setSettings(json::parse(settings.toStdString()));
         open();
         QTEST(find<QSpinBox>("logSpinBox")->value(), "days");
-        QTEST(find<QSpinBox>("logSpinBox")->isEnabled(), "editable");
+        QVERIFY(find<QSpinBox>("logSpinBox")->isEnabled());
         QVERIFY2(text("noticeLabel").contains(told), qPrintable(text("noticeLabel")));
         QCOMPARE(find<QLabel>("noticeLabel")->isVisible(), !told.isEmpty());
         QVERIFY(!m_window->hasUnsavedEdits());
+    }
+
+    void settingThatTheServerLacksIsSentOnceChanged() {
+        m_service->setSettings({{"log_keepdays", 30}});
+        open();
+        find<QSpinBox>("restorePointSpinBox")->setValue(7);
+        QVERIFY(!button("applyButton")->isEnabled());
+        find<QSpinBox>("logSpinBox")->setValue(31);
+        button("cancelButton")->click();
+        QCOMPARE(find<QSpinBox>("restorePointSpinBox")->value(), 10);
+        find<QSpinBox>("restorePointSpinBox")->setValue(8);
+        find<QSpinBox>("logSpinBox")->setValue(60);
+        button("applyButton")->click();
+        QTRY_COMPARE(text("statusLabel"), QStringLiteral("Settings saved."));
+        const json expected = {
+            {"log_keepdays", 60}, {"rp_keepnum", 8}, {"svr_fw_upload_limit_enabled", false}};
+        QCOMPARE(QString::fromStdString(m_service->settings().dump()),
+                 QString::fromStdString(expected.dump()));
+    }
+
+    void saveThatOutlivesItsSessionReadsForTheNext() {
+        open();
+        find<QSpinBox>("logSpinBox")->setValue(60);
+        button("applyButton")->click();
+        // The page is left and entered again while the answer is awaited.
+        m_service->logIn();
+        m_window->reset();
+        m_window->loadConfig();
+        QTRY_VERIFY(find<QWidget>("settingsForm")->isEnabled());
+        QTRY_COMPARE(find<QSpinBox>("logSpinBox")->value(),
+                     m_service->settings().at("log_keepdays").get<int>());
     }
 
     void twoAdministrators_data() {
@@ -215,9 +244,14 @@ private slots:
         QTRY_VERIFY(find<QSpinBox>("logSpinBox")->isEnabled());
         QVERIFY(!find<QLabel>("noticeLabel")->isVisible());
         find<QSpinBox>("logSpinBox")->setValue(60);
-        m_service->refuse("/v1/config/set", 5);
+        m_service->refuse("/v1/config/get", 5);
         button("applyButton")->click();
         QTRY_COMPARE(m_log->count("HTTP API(saveServerSettings) failed!"), 1);
+        QTRY_VERIFY(find<QLabel>("noticeLabel")->isVisible());
+        m_service->refuse("/v1/config/get", 0);
+        m_service->refuse("/v1/config/set", 5);
+        button("applyButton")->click();
+        QTRY_COMPARE(m_log->count("HTTP API(saveServerSettings) failed!"), 2);
         QTRY_VERIFY(find<QLabel>("noticeLabel")->isVisible());
         QVERIFY(m_window->hasUnsavedEdits());
         QCOMPARE(find<QSpinBox>("logSpinBox")->value(), 60);

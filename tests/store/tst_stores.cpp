@@ -2,9 +2,11 @@
 #include "clientstore.h"
 #include "configstore.h"
 #include "isolatedroot.h"
+#include "lastfolder.h"
 #include "localstore.h"
 #include "logcapture.h"
 #include "nvldmstore.h"
+#include "storewriter.h"
 
 #include <QDir>
 #include <QTest>
@@ -38,6 +40,7 @@ private slots:
     void sessionTokens();
     void renewalOfAnEndedSession();
     void defaultFilePath();
+    void dialogsBeginInTheLastFolder();
     void noPlainPasswordInAnyFile();
 
 private:
@@ -235,6 +238,36 @@ void TestStores::defaultFilePath() {
     QCOMPARE(store.defaultFilePath(), QString());
     QVERIFY(store.setDefaultFilePath("/home/it's/Zürich"));
     QCOMPARE(store.defaultFilePath(), "/home/it's/Zürich");
+}
+
+void TestStores::dialogsBeginInTheLastFolder() {
+    CLocalStore &store = CLocalStore::instance();
+    const auto load = [] {
+        LastFolder::load();
+        StoreWriter::flush();
+    };
+    QCOMPARE(LastFolder::path(), QDir::homePath());
+    QVERIFY(store.setDefaultFilePath({}));
+#ifdef Q_OS_LINUX
+    qputenv("HOME", m_root.path().toUtf8());
+    qputenv("XDG_CONFIG_HOME", m_root.path().toUtf8());
+    QVERIFY(m_root.write("user-dirs.dirs", "XDG_DOCUMENTS_DIR=\"$HOME/Papers\"\n"));
+    load();
+    QCOMPARE(LastFolder::file("a.csv"), m_root.filePath("a.csv"));
+    QVERIFY(QDir(m_root.path()).mkdir("Papers"));
+    load();
+    QCOMPARE(LastFolder::file("a.csv"), m_root.filePath("Papers/a.csv"));
+#endif
+    QVERIFY(store.setDefaultFilePath("/srv/it's"));
+    load();
+    QCOMPARE(LastFolder::path(), "/srv/it's");
+    // What is chosen while the store is read counts.
+    LastFolder::load();
+    LastFolder::rememberFile("/srv/new/a.csv");
+    QCOMPARE(LastFolder::path(), "/srv/new");
+    StoreWriter::flush();
+    QCOMPARE(LastFolder::path(), "/srv/new");
+    QCOMPARE(store.defaultFilePath(), "/srv/new");
 }
 
 void TestStores::noPlainPasswordInAnyFile() {

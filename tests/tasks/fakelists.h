@@ -34,6 +34,11 @@ public:
         const std::lock_guard lock(m_mutex);
         m_alarms = std::move(data);
     }
+    /// The devices there are: a task for any other is refused from now on.
+    void setDevices(nlohmann::json devices) {
+        const std::lock_guard lock(m_mutex);
+        m_devices = std::move(devices);
+    }
     /// From now on the requests to the path answer with this code; 0 ends it.
     void refuse(const std::string &path, int code) {
         const std::lock_guard lock(m_mutex);
@@ -86,6 +91,10 @@ private:
             return ScriptedPeer::sealed(given->second);
         if (request.path == "/v1/alarm/list")
             return ScriptedPeer::sealed(m_alarms);
+        if (request.path == "/v1/dev/list" && !m_devices.is_null())
+            return ScriptedPeer::sealed(m_devices);
+        if (request.path == "/v1/task/init" && !hasAll(request.json()["devices"]))
+            return ScriptedPeer::json({{"code", 4}});
         if (request.path == "/v1/task/init")
             return ScriptedPeer::sealed(m_made.is_null() ? makeTask(request.json()) : m_made);
         if (request.path == "/v1/site/list")
@@ -100,6 +109,14 @@ private:
         for (std::size_t i = start; i < std::min(start + count, m_tasks.size()); ++i)
             page.push_back(m_tasks[i]);
         return ScriptedPeer::sealed(page);
+    }
+
+    bool hasAll(const nlohmann::json &asked) const {
+        const auto has = [this](const nlohmann::json &id) {
+            return std::any_of(m_devices.begin(), m_devices.end(),
+                               [&](const nlohmann::json &each) { return each["id"] == id; });
+        };
+        return m_devices.is_null() || std::all_of(asked.begin(), asked.end(), has);
     }
 
     nlohmann::json makeTask(const nlohmann::json &asked) {
@@ -117,6 +134,7 @@ private:
     std::mutex m_mutex;
     nlohmann::json m_tasks = nlohmann::json::array();
     nlohmann::json m_made;
+    nlohmann::json m_devices;
     nlohmann::json m_alarms = {{"items", nlohmann::json::array()}, {"total_items", 0}};
     std::map<std::string, int> m_codes;
     std::map<std::string, ScriptedPeer::Reply> m_replies;

@@ -123,8 +123,10 @@ private slots:
 
     void failedDevicesAreRetriedByWhoeverKnowsHow() {
         showTasks({task("mine", "pTaskFailed", {device(1, "pTaskDone"), device(2, "pTaskBrokenFile_01")}),
-                   task("theirs", "pTaskFailed", {device(3, "pTaskFailed")})});
+                   task("theirs", "pTaskFailed", {device(3, "pTaskFailed")}),
+                   task("whole", "pTaskFailed", {device(4, "pTaskDone"), device(5, "pTaskInitState")})});
         QStringList repeated;
+        TaskRepeats::instance().remember("whole", {[&](const QStringList &ids) { repeated = ids; }});
         TaskRepeats::instance().remember("mine", {[&](const QStringList &ids) { repeated = ids; }});
         auto *retry = m_tasks->findChild<QToolButton *>("retryTaskButton");
         select(1);
@@ -133,6 +135,28 @@ private slots:
         select(0);
         QTest::mouseClick(retry, Qt::LeftButton);
         QCOMPARE(repeated, QStringList{"DV2"});
+        select(2);
+        QTest::mouseClick(retry, Qt::LeftButton);
+        QVERIFY2(repeated == QStringList{"DV5"}, "the task ended before it came to it");
+    }
+
+    void rowsSayToScreenReadersWhatTheyShow() {
+        const json updating = task("t", "pTaskProcessing", {device(1, "pTaskProcessing")}, true);
+        showTasks({updating, task("f", "pTaskFailed", {device(2, "pTaskBrokenFile_01")})});
+        const auto said = [](const QModelIndex &row) { return row.data(Qt::AccessibleTextRole).toString(); };
+        const QAbstractItemModel *model = m_tasks->findChild<QTreeView *>("taskTree")->model();
+        const QModelIndex running = model->index(0, 0);
+        QVERIFY2(said(running).startsWith("Upload Firmware, 1 device(s) · Processing, 50 %, admin, "),
+                 qUtf8Printable(said(running)));
+        QVERIFY2(said(model->index(1, 0)).contains("1 of 1 failed: "),
+                 qUtf8Printable(said(model->index(1, 0))));
+        QCOMPARE(said(model->index(1, 0, running)), QString("NC-1 · 10.0.0.1 · MAC1, Processing, 100 %"));
+        m_alarms = std::make_unique<AlarmPanel>();
+        m_service->setAlarms(page({alarm(1, "one")}));
+        loadAlarms();
+        const QModelIndex first = m_alarms->findChild<QListView *>("alarmList")->model()->index(0, 0);
+        QVERIFY2(said(first).startsWith("Unread, Lost connection to one, 10.0.0.1, "),
+                 qUtf8Printable(said(first)));
     }
 
     void runningTaskIsCancelledAfterAQuestion() {
@@ -272,9 +296,11 @@ private slots:
     void alarmsAreReadOnceThePanelIsSeen() {
         m_alarms = std::make_unique<AlarmPanel>();
         QSignalSpy unread(m_alarms.get(), &AlarmPanel::alarmUnreadCountUpdated);
-        m_service->setAlarms(page({alarm(2, "two"), alarm(1, "one")}));
+        json listed = page({alarm(2, "two"), alarm(1, "one")});
+        listed["total_items"] = 5; // three more than the list reaches
+        m_service->setAlarms(listed);
         loadAlarms();
-        QCOMPARE(unread.last()[0].toInt(), 2);
+        QCOMPARE(unread.last()[0].toInt(), 5);
         m_alarms->show();
         QCOMPARE(unread.last()[0].toInt(), 0);
         m_alarms->hide();

@@ -108,6 +108,23 @@ private slots:
         QVERIFY(m_pool.taskList()->isEmpty());
     }
 
+    void listOfAnEndedSessionIsNotTold() {
+        m_service->setTasks(tasks(2));
+        ServiceSession session(CLocalStore::instance().loginInfo());
+        QSignalSpy tasksTold(&m_pool, &CTaskInfoPool::taskListUpdated);
+        QSignalSpy alarmsTold(&m_pool, &CTaskInfoPool::alarmListUpdated);
+        m_pool.fetchTaskStatuses(session);
+        m_pool.loadAlarmInfo();
+        QVERIFY(NetTask::waitForAll(5000));
+        QVERIFY(m_pool.isTaskListLoaded() && m_pool.isAlarmListLoaded());
+        // Both are read, and the session ends before anybody has heard of it.
+        CLocalStore::instance().clearLoginInfo();
+        m_pool.clear();
+        m_service->logIn();
+        QCoreApplication::processEvents();
+        QCOMPARE(tasksTold.count() + alarmsTold.count(), 0);
+    }
+
     void totalOfEveryType_data() {
         QTest::addColumn<QByteArray>("total");
         QTest::addColumn<int>("expected");

@@ -163,6 +163,62 @@ private slots:
         QVERIFY(sent[1]["devices"][0]["pass"] == "P1:cipher");
     }
 
+    void removedDevicesAreLeftOut() {
+        m_service->setDevices({{{"id", "DV1"}, {"d_mac", "AA:01"}}, {{"id", "DV3"}, {"d_mac", "AA:03"}}});
+        QSignalSpy leftOut(m_queue.get(), &TaskQueue::devicesLeftOut);
+        QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
+        JSON files;
+        work = [&](TaskStep &step) { return files = step.record["pkey"], unsigned(ApiOk); };
+        QString ctid;
+        m_queue->insert("plain",
+                        {{"devices", {"DV1", "DV2", "DV3"}},
+                         {"pkey", {{{"d_mac", "aa-01"}}, {{"d_mac", "aa-02"}}, {{"fname", "all"}}}}},
+                        &ctid);
+        m_queue->handlingTask();
+        QTRY_COMPARE(leftOut.count(), 1);
+        QCOMPARE(leftOut[0], QVariantList({ctid, 1}));
+        const std::vector<json> sent = m_service->sentTo("/v1/task/init");
+        QCOMPARE(sent.size(), 2u);
+        QVERIFY(sent[1]["devices"] == (json{"DV1", "DV3"}));
+        QVERIFY(files == (json{{{"d_mac", "aa-01"}}, {{"fname", "all"}}}));
+        // Nobody is left of these, and the refusal is told as it is.
+        m_queue->add("plain", {"DV7", "DV8"});
+        m_queue->handlingTask();
+        QTRY_COMPARE(failed.count(), 1);
+        QCOMPARE(m_service->sentTo("/v1/task/init").size(), 3u);
+        QCOMPARE(m_log->count("HTTP API(newTaskState) failed! (15)"), 1);
+    }
+
+    void nothingIsToldOfAnEndedSession() {
+        QSignalSpy made(m_queue.get(), &TaskQueue::serviceTaskMade);
+        QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
+        work = [](TaskStep &) { return unsigned(ApiServerError); };
+        m_queue->add();
+        m_queue->handlingTask();
+        // The worker is done, and the session ends before anybody has heard of it.
+        m_service->logIn();
+        QCoreApplication::processEvents();
+        QCOMPARE(made.count() + failed.count(), 0);
+        QVERIFY(!TaskRepeats::instance().find("T1"));
+    }
+
+    void repeatOutlivesAListThatSkipsItsTask() {
+        TaskRepeats &repeats = TaskRepeats::instance();
+        const auto task = std::make_shared<TaskRecord>();
+        task->tid = "T1";
+        const TaskList with({task}), without;
+        repeats.remember("T1", {[](const QStringList &) {}});
+        for (int round = 0; round < 2; ++round) {
+            repeats.follow(without);
+            repeats.follow(without);
+            QVERIFY(repeats.find("T1"));
+            repeats.follow(with);
+        }
+        for (int list = 0; list < 3; ++list)
+            repeats.follow(without);
+        QVERIFY(!repeats.find("T1"));
+    }
+
     void failedHandOverIsTold_data() {
         QTest::addColumn<bool>("throws");
         QTest::newRow("refused") << false;

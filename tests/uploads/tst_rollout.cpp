@@ -7,6 +7,7 @@
 #include "nvldmstore.h"
 #include "rolloutmgr.h"
 #include "rollouttexts.h"
+#include "sessionevents.h"
 #include "storewriter.h"
 #include "taskinfopool.h"
 #include "taskstate.h"
@@ -92,11 +93,12 @@ private slots:
     void goesFromWaveToWave();
     void firstWaveIsJudged_data();
     void firstWaveIsJudged();
+    void repeatedRestIsJudgedWithItsWave();
     void goesOnAfterAStop_data();
     void goesOnAfterAStop();
     void stoppedByTheUser();
     void comesBackFromItsRecord();
-    void endsWithTheSessionAndNotWithTheProgram();
+    void endsWithTheLogOffAndNotWithTheProgram();
     void imageThatHasChangedIsNotSent();
     void wavesReachTheDevices_data();
     void wavesReachTheDevices();
@@ -166,6 +168,17 @@ void TestRollout::firstWaveIsJudged() {
     QCOMPARE(bed.uploads.size(), 1u);
 }
 
+void TestRollout::repeatedRestIsJudgedWithItsWave() {
+    Bed bed;
+    bed.beginFirst();
+    bed.list("T1", "pTaskAborted", {done, done, done, done, busy});
+    bed.rollout.goOn();
+    QCOMPARE(bed.uploads.back().ids, QStringList{"D5"});
+    bed.sent("c2", "T2");
+    bed.list("T2", "pTaskFailed", {failed}, 5);
+    QVERIFY2(bed.rollout.state() == State::Waiting, "one of five is just enough");
+}
+
 void TestRollout::goesOnAfterAStop_data() {
     using Happening = std::function<void(Bed &)>;
     QTest::addColumn<Happening>("happening");
@@ -192,6 +205,11 @@ void TestRollout::goesOnAfterAStop_data() {
         "removed",
         [](Bed &bed) {
             bed.list("T1", "pTaskProcessing", {done});
+            // A list may skip a task for once.
+            bed.list("T7", "pTaskDone", {});
+            bed.list("T7", "pTaskDone", {});
+            bed.rollout.advance();
+            QCOMPARE(bed.rollout.state(), State::FirstWave);
             bed.list("T7", "pTaskDone", {});
         },
         "no longer in the list", first);
@@ -267,7 +285,7 @@ void TestRollout::comesBackFromItsRecord() {
     QCOMPARE(RolloutRecords::parse("{\"a").size(), 0u);
 }
 
-void TestRollout::endsWithTheSessionAndNotWithTheProgram() {
+void TestRollout::endsWithTheLogOffAndNotWithTheProgram() {
     FakeLists service;
     auto &rollouts = RolloutMgr::instance();
     auto &pool = CTaskInfoPool::instance();
@@ -304,10 +322,22 @@ void TestRollout::endsWithTheSessionAndNotWithTheProgram() {
         value.insert(at, "'");
     const std::string key = row[0]["key"];
     nvldmstore::replaceData(store.constData(), "appMainT", ("'" + key + "','" + value + "'").c_str());
-    service.logIn();
-    pool.loadTaskStatuses();
-    QTRY_COMPARE(rollouts.rollouts().size(), 1u);
-    QCOMPARE(tid(), "T1");
+    const auto comesBack = [&] {
+        service.logIn();
+        pool.loadTaskStatuses();
+        return QTest::qWaitFor([&] { return rollouts.rollouts().size() == 1 && tid() == "T1"; });
+    };
+    QVERIFY(comesBack());
+    // A session that the service has ended is not the user's doing.
+    SessionEvents::instance().reportLost(CLocalStore::instance().loginInfo().generation);
+    CLocalStore::instance().clearLoginInfo();
+    pool.clear();
+    QVERIFY(rollouts.rollouts().empty());
+    QVERIFY2(dropped.last()[0].toString().contains("next log-in"),
+             qUtf8Printable(dropped.last()[0].toString()));
+    QVERIFY(!kept()[0]["value"].get<std::string>().empty());
+    QVERIFY(comesBack());
+    CLocalStore::instance().clearLoginInfo();
     pool.clear();
 }
 

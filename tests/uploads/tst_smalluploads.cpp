@@ -3,6 +3,7 @@
 #include "fakelists.h"
 #include "filefield.h"
 #include "isolatedroot.h"
+#include "lastfolder.h"
 #include "pluraltranslator.h"
 #include "quicksetupdialog.h"
 #include "storewriter.h"
@@ -198,7 +199,7 @@ void TestSmallUploads::configurationIsSent() {
 
 void TestSmallUploads::exportProposesTheLastFolder() {
     const QString file = this->file("some.file");
-    QVERIFY(CLocalStore::instance().setDefaultFilePath(m_root.path()));
+    LastFolder::rememberFolder(m_root.path());
     QPointer dialog = new ExportDebugInfoDialog(targets({plain, plain}));
     dialog->open();
     QTRY_COMPARE(dialog->folderField()->file().path, m_root.path());

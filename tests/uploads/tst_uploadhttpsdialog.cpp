@@ -250,7 +250,7 @@ private:
         m_dialog->findChild<QToolButton *>(link)->click();
         auto *dialog = m_dialog->findChild<QFileDialog *>("openFileDialog");
         QVERIFY(dialog);
-        emit dialog->filesSelected({m_root.filePath(name)});
+        emit dialog->fileSelected(m_root.filePath(name));
         delete dialog;
     }
 
