@@ -161,7 +161,7 @@ void DeviceWindow::connectParts() {
             });
     connect(m_tabs->corner()->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
     connect(m_footer, &DeviceFooter::statusFilterChanged, this, &DeviceWindow::applyStatusFilter);
-    connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(m_selected); });
+    connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(selectedDevices()); });
     connect(this, &DeviceWindow::onShowAnimatedMsgDlg, this, &DeviceWindow::showDefAnimateMsgDlg);
     QComboBox *servers = m_tabs->corner()->remoteCombo();
     connect(servers, &QComboBox::activated, this, [this, servers](int index) {
@@ -192,9 +192,9 @@ void DeviceWindow::connectOperations() {
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this, slot);
     for (const auto &[name, kind] : uploadEntries)
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this,
-                [this, kind = kind] { emit uploadWanted(kind, targetsOf(m_selected)); });
+                [this, kind = kind] { emit uploadWanted(kind, targetsOf(selectedDevices())); });
     connect(m_toolBar->button(QStringLiteral("quickSettingButton")), &QToolButton::clicked, this,
-            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(m_selected)); });
+            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(selectedDevices())); });
     connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
@@ -296,7 +296,7 @@ OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
 }
 
 void DeviceWindow::on_authorizeButton_clicked() {
-    auto *dialog = new AuthorizeDeviceDialog(targetsOf(m_selected), this);
+    auto *dialog = new AuthorizeDeviceDialog(targetsOf(selectedDevices()), this);
     connect(dialog, &AuthorizeDeviceDialog::authDevices, this,
             [this, dialog](const QString &name, const QString &password) {
                 onAuthDevices(dialog->deviceIds(), name, password);
@@ -311,7 +311,7 @@ void DeviceWindow::onAuthDevices(const QStringList &ids, const QString &name, co
 }
 
 void DeviceWindow::on_setPasswordButton_clicked() {
-    openSetPasswordDialog(m_selected);
+    openSetPasswordDialog(selectedDevices());
 }
 
 void DeviceWindow::openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices) {
@@ -332,7 +332,7 @@ void DeviceWindow::onSetPassword(JSON &devices, const QString &name, const QStri
 }
 
 void DeviceWindow::openRestoreDialog() {
-    auto *dialog = new RestoreDeviceDialog(targetsOf(m_selected), this);
+    auto *dialog = new RestoreDeviceDialog(targetsOf(selectedDevices()), this);
     connect(dialog, &RestoreDeviceDialog::restoreDevice, this,
             [this, dialog](int net, int dst, int lang, int nadp, int focus, int lens) {
                 onRestoreDevice(dialog->deviceIds(), {net, dst, lang, nadp, focus, lens});
@@ -348,7 +348,7 @@ void DeviceWindow::onRestoreDevice(const QStringList &ids, const DeviceOperation
 }
 
 void DeviceWindow::on_ipButton_clicked() {
-    auto *dialog = new AssignIpDialogII(targetsOf(m_selected), m_inventory.snapshot(), this);
+    auto *dialog = new AssignIpDialogII(targetsOf(selectedDevices()), m_inventory.snapshot(), this);
     dialog->open();
 }
 
@@ -356,7 +356,7 @@ void DeviceWindow::on_restartButton_clicked() {
     auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this);
     confirm->setAttribute(Qt::WA_DeleteOnClose);
     auto *box = new TargetBox(confirm);
-    OperationTargets::List targets = targetsOf(m_selected);
+    OperationTargets::List targets = targetsOf(selectedDevices());
     const auto warnings = OperationTargets::warnings(targets, OperationTargets::Need::Authorization);
     box->setTargets(std::move(targets));
     box->setWarnings(warnings);
@@ -428,7 +428,6 @@ void DeviceWindow::clearFilter() {
 void DeviceWindow::onFilterChanged() {
     showStatusCounts();
     showContent();
-    onSelectionChanged();
 }
 
 void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
@@ -446,7 +445,6 @@ void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     m_siteTree->setCounts(*m_inventory.snapshot());
     showStatusCounts();
     showContent();
-    onSelectionChanged();
 }
 
 void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
@@ -457,6 +455,8 @@ void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
         return;
     m_tabs->refreshStatus();
     showStatusCounts();
+    // A status chip shows other devices with the states, also where the selection stays.
+    showSelectionCount();
     showContent();
 }
 
@@ -570,19 +570,26 @@ void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
 }
 
 void DeviceWindow::onSelectionChanged() {
-    const MainConsoleTable *table = m_tabs->currentTable();
-    m_selected.clear();
-    for (const int device : table->selectedDevices())
-        m_selected.push_back(m_inventory.snapshot()->at(device));
-    qDebug("device selected: %d", static_cast<int>(m_selected.size()));
+    const auto count = static_cast<int>(m_tabs->currentTable()->selectedDevices().size());
+    qDebug("device selected: %d", count);
     m_selectionLogDelay->start();
     for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "uploadButton",
                              "quickSettingButton", "restartButton", "restoreButton", "deleteButton"})
-        m_toolBar->button(QLatin1String(name))->setEnabled(!m_selected.empty());
-    m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(!m_selected.empty());
+        m_toolBar->button(QLatin1String(name))->setEnabled(count > 0);
+    m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(count > 0);
     for (const auto &[name, kind] : uploadEntries)
-        m_toolBar->entry(QLatin1String(name))->setEnabled(!m_selected.empty());
-    m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount(), table->unfilteredCount());
+        m_toolBar->entry(QLatin1String(name))->setEnabled(count > 0);
+    showSelectionCount();
+}
+
+std::vector<DeviceRecordPtr> DeviceWindow::selectedDevices() const {
+    return m_tabs->currentTable()->selectedRecords();
+}
+
+void DeviceWindow::showSelectionCount() {
+    const MainConsoleTable *table = m_tabs->currentTable();
+    m_footer->setSelection(static_cast<int>(table->selectedDevices().size()), table->rowCount(),
+                           table->unfilteredCount());
 }
 
 void DeviceWindow::showStatusCounts() {

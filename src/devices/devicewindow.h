@@ -50,8 +50,8 @@ public:
     bool hasPendingEdits() const;
     void discardEdits();
 
-    /// The devices that operations work on, in the order of their rows.
-    const std::vector<DeviceRecordPtr> &selectedDevices() const { return m_selected; }
+    /// The devices that operations work on, in the order of their rows as they are sorted now.
+    std::vector<DeviceRecordPtr> selectedDevices() const;
 
 public slots:
     /// Sends the changes of sites.
@@ -122,6 +122,7 @@ private:
     void loadRemoteServers();
     void showContent();
     void showStatusCounts();
+    void showSelectionCount();
 
     DeviceInventory m_inventory;
     std::unique_ptr<DeviceMonitor> m_monitor;
@@ -141,7 +142,6 @@ private:
 
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
-    std::vector<DeviceRecordPtr> m_selected;
     bool m_tasksRunning = false;
     bool m_online = false;
 };
