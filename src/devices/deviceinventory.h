@@ -4,12 +4,19 @@
 #include "devicestatus.h"
 
 #include <QHash>
+#include <QStringList>
 
 #include <memory>
 #include <string>
 #include <unordered_map>
 #include <utility>
 #include <vector>
+
+/// Those of some devices that are still managed.
+struct PresentDevices {
+    std::vector<DeviceRecordPtr> records;
+    int vanished = 0; ///< how many of them are not
+};
 
 /// The devices of one reading, with their indexes. Built once on any thread, never changed after that.
 class DeviceSnapshot {
@@ -24,6 +31,9 @@ public:
     /// The place of a device, or -1.
     int indexOf(const QString &id) const;
     int indexOf(const std::string &id) const;
+
+    /// The present records of devices that somebody has chosen earlier.
+    PresentDevices presentOf(const QStringList &ids) const;
 
     /// How many devices are in a site; all of them for the overview.
     int siteCount(const QString &siteId) const;

@@ -4,12 +4,14 @@
 #include "assignipdialog.h"
 #include "authorizedevicedialog.h"
 #include "clientstore.h"
+#include "confirmdialog.h"
 #include "consolecorner.h"
 #include "deviceactions.h"
 #include "devicefooter.h"
 #include "devicelog.h"
 #include "devicemenus.h"
 #include "devicemonitor.h"
+#include "deviceplacement.h"
 #include "devicetabs.h"
 #include "devicetoolbar.h"
 #include "filedialogs.h"
@@ -79,6 +81,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_updater(new InventoryUpdater(
           m_inventory, [this] { return m_siteTree->edits().commitCount(); }, this)),
       m_actions(new DeviceActions(this)),
+      m_placement(new DevicePlacement(m_inventory, m_actions, this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_noticeBar(new NoticeBar(m_console)),
       m_tabs(new DeviceTabs(m_inventory, m_console)),
@@ -146,7 +149,8 @@ void DeviceWindow::connectParts() {
     });
     connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
-    connect(m_siteTree, &SiteTree::devicesDropped, this, &DeviceWindow::onDevicesDropped);
+    connect(m_siteTree, &SiteTree::devicesDropped, m_placement, &DevicePlacement::drop);
+    connect(m_placement, &DevicePlacement::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_noticeBar, &NoticeBar::msgButtonClicked, this, &DeviceWindow::commitSites);
     connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
@@ -201,7 +205,7 @@ void DeviceWindow::connectOperations() {
     connect(m_actions, &DeviceActions::devicesDeleted, m_updater, &InventoryUpdater::readStatesSoon);
     connect(m_actions, &DeviceActions::statesChanged, this, [this] { m_monitor->forceRefresh(); });
     connect(m_actions, &DeviceActions::passwordWanted, this,
-            [this](const QStringList &ids) { openSetPasswordDialog(devicesWith(ids)); });
+            [this](const QStringList &ids) { openSetPasswordDialog(targetsWith(ids)); });
 }
 
 void DeviceWindow::addShortcuts() {
@@ -277,22 +281,12 @@ void DeviceWindow::openAddDialog() {
     dialog->open();
 }
 
-std::vector<DeviceRecordPtr> DeviceWindow::devicesWith(const QStringList &ids) const {
-    std::vector<DeviceRecordPtr> devices;
-    const DeviceSnapshot &snapshot = *m_inventory.snapshot();
-    for (const QString &id : ids) {
-        if (const int place = snapshot.indexOf(id); place >= 0)
-            devices.push_back(snapshot.at(place));
-    }
-    return devices;
-}
-
 OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr> &devices) const {
     return OperationTargets::of(devices, m_inventory, *CTaskInfoPool::instance().taskList());
 }
 
 OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
-    return targetsOf(devicesWith(ids));
+    return targetsOf(m_inventory.snapshot()->presentOf(ids).records);
 }
 
 void DeviceWindow::on_authorizeButton_clicked() {
@@ -311,13 +305,13 @@ void DeviceWindow::onAuthDevices(const QStringList &ids, const QString &name, co
 }
 
 void DeviceWindow::on_setPasswordButton_clicked() {
-    openSetPasswordDialog(selectedDevices());
+    openSetPasswordDialog(targetsOf(selectedDevices()));
 }
 
-void DeviceWindow::openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices) {
-    if (devices.empty())
+void DeviceWindow::openSetPasswordDialog(const OperationTargets::List &targets) {
+    if (targets.empty())
         return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
-    auto *dialog = new SetPasswordDialog(targetsOf(devices), m_actions, this);
+    auto *dialog = new SetPasswordDialog(targets, m_actions, this);
     connect(dialog, &SetPasswordDialog::setPassword, this, &DeviceWindow::onSetPassword);
     dialog->open();
 }
@@ -371,23 +365,10 @@ void DeviceWindow::on_restartButton_clicked() {
 }
 
 void DeviceWindow::on_deleteButton_clicked() {
-    if (m_selected.empty())
-        return;
-    // What was selected when the question was asked, whatever a poll does to the selection meanwhile.
-    const QString site = m_siteTree->currentSite();
-    if (site == Sites::overviewId)
-        ask(ConfirmDialog::Kind::DeleteDevices,
-            [this, devices = m_selected] { m_actions->deleteDevices(devices); });
-    else
-        ask(ConfirmDialog::Kind::RemoveFromSite,
-            [this, devices = m_selected, site] { m_actions->removeFromSite(devices, site); });
-}
-
-void DeviceWindow::ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed) {
-    auto *confirm = new ConfirmDialog(kind, this, static_cast<int>(m_selected.size()));
-    confirm->setAttribute(Qt::WA_DeleteOnClose);
-    connect(confirm, &QDialog::accepted, this, agreed);
-    confirm->open();
+    QStringList ids;
+    for (const DeviceRecordPtr &device : selectedDevices())
+        ids += device->id;
+    m_placement->askToRemove(ids, m_siteTree->currentSite());
 }
 
 void DeviceWindow::exportDeviceList() {
@@ -539,14 +520,6 @@ void DeviceWindow::discardEdits() {
 
 void DeviceWindow::commitSites() {
     m_siteCommit->send();
-}
-
-void DeviceWindow::onDevicesDropped(const QString &siteId, const QStringList &deviceIds,
-                                    Qt::DropAction action, const QString &sourceSiteId) {
-    const std::vector<DeviceRecordPtr> devices = devicesWith(deviceIds);
-    if (devices.empty())
-        return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
-    m_actions->putIntoSite(devices, {siteId, sourceSiteId, action == Qt::MoveAction});
 }
 
 void DeviceWindow::onSiteChanged(const QString &siteId) {

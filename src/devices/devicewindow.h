@@ -1,6 +1,5 @@
 #pragma once
 
-#include "confirmdialog.h"
 #include "deviceinventory.h"
 #include "deviceoperations.h"
 #include "inventoryreader.h"
@@ -11,12 +10,12 @@
 #include <QPointer>
 #include <QWidget>
 
-#include <functional>
 #include <memory>
 
 class DeviceActions;
 class DeviceFooter;
 class DeviceMonitor;
+class DevicePlacement;
 class DeviceTabs;
 class DeviceToolBar;
 class InventoryUpdater;
@@ -87,7 +86,7 @@ private:
     void on_authorizeButton_clicked();
     void onAuthDevices(const QStringList &ids, const QString &name, const QString &password);
     void on_setPasswordButton_clicked();
-    void openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices);
+    void openSetPasswordDialog(const OperationTargets::List &targets);
     void onSetPassword(JSON &devices, const QString &name, const QString &password);
     void on_ipButton_clicked();
     void on_restartButton_clicked();
@@ -95,7 +94,6 @@ private:
     void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
     void on_deleteButton_clicked();
     void exportDeviceList();
-    void ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed);
 
     void applySearch(const QString &text);
     void applyStatusFilter(std::optional<DeviceStatusGroup> status);
@@ -108,11 +106,7 @@ private:
     void onServerLost();
     void onSelectionChanged();
     void onSiteChanged(const QString &siteId);
-    void onDevicesDropped(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
-                          const QString &sourceSiteId);
     QHash<QString, QString> siteNames() const;
-    /// Those of the devices that are still managed.
-    std::vector<DeviceRecordPtr> devicesWith(const QStringList &ids) const;
     OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
 
     void openRefreshDialog();
@@ -134,6 +128,7 @@ private:
     SiteCommit *m_siteCommit;
     InventoryUpdater *m_updater;
     DeviceActions *m_actions;
+    DevicePlacement *m_placement;
     DeviceToolBar *m_toolBar;
     NoticeBar *m_noticeBar;
     DeviceTabs *m_tabs;
