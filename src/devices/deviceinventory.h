@@ -46,12 +46,19 @@ private:
 
 using DeviceSnapshotPtr = std::shared_ptr<const DeviceSnapshot>;
 
+/// Between the states of a poll and a snapshot: a sign that the devices have changed. Both lists are sorted.
+struct DeviceDifference {
+    std::vector<std::string> unknown = {};   ///< ids that have a state and are not in the snapshot
+    std::vector<std::string> stateless = {}; ///< ids of the snapshot without a state
+
+    bool operator==(const DeviceDifference &) const = default;
+};
+
 /// What a poll found: the states that differ, for the snapshot that it was compared with.
 struct DeviceStatusUpdate {
     DeviceSnapshotPtr snapshot;
     std::vector<std::pair<int, DeviceStatusCode>> changes; ///< place in the snapshot, new code
-    bool devicesDiffer =
-        false; ///< the service knows other devices than the snapshot: time to read them again
+    DeviceDifference difference = {};
 };
 
 /// The devices that the console shows and their states. User-interface thread.

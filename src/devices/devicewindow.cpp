@@ -430,9 +430,11 @@ void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
 
 void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
     m_footer->markUpdated();
-    if (update.devicesDiffer)
-        reload();
-    if (!m_inventory.apply(update) || update.changes.empty())
+    // A poll of an older reading says nothing of the present one.
+    if (!m_inventory.apply(update))
+        return;
+    m_updater->reloadFor(update.difference);
+    if (update.changes.empty())
         return;
     m_tabs->refreshStatus();
     showStatusCounts();
@@ -453,11 +455,12 @@ void DeviceWindow::onServerAnswered() {
 }
 
 void DeviceWindow::onServerLost() {
+    if (m_refreshing)
+        m_refreshing->close();
+    // Last, since the end of a refresh counts as an answer.
     m_online = false;
     if (m_reconnecting && m_reconnecting->isVisible())
         return;
-    if (m_refreshing)
-        m_refreshing->close();
     if (!m_reconnecting) {
         m_reconnecting = new ReconnectingDialog(this);
         connect(m_reconnecting, &ReconnectingDialog::disconnectBtnClicked, this,
