@@ -276,7 +276,12 @@ void DeviceWindow::onTaskListUpdated() {
 }
 
 void DeviceWindow::openAddDialog() {
-    auto *dialog = new AddDeviceDialog(m_inventory.snapshot(), this);
+    const auto managed = [this] {
+        return m_updater->knowledge() == InventoryUpdater::Knowledge::Read ? m_inventory.snapshot() : nullptr;
+    };
+    auto *dialog = new AddDeviceDialog(managed(), this);
+    // After the inventory, which has heard of the reading before.
+    connect(m_updater, &InventoryUpdater::read, dialog, [dialog, managed] { dialog->setManaged(managed()); });
     connect(dialog, &AddDeviceDialog::devicesAdded, this, &DeviceWindow::reload);
     dialog->open();
 }
