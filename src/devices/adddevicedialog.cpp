@@ -273,8 +273,8 @@ void AddDeviceDialog::on_addButton_clicked() {
     updateState();
 }
 
-/// Sends those of the devices that the service does not have, and looks which of them it has after that. Other
-/// clients add devices too, and a device that is sent as a new one leaves its sites.
+/// Sends those of the devices that the service does not have, and looks which of them it has after that.
+/// Other clients add devices too, and a device that is sent as a new one leaves its sites.
 AddDeviceDialog::Addition AddDeviceDialog::addTo(ServiceSession &session,
                                                  const std::vector<DeviceRecordPtr> &devices) {
     Addition addition;

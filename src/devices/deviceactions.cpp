@@ -183,8 +183,8 @@ void DeviceActions::removeFromSite(const PresentDevices &devices, const QString 
         Change made;
         const auto outcomes = SiteMembership::removeFromSite(records, siteId, made.records);
         const int removed = countOf(outcomes, Outcome::Removed);
-        made.message = joined(
-            {tr("%n device(s) removed from the site.", nullptr, removed), leftOutText(vanished)});
+        made.message =
+            joined({tr("%n device(s) removed from the site.", nullptr, removed), leftOutText(vanished)});
         return made;
     };
     commit(tr("Removing devices from the site"), change, [this] { emit devicesDeleted(); });

@@ -3,7 +3,6 @@
 #include "adddevicedialog.h"
 #include "assignipdialog.h"
 #include "authorizedevicedialog.h"
-#include "clientstore.h"
 #include "confirmdialog.h"
 #include "consolecorner.h"
 #include "deviceactions.h"
@@ -31,7 +30,6 @@
 #include "taskinfopool.h"
 #include "transientmessage.h"
 
-#include <QComboBox>
 #include <QDebug>
 #include <QFileInfo>
 #include <QHBoxLayout>
@@ -142,8 +140,10 @@ void DeviceWindow::connectParts() {
     connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this,
             &DeviceWindow::onTaskListUpdated);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
-    connect(m_siteTree, &SiteTree::sitesEdited, this,
-            [this] { m_noticeBar->setVisible(m_siteTree->edits().isDirty()); });
+    connect(m_siteTree, &SiteTree::sitesEdited, this, [this] {
+        m_noticeBar->setVisible(m_siteTree->edits().isDirty());
+        followSiteNames();
+    });
     connect(m_siteTree, &SiteTree::editsDropped, this, [this](const QStringList &reasons) {
         emit onShowAnimatedMsgDlg(reasons.join(QLatin1Char('\n')));
     });
@@ -165,14 +165,10 @@ void DeviceWindow::connectParts() {
             });
     connect(m_tabs->corner()->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
     connect(m_footer, &DeviceFooter::statusFilterChanged, this, &DeviceWindow::applyStatusFilter);
-    connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(selectedDevices()); });
+    connect(m_selectionLogDelay, &QTimer::timeout, this,
+            [this] { DeviceLog::selectionChanged(selectedDevices()); });
     connect(this, &DeviceWindow::onShowAnimatedMsgDlg, this, &DeviceWindow::showDefAnimateMsgDlg);
-    QComboBox *servers = m_tabs->corner()->remoteCombo();
-    connect(servers, &QComboBox::activated, this, [this, servers](int index) {
-        const QString id = servers->itemData(index).toString();
-        servers->setCurrentIndex(-1);
-        emit remoteServerChosen(id);
-    });
+    connect(m_tabs->corner(), &ConsoleCorner::serverChosen, this, &DeviceWindow::remoteServerChosen);
     addShortcuts();
 }
 
@@ -222,12 +218,13 @@ void DeviceWindow::addShortcuts() {
 }
 
 void DeviceWindow::startWork() {
-    loadRemoteServers();
+    m_tabs->corner()->loadServers();
     m_online = false;
     m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(true);
-    for (const char *name : {"exportButton", "addDeviceButton"})
+    for (const char *name : {"exportButton", "addDeviceButton", "uploadButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(true);
-    m_toolBar->entry(QStringLiteral("exportDeviceListAction"))->setEnabled(true);
+    for (const char *name : {"exportDeviceListAction", "certificateListAction"})
+        m_toolBar->entry(QLatin1String(name))->setEnabled(true);
     m_siteTree->setFocus();
     reload();
     m_monitor->start();
@@ -235,7 +232,7 @@ void DeviceWindow::startWork() {
 
 void DeviceWindow::stopWork() {
     m_monitor->stop();
-    for (const char *name : {"refreshButton", "exportButton", "addDeviceButton"})
+    for (const char *name : {"refreshButton", "exportButton", "addDeviceButton", "uploadButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(false);
     clearFilter();
     if (m_reconnecting)
@@ -252,17 +249,6 @@ void DeviceWindow::stopWork() {
     showStatusCounts();
     showContent();
     m_footer->clear();
-}
-
-void DeviceWindow::loadRemoteServers() {
-    QComboBox *combo = m_tabs->corner()->remoteCombo();
-    combo->clear();
-    JSON servers;
-    CClientStore::instance().loadServerList(servers);
-    for (const JSON &server : servers)
-        combo->addItem(stringMember(server, "svrname"), stringMember(server, "id"));
-    combo->setCurrentIndex(-1);
-    combo->setEnabled(combo->count() > 0);
 }
 
 void DeviceWindow::reload() {
@@ -396,9 +382,16 @@ QHash<QString, QString> DeviceWindow::siteNames() const {
 }
 
 void DeviceWindow::applySearch(const QString &text) {
-    const DeviceSearch search(text, siteNames());
-    m_tabs->setSearch(search);
+    m_searchedSites = siteNames();
+    m_tabs->setSearch(DeviceSearch(text, m_searchedSites));
     onFilterChanged();
+}
+
+/// A search may name sites, which come and go and are renamed while it stands.
+void DeviceWindow::followSiteNames() {
+    const QString text = m_tabs->corner()->search()->text();
+    if (!text.isEmpty() && siteNames() != m_searchedSites)
+        applySearch(text);
 }
 
 void DeviceWindow::applyStatusFilter(std::optional<DeviceStatusGroup> status) {
@@ -419,8 +412,10 @@ void DeviceWindow::onFilterChanged() {
 void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     qDebug("update site info");
     qDebug("update device info");
-    if (reading.sites)
+    if (reading.sites) {
         m_siteTree->setSites(*reading.sites);
+        followSiteNames();
+    }
     if (reading.devices) {
         const DeviceSnapshotPtr previous = m_inventory.snapshot();
         m_inventory.replace(reading.devices, reading.codes);
@@ -546,20 +541,25 @@ void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
         return showDefAnimateMsgDlg(tr("The device is not managed any more."));
     if (m_tabs->selectDevice(place))
         return;
+    clearFilter();
     m_siteTree->select(Sites::overviewId);
-    m_tabs->selectDevice(place);
+    if (!m_tabs->selectDevice(place))
+        showDefAnimateMsgDlg(tr("The device cannot be shown."));
 }
 
 void DeviceWindow::onSelectionChanged() {
     const auto count = static_cast<int>(m_tabs->currentTable()->selectedDevices().size());
     qDebug("device selected: %d", count);
     m_selectionLogDelay->start();
-    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "uploadButton",
-                             "quickSettingButton", "restartButton", "restoreButton", "deleteButton"})
+    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "quickSettingButton",
+                             "restartButton", "restoreButton", "deleteButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(count > 0);
     m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(count > 0);
-    for (const auto &[name, kind] : uploadEntries)
-        m_toolBar->entry(QLatin1String(name))->setEnabled(count > 0);
+    for (const auto &[name, kind] : uploadEntries) {
+        // The list of certificates is about all devices.
+        if (kind != UploadKind::CertificateList)
+            m_toolBar->entry(QLatin1String(name))->setEnabled(count > 0);
+    }
     showSelectionCount();
 }
 

@@ -96,6 +96,7 @@ private:
     void exportDeviceList();
 
     void applySearch(const QString &text);
+    void followSiteNames();
     void applyStatusFilter(std::optional<DeviceStatusGroup> status);
     void clearFilter();
     void onFilterChanged();
@@ -113,7 +114,6 @@ private:
     void onRefreshDevice();
     void onRefreshDone();
 
-    void loadRemoteServers();
     void showContent();
     void showStatusCounts();
     void showSelectionCount();
@@ -137,6 +137,7 @@ private:
 
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
+    QHash<QString, QString> m_searchedSites; ///< the names by which the search knows sites
     bool m_tasksRunning = false;
     bool m_online = false;
 };
