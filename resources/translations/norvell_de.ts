@@ -377,6 +377,17 @@
         <source>Devices that the server does not reach by itself can be added manually or from a file.</source>
         <translation>Geräte, die der Server nicht von selbst erreicht, können manuell oder aus einer Datei hinzugefügt werden.</translation>
     </message>
+    <message numerus="yes">
+        <source>%n device(s) were managed already and stay as they are.</source>
+        <translation>
+            <numerusform>%n Gerät war bereits verwaltet und bleibt, wie es ist.</numerusform>
+            <numerusform>%n Geräte waren bereits verwaltet und bleiben, wie sie sind.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Waiting for the list of managed devices...</source>
+        <translation>Warten auf die Liste der verwalteten Geräte...</translation>
+    </message>
 </context>
 <context>
     <name>AddDeviceManualDialog</name>
@@ -1643,6 +1654,10 @@
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
         </translation>
     </message>
+    <message>
+        <source>%1 may have begun: %2. Look at its task before you try again.</source>
+        <translation>%1 hat vielleicht begonnen: %2. Sehen Sie sich die Aufgabe an, bevor Sie es erneut versuchen.</translation>
+    </message>
 </context>
 <context>
     <name>DeviceDiscovery</name>
@@ -1723,6 +1738,13 @@
     <message>
         <source>Copy rows</source>
         <translation>Zeilen kopieren</translation>
+    </message>
+</context>
+<context>
+    <name>DevicePlacement</name>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
     </message>
 </context>
 <context>
@@ -2049,6 +2071,10 @@
     <message>
         <source>The device is not managed any more.</source>
         <translation>Das Gerät wird nicht mehr verwaltet.</translation>
+    </message>
+    <message>
+        <source>The device cannot be shown.</source>
+        <translation>Das Gerät kann nicht angezeigt werden.</translation>
     </message>
 </context>
 <context>
@@ -3768,6 +3794,10 @@
         <source>New Password and Confirm Password don&apos;t match.</source>
         <translation>Neues Passwort und Bestätigung stimmen nicht überein.</translation>
     </message>
+    <message>
+        <source>Username and password are too long: together they may have %1 characters.</source>
+        <translation>Benutzername und Passwort sind zu lang: Zusammen dürfen sie %1 Zeichen haben.</translation>
+    </message>
 </context>
 <context>
     <name>SettingWindow</name>
@@ -4096,6 +4126,10 @@
     <message>
         <source>Devices can only be dropped on a site.</source>
         <translation>Geräte können nur auf einem Standort abgelegt werden.</translation>
+    </message>
+    <message>
+        <source>Apply the site changes first.</source>
+        <translation>Übernehmen Sie zuerst die Standortänderungen.</translation>
     </message>
 </context>
 <context>

@@ -370,6 +370,16 @@
         <source>Devices that the server does not reach by itself can be added manually or from a file.</source>
         <translation>サーバーが自動で検出できないデバイスは、手動またはファイルから追加できます。</translation>
     </message>
+    <message numerus="yes">
+        <source>%n device(s) were managed already and stay as they are.</source>
+        <translation>
+            <numerusform>%n 台のデバイスはすでに管理されているため、そのままです。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Waiting for the list of managed devices...</source>
+        <translation>管理中のデバイスの一覧を待っています...</translation>
+    </message>
 </context>
 <context>
     <name>AddDeviceManualDialog</name>
@@ -1615,6 +1625,10 @@
             <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
         </translation>
     </message>
+    <message>
+        <source>%1 may have begun: %2. Look at its task before you try again.</source>
+        <translation>「%1」は開始された可能性があります: %2。再試行する前にタスクを確認してください。</translation>
+    </message>
 </context>
 <context>
     <name>DeviceDiscovery</name>
@@ -1691,6 +1705,13 @@
     <message>
         <source>Copy rows</source>
         <translation>行をコピー</translation>
+    </message>
+</context>
+<context>
+    <name>DevicePlacement</name>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>デバイスは管理されなくなっています。</translation>
     </message>
 </context>
 <context>
@@ -2017,6 +2038,10 @@
     <message>
         <source>The device is not managed any more.</source>
         <translation>デバイスは管理されなくなっています。</translation>
+    </message>
+    <message>
+        <source>The device cannot be shown.</source>
+        <translation>デバイスを表示できません。</translation>
     </message>
 </context>
 <context>
@@ -3719,6 +3744,10 @@
         <source>New Password and Confirm Password don&apos;t match.</source>
         <translation>新しいパスワードと確認用パスワードが一致しません。</translation>
     </message>
+    <message>
+        <source>Username and password are too long: together they may have %1 characters.</source>
+        <translation>ユーザー名とパスワードが長すぎます: 合わせて %1 文字までです。</translation>
+    </message>
 </context>
 <context>
     <name>SettingWindow</name>
@@ -4047,6 +4076,10 @@
     <message>
         <source>Devices can only be dropped on a site.</source>
         <translation>デバイスはサイトの上にのみドロップできます。</translation>
+    </message>
+    <message>
+        <source>Apply the site changes first.</source>
+        <translation>先にサイトの変更を適用してください。</translation>
     </message>
 </context>
 <context>

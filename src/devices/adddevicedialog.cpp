@@ -24,6 +24,8 @@
 struct AddDeviceDialog::Addition {
     unsigned result = ApiOk;
     unsigned check = ApiOk; ///< of reading the list back
+    int sent = 0;
+    int known = 0; ///< devices that were not sent, since the service had them by then
     std::vector<DeviceRecordPtr> missing;
 };
 
@@ -33,6 +35,13 @@ constexpr int pageSize = 500;
 
 std::string macOf(const JSON &record) {
     return DeviceRecords::identityOf({{"d_mac", std::string(textMember(record, "d_mac"))}}).toStdString();
+}
+
+unsigned readMacs(ServiceSession &session, std::unordered_set<std::string> &macs) {
+    return PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
+        for (const JSON &record : page)
+            macs.insert(macOf(record));
+    });
 }
 
 /// The record as it came; what is managed at all is in the overview.
@@ -76,7 +85,7 @@ AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *pare
     : FramelessDialog(parent),
       m_ui(formIn<Ui::AddDeviceDialog>(content())),
       m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
-      m_model(new DiscoveredModel(*managed, this)),
+      m_model(new DiscoveredModel(this)),
       m_discovery(new DeviceDiscovery(this)) {
     setObjectName(QStringLiteral("AddDeviceDialog"));
     setWindowTitle(tr("Add Device"));
@@ -99,10 +108,18 @@ AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *pare
     m_ui->spinner->setSizePolicy(policy);
     connectParts();
     updateSelection();
-    updateState();
+    setManaged(managed);
 }
 
 AddDeviceDialog::~AddDeviceDialog() = default;
+
+void AddDeviceDialog::setManaged(const DeviceSnapshotPtr &managed) {
+    m_managed = managed;
+    // What is being added stays until that is done.
+    if (managed && !m_adding)
+        m_knownFound += m_model->setManaged(*managed);
+    updateState();
+}
 
 void AddDeviceDialog::connectParts() {
     connect(m_model, &DiscoveredModel::changed, this, [this] {
@@ -239,53 +256,66 @@ void AddDeviceDialog::onCsvRead(const QString &name, const CsvDevices::Reading &
 
 void AddDeviceDialog::on_addButton_clicked() {
     const std::vector<DeviceRecordPtr> devices = m_model->checkedDevices();
-    if (devices.empty() || m_adding)
+    if (devices.empty() || m_adding || !m_managed)
         return;
     logSelected(devices);
     m_warning.setText({});
     m_adding = true;
     DeviceDiscovery::request(
         this, "adding devices", [devices](ServiceSession &session) { return addTo(session, devices); },
-        [this, count = static_cast<int>(devices.size())](const Addition &addition) {
-            onAdded(addition, count);
-        },
+        [this](const Addition &addition) { onAdded(addition); },
         [this](const QString &reason) { onAddFailed(reason); });
     updateState();
 }
 
-/// Sends the devices and looks which of them the service has after that.
+/// Sends those of the devices that the service does not have, and looks which of them it has after that.
+/// Other clients add devices too, and a device that is sent as a new one leaves its sites.
 AddDeviceDialog::Addition AddDeviceDialog::addTo(ServiceSession &session,
                                                  const std::vector<DeviceRecordPtr> &devices) {
-    JSON records = JSON::array();
-    for (const DeviceRecordPtr &device : devices)
-        records.push_back(recordToAdd(*device));
     Addition addition;
-    addition.result = DeviceCommit::send(session, records);
+    std::unordered_set<std::string> present;
+    addition.result = readMacs(session, present);
     if (addition.result != ApiOk)
         return addition;
-    std::unordered_set<std::string> present;
-    addition.check = PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
-        for (const JSON &record : page)
-            present.insert(macOf(record));
-    });
-    for (std::size_t i = 0; addition.check == ApiOk && i < devices.size(); ++i) {
+    JSON records = JSON::array();
+    std::vector<DeviceRecordPtr> sent;
+    for (const DeviceRecordPtr &device : devices) {
+        JSON record = recordToAdd(*device);
+        if (present.contains(macOf(record)))
+            continue;
+        records.push_back(std::move(record));
+        sent.push_back(device);
+    }
+    addition.sent = static_cast<int>(sent.size());
+    addition.known = static_cast<int>(devices.size()) - addition.sent;
+    addition.result = DeviceCommit::send(session, records);
+    if (addition.result != ApiOk || sent.empty())
+        return addition;
+    addition.check = readMacs(session, present);
+    for (std::size_t i = 0; addition.check == ApiOk && i < sent.size(); ++i) {
         if (!present.contains(macOf(records[i])))
-            addition.missing.push_back(devices[i]);
+            addition.missing.push_back(sent[i]);
     }
     return addition;
 }
 
-void AddDeviceDialog::onAdded(const Addition &addition, int count) {
+void AddDeviceDialog::onAdded(const Addition &addition) {
     if (addition.result != ApiOk)
         return onAddFailed(apiResultText(addition.result));
     m_adding = false;
     accept();
     const int missing = static_cast<int>(addition.missing.size());
+    QStringList told;
     if (addition.check != ApiOk)
-        tell(tr("%n device(s) sent; whether the server lists them could not be checked: %1.", nullptr, count)
-                 .arg(apiResultText(addition.check)));
-    else if (missing < count)
-        tell(tr("%n device(s) added.", nullptr, count - missing));
+        told += tr("%n device(s) sent; whether the server lists them could not be checked: %1.", nullptr,
+                   addition.sent)
+                    .arg(apiResultText(addition.check));
+    else if (missing < addition.sent)
+        told += tr("%n device(s) added.", nullptr, addition.sent - missing);
+    if (addition.known > 0)
+        told += tr("%n device(s) were managed already and stay as they are.", nullptr, addition.known);
+    if (!told.isEmpty())
+        tell(told.join(QLatin1Char(' ')));
     std::vector<InvalidDeviceDialog::Entry> entries;
     for (const DeviceRecordPtr &device : addition.missing)
         entries.push_back({tr("%1, %2").arg(device->text(DeviceColumn::Ip), device->text(DeviceColumn::Mac)),
@@ -299,7 +329,7 @@ void AddDeviceDialog::onAddFailed(const QString &reason) {
     m_adding = false;
     const QString message = tr("The devices could not be added: %1.").arg(reason);
     m_warning.setText(message);
-    updateState();
+    setManaged(m_managed);
     if (isVisible())
         return;
     tell(message);
@@ -331,7 +361,7 @@ void AddDeviceDialog::updateState() {
     for (QWidget *button : std::initializer_list<QWidget *>{m_ui->refreshButton, m_ui->addManuallyButton,
                                                             m_ui->importCsvButton, m_ui->templateButton})
         button->setEnabled(!m_adding && !m_onFile);
-    m_ui->addButton->setEnabled(!m_adding && !m_onFile && m_model->checkedCount() > 0);
+    m_ui->addButton->setEnabled(!m_adding && !m_onFile && m_managed && m_model->checkedCount() > 0);
     m_ui->cancelButton->setText(m_adding ? tr("Close") : tr("Cancel"));
     const bool hasRows = m_model->rowCount() > 0;
     m_ui->selectAllCheckBox->setEnabled(hasRows && !m_adding);
@@ -346,7 +376,7 @@ QString AddDeviceDialog::waitText() const {
     if (m_onFile)
         return tr("Working on the file...");
     if (!m_discovery->isSearching())
-        return {};
+        return m_managed ? QString() : tr("Waiting for the list of managed devices...");
     const int passed = m_discovery->passedSeconds();
     if (passed == DeviceDiscovery::scanSeconds)
         return tr("Reading what was found...");

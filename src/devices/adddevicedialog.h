@@ -28,9 +28,13 @@ public:
     /// Asks the user for a path and calls the function with it, or never.
     using AskPath = std::function<void(const std::function<void(const QString &path)> &chosen)>;
 
-    /// managed: the devices that the service has already.
+    /// managed: as for setManaged.
     explicit AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *parent = nullptr);
     ~AddDeviceDialog() override;
+
+    /// The devices that the service has by the latest reading; null while that is not known, and then nothing
+    /// can be added: a device that is sent as a new one leaves its sites.
+    void setManaged(const DeviceSnapshotPtr &managed);
 
     /// Replace the file dialogs.
     void setAskOpenPath(AskPath ask) { m_askOpenPath = std::move(ask); }
@@ -61,7 +65,7 @@ private:
     void importCsv(const QString &path);
     void onCsvRead(const QString &name, const CsvDevices::Reading &reading);
     void saveTemplate(const QString &path);
-    void onAdded(const Addition &addition, int count);
+    void onAdded(const Addition &addition);
     void onAddFailed(const QString &reason);
 
     /// Tells over the dialog, or over its parent once it is closed.
@@ -78,6 +82,7 @@ private:
     DeviceDiscovery *m_discovery;
     AskPath m_askOpenPath;
     AskPath m_askSavePath;
+    DeviceSnapshotPtr m_managed;
     bool m_searched = false; ///< at least once
     bool m_adding = false;
     bool m_onFile = false; ///< a job on a file runs

@@ -1,11 +1,13 @@
 #include "addresspattern.h"
 
+#include <QDebug>
 #include <QRegularExpression>
 #include <QStringList>
 
 #include <algorithm>
 #include <array>
 #include <cstdlib>
+#include <stdexcept>
 
 namespace AddressPattern {
 
@@ -25,7 +27,7 @@ Span spanOf(const QString &part) {
     if (part == QLatin1String("*"))
         return {0, largestPart};
     const QStringList ends = part.split(u'-');
-    const auto [low, high] = std::minmax(ends.first().toInt(), ends.last().toInt());
+    const auto [low, high] = std::minmax({ends.first().toInt(), ends.last().toInt()});
     return {low, std::min(high, largestPart)};
 }
 
@@ -100,7 +102,18 @@ QStringList split(const QString &list) {
     return list.split(separator, Qt::SkipEmptyParts);
 }
 
-qint64 count(const QString &pattern) {
+namespace {
+
+/// Throws for a text that is no number.
+int numberOf(const QString &text) {
+    bool isNumber = false;
+    const int number = text.toInt(&isNumber);
+    if (!isNumber)
+        throw std::invalid_argument('"' + text.toStdString() + "\" is no number");
+    return number;
+}
+
+qint64 product(const QString &pattern) {
     qint64 product = 1;
     for (const QString &part : pattern.split(u'.')) {
         const QStringList ends = part.split(u'-');
@@ -108,10 +121,21 @@ qint64 count(const QString &pattern) {
             product *= largestPart + 1;
         else if (part.contains(u'-'))
             product *= ends.size() == 2 && !ends.contains(QString())
-                           ? std::abs(ends[0].toInt() - ends[1].toInt()) + 1
+                           ? std::abs(numberOf(ends[0]) - numberOf(ends[1])) + 1
                            : 0;
     }
     return product;
+}
+
+} // namespace
+
+qint64 count(const QString &pattern) {
+    try {
+        return product(pattern);
+    } catch (const std::exception &error) {
+        qWarning("Counting IPs occur error - %s", error.what());
+        return 0;
+    }
 }
 
 bool isUsable(quint32 address, const Limits &limits) {

@@ -13,6 +13,7 @@
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
+#include <exception>
 
 namespace {
 
@@ -29,6 +30,16 @@ qint64 countOf(const QStringList &patterns) {
     return count;
 }
 
+/// Builds a part of the dialog; what fails there leaves the other parts as good as they are.
+template <typename Build>
+void guarded(const char *message, const Build &build) {
+    try {
+        build();
+    } catch (const std::exception &error) {
+        qWarning("%s%s", message, error.what());
+    }
+}
+
 } // namespace
 
 AssignIpDialogII::AssignIpDialogII(OperationTargets::List targets, const DeviceSnapshotPtr &managed,
@@ -42,15 +53,19 @@ AssignIpDialogII::AssignIpDialogII(OperationTargets::List targets, const DeviceS
     setObjectName(QStringLiteral("AssignIpDialogII"));
     setWindowTitle(tr("Assign IP"));
     setAttribute(Qt::WA_DeleteOnClose);
-    m_ui->methodComboBox->addItems({tr("Auto"), tr("Manual")});
-    m_ui->maskEdit->setText(QStringLiteral("255.255.255.0"));
-    m_ui->warningsLayout->addWidget(m_targetWarnings);
-    initTable();
+    guarded("Initiated configuration UI occurs error: ", [this] { initFields(); });
+    guarded("Initiated table UI occurs error: ", [this] { initTable(); });
     connectParts();
     onMethodChanged();
 }
 
 AssignIpDialogII::~AssignIpDialogII() = default;
+
+void AssignIpDialogII::initFields() {
+    m_ui->methodComboBox->addItems({tr("Auto"), tr("Manual")});
+    m_ui->maskEdit->setText(QStringLiteral("255.255.255.0"));
+    m_ui->warningsLayout->addWidget(m_targetWarnings);
+}
 
 void AssignIpDialogII::initTable() {
     m_ui->searchEdit->addAction(

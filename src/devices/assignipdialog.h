@@ -25,6 +25,7 @@ public:
     ~AssignIpDialogII() override;
 
 private:
+    void initFields();
     void initTable();
     void connectParts();
     bool isManual() const;

@@ -1,11 +1,14 @@
 #include "consolecorner.h"
 
+#include "clientstore.h"
 #include "icons.h"
 
 #include <QComboBox>
 #include <QHBoxLayout>
 #include <QLineEdit>
 #include <QToolButton>
+
+#include <nlohmann/json.hpp>
 
 #include <algorithm>
 
@@ -33,6 +36,11 @@ ConsoleCorner::ConsoleCorner(QWidget *parent)
     m_remoteCombo->setAccessibleName(tr("Remote connection"));
     m_remoteCombo->setPlaceholderText(tr("Remote connection"));
     m_remoteCombo->setMinimumWidth(126);
+    connect(m_remoteCombo, &QComboBox::activated, this, [this](int index) {
+        const QString id = m_remoteCombo->itemData(index).toString();
+        m_remoteCombo->setCurrentIndex(-1);
+        emit serverChosen(id);
+    });
     m_columns->setObjectName(QStringLiteral("columnsButton"));
     m_columns->setAccessibleName(tr("Columns"));
     m_columns->setToolTip(tr("Columns"));
@@ -46,6 +54,16 @@ ConsoleCorner::ConsoleCorner(QWidget *parent)
     layout->addWidget(m_search, 3);
     layout->addWidget(m_remoteCombo, 2);
     layout->addWidget(m_columns);
+}
+
+void ConsoleCorner::loadServers() {
+    m_remoteCombo->clear();
+    JSON servers;
+    CClientStore::instance().loadServerList(servers);
+    for (const JSON &server : servers)
+        m_remoteCombo->addItem(stringMember(server, "svrname"), stringMember(server, "id"));
+    m_remoteCombo->setCurrentIndex(-1);
+    m_remoteCombo->setEnabled(m_remoteCombo->count() > 0);
 }
 
 QSize ConsoleCorner::sizeHint() const {

@@ -14,11 +14,16 @@ public:
     explicit ConsoleCorner(QWidget *parent = nullptr);
 
     QLineEdit *search() const { return m_search; }
-    QComboBox *remoteCombo() const { return m_remoteCombo; }
     QToolButton *columnsButton() const { return m_columns; }
+
+    /// Offers the servers of the saved list.
+    void loadServers();
 
     /// As wide as the tabs leave room for, within bounds.
     QSize sizeHint() const override;
+
+signals:
+    void serverChosen(const QString &serverId);
 
 private:
     QLineEdit *m_search;

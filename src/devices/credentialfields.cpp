@@ -1,11 +1,9 @@
 #include "credentialfields.h"
 
-#include "credentialrules.h"
 #include "passwordedit.h"
 
 #include <QComboBox>
 #include <QLabel>
-#include <QLineEdit>
 
 namespace CredentialFields {
 
@@ -15,14 +13,12 @@ QComboBox *makeName(QWidget *parent) {
     name->setEditable(true);
     name->setInsertPolicy(QComboBox::NoInsert);
     name->addItems({QStringLiteral("root"), QStringLiteral("admin")});
-    name->lineEdit()->setMaxLength(CredentialRules::longestName);
     return name;
 }
 
 PasswordEdit *makePassword(const char *objectName, QWidget *parent) {
     auto *password = new PasswordEdit(parent);
     password->setObjectName(QLatin1String(objectName));
-    password->setMaxLength(CredentialRules::longestPassword);
     return password;
 }
 

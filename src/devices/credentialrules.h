@@ -6,10 +6,6 @@
 /// text, nothing where it is good.
 namespace CredentialRules {
 
-/// Longer ones would not fit into the command that a device gets.
-inline constexpr int longestName = 64;
-inline constexpr int longestPassword = 64;
-
 QString nameProblem(const QString &name);
 QString passwordProblem(const QString &password);
 

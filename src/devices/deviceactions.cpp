@@ -55,6 +55,32 @@ QString authorizationText(const std::map<DeviceStatusCode, int> &states, int ask
 
 constexpr std::chrono::seconds authorizationTime{2};
 
+/// One message of several sentences: each message takes the place of the one before it.
+QString joined(QStringList sentences) {
+    sentences.removeAll(QString());
+    return sentences.join(QLatin1Char(' '));
+}
+
+/// Empty for none.
+QString leftOutText(qsizetype vanished) {
+    if (vanished == 0)
+        return {};
+    return DeviceActions::tr("%n device(s) were left out: the server does not manage them any more.", nullptr,
+                             static_cast<int>(vanished));
+}
+
+/// Why an operation under a task did not go well.
+QString failureText(const QString &name, const DeviceOperations::Outcome &outcome) {
+    const QString reason = apiResultText(outcome.result);
+    if (outcome.tid.isEmpty())
+        return DeviceActions::tr("%1 could not be started: %2.").arg(name, reason);
+    if (outcome.result == ApiServerError)
+        return DeviceActions::tr("%1 failed: %2.").arg(name, reason);
+    // With its task made, only the answer may be lost.
+    return DeviceActions::tr("%1 may have begun: %2. Look at its task before you try again.")
+        .arg(name, reason);
+}
+
 QString busyText(const QString &name) {
     return DeviceActions::tr("%1 could not be started: the client is busy, try again.").arg(name);
 }
@@ -102,14 +128,16 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
             return DeviceOperations::authorize(session, deviceIds, name, password);
         },
         [this, title, deviceIds](const DeviceOperations::Outcome &outcome) {
-            tellVanished(outcome.vanished);
+            const QString leftOut = leftOutText(outcome.vanished.size());
             if (outcome.result != ApiOk)
-                return emit failed(tr("%1 failed: %2.").arg(title, apiResultText(outcome.result)));
+                return emit failed(
+                    joined({tr("%1 failed: %2.").arg(title, apiResultText(outcome.result)), leftOut}));
             QStringList asked = deviceIds;
             asked.removeIf([&](const QString &id) { return outcome.vanished.contains(id); });
-            emit done(tr("The credentials are on their way to %n device(s).", nullptr,
-                         static_cast<int>(asked.size())));
-            tellAuthorized(asked);
+            emit done(joined({tr("The credentials are on their way to %n device(s).", nullptr,
+                                 static_cast<int>(asked.size())),
+                              leftOut}));
+            tellAuthorized(asked, leftOut);
         },
         [this, title](JobEnd end) {
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
@@ -120,22 +148,25 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
 }
 
 /// The devices need a moment to look at the credentials.
-void DeviceActions::tellAuthorized(const QStringList &deviceIds) {
+void DeviceActions::tellAuthorized(const QStringList &deviceIds, const QString &leftOut) {
     ServiceRequest::post(
         NetJob::createRunner("reading the states after an authorization", NetTask::Turn::Beside), this,
         [deviceIds](ServiceSession &session) { return DeviceOperations::readStates(session, deviceIds); },
-        [this, asked = static_cast<int>(deviceIds.size())](const std::map<DeviceStatusCode, int> &states) {
+        [this, leftOut,
+         asked = static_cast<int>(deviceIds.size())](const std::map<DeviceStatusCode, int> &states) {
             emit statesChanged();
             if (!states.empty())
-                emit done(authorizationText(states, asked));
+                emit done(joined({authorizationText(states, asked), leftOut}));
         },
         {}, [] { std::this_thread::sleep_for(authorizationTime); });
 }
 
-void DeviceActions::deleteDevices(const std::vector<DeviceRecordPtr> &devices) {
+void DeviceActions::deleteDevices(const PresentDevices &devices) {
     const auto change = [devices] {
-        Change made{JSON::array(), tr("%n device(s) deleted.", nullptr, static_cast<int>(devices.size()))};
-        for (const DeviceRecordPtr &device : devices) {
+        const auto count = static_cast<int>(devices.records.size());
+        Change made{JSON::array(),
+                    joined({tr("%n device(s) deleted.", nullptr, count), leftOutText(devices.vanished)})};
+        for (const DeviceRecordPtr &device : devices.records) {
             qDebug("At device overview, remove device id directly: %s", qUtf8Printable(device->id));
             JSON record = parseJson(device->json);
             // A record without sites is how the service is told to forget a device.
@@ -147,20 +178,20 @@ void DeviceActions::deleteDevices(const std::vector<DeviceRecordPtr> &devices) {
     commit(tr("Deleting devices"), change, [this] { emit devicesDeleted(); });
 }
 
-void DeviceActions::removeFromSite(const std::vector<DeviceRecordPtr> &devices, const QString &siteId) {
-    const auto change = [records = recordTexts(devices), siteId] {
+void DeviceActions::removeFromSite(const PresentDevices &devices, const QString &siteId) {
+    const auto change = [records = recordTexts(devices.records), vanished = devices.vanished, siteId] {
         Change made;
         const auto outcomes = SiteMembership::removeFromSite(records, siteId, made.records);
+        const int removed = countOf(outcomes, Outcome::Removed);
         made.message =
-            tr("%n device(s) removed from the site.", nullptr, countOf(outcomes, Outcome::Removed));
+            joined({tr("%n device(s) removed from the site.", nullptr, removed), leftOutText(vanished)});
         return made;
     };
     commit(tr("Removing devices from the site"), change, [this] { emit devicesDeleted(); });
 }
 
-void DeviceActions::putIntoSite(const std::vector<DeviceRecordPtr> &devices,
-                                const SiteMembership::Drop &drop) {
-    const auto change = [records = recordTexts(devices), drop] {
+void DeviceActions::putIntoSite(const PresentDevices &devices, const SiteMembership::Drop &drop) {
+    const auto change = [records = recordTexts(devices.records), vanished = devices.vanished, drop] {
         Change made;
         const auto outcomes = SiteMembership::assign(records, drop, made.records);
         const int moved = countOf(outcomes, Outcome::Moved);
@@ -175,7 +206,8 @@ void DeviceActions::putIntoSite(const std::vector<DeviceRecordPtr> &devices,
             parts += tr("%n device(s) in the site already.", nullptr, present);
         if (unreadable > 0)
             parts += tr("%n device record(s) could not be read.", nullptr, unreadable);
-        made.message = parts.join(QLatin1Char(' '));
+        parts += leftOutText(vanished);
+        made.message = joined(parts);
         return made;
     };
     commit(tr("Putting devices into the site"), change, {});
@@ -245,11 +277,12 @@ void DeviceActions::start(const Errand &errand, NetTask *runner, const std::func
         [this, errand, begun](const DeviceOperations::Outcome &outcome) {
             if (!outcome.tid.isEmpty())
                 remember(outcome.tid, errand);
-            tellVanished(outcome.vanished);
+            const QString leftOut = leftOutText(outcome.vanished.size());
             if (outcome.result != ApiOk)
-                emit failed(
-                    tr("%1 could not be started: %2.").arg(errand.name, apiResultText(outcome.result)));
-            else if (begun)
+                return emit failed(joined({failureText(errand.name, outcome), leftOut}));
+            if (!leftOut.isEmpty())
+                emit failed(leftOut);
+            if (begun)
                 begun();
         },
         [this, name = errand.name](JobEnd end) {
@@ -271,10 +304,4 @@ void DeviceActions::remember(const QString &tid, const Errand &errand) {
             actions->start({name, ids, operation, {}});
     };
     TaskRepeats::instance().remember(tid, {again, static_cast<bool>(errand.again)});
-}
-
-void DeviceActions::tellVanished(const QStringList &deviceIds) {
-    if (!deviceIds.isEmpty())
-        emit failed(tr("%n device(s) were left out: the server does not manage them any more.", nullptr,
-                       static_cast<int>(deviceIds.size())));
 }

@@ -27,12 +27,13 @@ public:
     void setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy, NetTask *runner,
                            const std::function<void()> &begun);
 
-    /// Deletes devices from the service for good.
-    void deleteDevices(const std::vector<DeviceRecordPtr> &devices);
+    /// Deletes devices from the service for good. Here and below, what is done is told with how many devices
+    /// were not there any more.
+    void deleteDevices(const PresentDevices &devices);
     /// Takes devices out of a site.
-    void removeFromSite(const std::vector<DeviceRecordPtr> &devices, const QString &siteId);
+    void removeFromSite(const PresentDevices &devices, const QString &siteId);
     /// Puts devices into a site; a move takes them out of the source site.
-    void putIntoSite(const std::vector<DeviceRecordPtr> &devices, const SiteMembership::Drop &drop);
+    void putIntoSite(const PresentDevices &devices, const SiteMembership::Drop &drop);
 
     /// Writes the devices at the places to a file, in that order.
     void exportList(const QString &path, const DeviceSnapshotPtr &devices, const std::vector<int> &places);
@@ -70,6 +71,6 @@ private:
     void start(const Errand &errand);
     void start(const Errand &errand, NetTask *runner, const std::function<void()> &begun);
     void remember(const QString &tid, const Errand &errand);
-    void tellAuthorized(const QStringList &deviceIds);
-    void tellVanished(const QStringList &deviceIds);
+    /// leftOut: a sentence about the devices that were not asked; empty for none.
+    void tellAuthorized(const QStringList &deviceIds, const QString &leftOut);
 };

@@ -38,7 +38,9 @@ unsigned send(ServiceSession &session, const JSON &records) {
         return ApiOk;
     const unsigned result =
         records.size() <= batchSize ? sendStage(session, records, "all") : sendBatches(session, records);
-    if (result != ApiOk)
+    if (result == ApiOk)
+        qDebug("commit device info: %s", dumpJson(records).c_str());
+    else
         qWarning("HTTP API(commitDevices) failed!");
     return result;
 }

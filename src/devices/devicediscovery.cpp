@@ -1,5 +1,7 @@
 #include "devicediscovery.h"
 
+#include "apilog.h"
+
 #include <QDebug>
 
 #include <nlohmann/json.hpp>
@@ -26,10 +28,13 @@ unsigned startOnService(ServiceSession &session, const DeviceDiscovery::Search &
     const QByteArray to = search.to.toUtf8();
     switch (search.method) {
     case DeviceDiscovery::Method::Address:
-        return session.call([&](CApiClient &client) { return client.deviceDiscoverByIP(from, seconds); });
+        return ApiLog::logged("deviceDiscoverByIP", session.call([&](CApiClient &client) {
+            return client.deviceDiscoverByIP(from, seconds);
+        }));
     case DeviceDiscovery::Method::Range:
-        return session.call(
-            [&](CApiClient &client) { return client.deviceDiscoverByIPs(from, to, seconds); });
+        return ApiLog::logged("deviceDiscoverByIPs", session.call([&](CApiClient &client) {
+            return client.deviceDiscoverByIPs(from, to, seconds);
+        }));
     case DeviceDiscovery::Method::Network:
         break;
     }
@@ -48,7 +53,7 @@ Found readFound(ServiceSession &session, DeviceDiscovery::Method method) {
     found.result = session.call([&](CApiClient &client) { return client.discoveredDevices(records); });
     if (found.result == ApiOk && !records.is_array())
         found.result = ApiMissingData;
-    if (found.result != ApiOk)
+    if (ApiLog::logged("discoveredDevices", found.result) != ApiOk)
         return found;
     const int count = static_cast<int>(records.size());
     if (method == DeviceDiscovery::Method::Network)

@@ -24,21 +24,24 @@ constexpr Field beforeNetworkType[] = {{DeviceColumn::HostName, "d_hostname"},
 constexpr Field afterNetworkType[] = {
     {DeviceColumn::Model, "d_model"}, {DeviceColumn::Mac, "d_mac"}, {DeviceColumn::Firmware, "d_fw"}};
 
+/// As it is, but that a line break would make two lines of a device.
+QByteArray inOneLine(QString text) {
+    return text.replace(QLatin1Char('\n'), QLatin1Char(' ')).remove(QLatin1Char('\r')).toUtf8();
+}
+
 /// What the table shows, which is the record's own text in all but odd records.
 QByteArray value(const DeviceRecord &device, const Field &field) {
     QString text = device.text(field.column);
     if (text == QLatin1String("--"))
         text = stringMember(JSON::parse(device.json, nullptr, false), field.member);
-    // A line break would make two lines of a device.
-    text.replace(QLatin1Char('\n'), QLatin1Char(' ')).remove(QLatin1Char('\r'));
-    return text.toUtf8();
+    return inOneLine(text);
 }
 
 void append(QByteArray &lines, const DeviceRecord &device) {
     lines += brand;
     for (const Field &field : beforeNetworkType)
         lines += ',' + value(device, field);
-    lines += ',' + device.networkType.simplified().toUtf8();
+    lines += ',' + inOneLine(device.networkType);
     for (const Field &field : afterNetworkType)
         lines += ',' + value(device, field);
     lines += '\n';

@@ -27,6 +27,17 @@ int DeviceSnapshot::indexOf(const std::string &id) const {
     return found == m_byId.end() ? -1 : found->second;
 }
 
+PresentDevices DeviceSnapshot::presentOf(const QStringList &ids) const {
+    PresentDevices present;
+    for (const QString &id : ids) {
+        if (const int place = indexOf(id); place >= 0)
+            present.records.push_back(at(place));
+        else
+            ++present.vanished;
+    }
+    return present;
+}
+
 int DeviceSnapshot::siteCount(const QString &siteId) const {
     return siteId == Sites::overviewId ? size() : m_siteCounts.value(siteId);
 }

@@ -4,12 +4,19 @@
 #include "devicestatus.h"
 
 #include <QHash>
+#include <QStringList>
 
 #include <memory>
 #include <string>
 #include <unordered_map>
 #include <utility>
 #include <vector>
+
+/// Those of some devices that are still managed.
+struct PresentDevices {
+    std::vector<DeviceRecordPtr> records;
+    int vanished = 0; ///< how many of them are not
+};
 
 /// The devices of one reading, with their indexes. Built once on any thread, never changed after that.
 class DeviceSnapshot {
@@ -25,6 +32,9 @@ public:
     int indexOf(const QString &id) const;
     int indexOf(const std::string &id) const;
 
+    /// The present records of devices that somebody has chosen earlier.
+    PresentDevices presentOf(const QStringList &ids) const;
+
     /// How many devices are in a site; all of them for the overview.
     int siteCount(const QString &siteId) const;
 
@@ -36,12 +46,19 @@ private:
 
 using DeviceSnapshotPtr = std::shared_ptr<const DeviceSnapshot>;
 
+/// Between the states of a poll and a snapshot: a sign that the devices have changed. Both lists are sorted.
+struct DeviceDifference {
+    std::vector<std::string> unknown = {};   ///< ids that have a state and are not in the snapshot
+    std::vector<std::string> stateless = {}; ///< ids of the snapshot without a state
+
+    bool operator==(const DeviceDifference &) const = default;
+};
+
 /// What a poll found: the states that differ, for the snapshot that it was compared with.
 struct DeviceStatusUpdate {
     DeviceSnapshotPtr snapshot;
     std::vector<std::pair<int, DeviceStatusCode>> changes; ///< place in the snapshot, new code
-    bool devicesDiffer =
-        false; ///< the service knows other devices than the snapshot: time to read them again
+    DeviceDifference difference = {};
 };
 
 /// The devices that the console shows and their states. User-interface thread.

@@ -1,5 +1,6 @@
 #include "deviceoperations.h"
 
+#include "apilog.h"
 #include "devicesleft.h"
 #include "messagelog.h"
 #include "pagereader.h"
@@ -33,9 +34,9 @@ JSON idsOf(const QStringList &deviceIds) {
 /// Makes a task for the devices; the outcome's task is empty where the service made none.
 Outcome makeTask(ServiceSession &session, const QString &type, const QStringList &deviceIds) {
     JSON task;
-    const unsigned result = session.call([&](CApiClient &client) {
+    const unsigned result = ApiLog::logged("newTaskState", session.call([&](CApiClient &client) {
         return client.newTaskState(type.toUtf8().constData(), idsOf(deviceIds), task);
-    });
+    }));
     const QString tid = result == ApiOk ? stringMember(task, "tid") : QString();
     return {result == ApiOk && tid.isEmpty() ? unsigned{ApiMissingData} : result, tid, {}};
 }
@@ -74,9 +75,9 @@ Outcome runCommand(ServiceSession &session, const QString &type, const QStringLi
         for (const QString &id : ids)
             targets.push_back({{"id", id.toStdString()}, {"tid", tid}});
         JSON answers;
-        return session.call([&](CApiClient &client) {
+        return ApiLog::logged("runCustomCgisEx", session.call([&](CApiClient &client) {
             return client.runCustomCgisEx(JSON::array({command.toStdString()}), targets, answers);
-        });
+        }));
     });
 }
 
@@ -96,11 +97,17 @@ QByteArray formatted(const char *format, Values... values) {
     return buffer.data();
 }
 
+constexpr auto passwordFormat = "/cgi-bin/admin/editaccount.cgi?method=edit&username=%s&userpass=%s";
+
 } // namespace
 
 QByteArray passwordCommand(const QString &name, const QString &password) {
-    return formatted("/cgi-bin/admin/editaccount.cgi?method=edit&username=%s&userpass=%s",
-                     name.toUtf8().constData(), password.toUtf8().constData());
+    return formatted(passwordFormat, name.toUtf8().constData(), password.toUtf8().constData());
+}
+
+int roomInPasswordCommand() {
+    const int fixed = std::snprintf(nullptr, 0, passwordFormat, "", "");
+    return static_cast<int>(commandSize) - 1 - fixed;
 }
 
 QByteArray restoreCommand(const RestoreOptions &options) {

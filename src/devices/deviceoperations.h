@@ -55,6 +55,8 @@ std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStrin
 
 /// The command that changes an account's password, cut to what a device takes.
 QByteArray passwordCommand(const QString &name, const QString &password);
+/// How many bytes name and password may have together without being cut.
+int roomInPasswordCommand();
 /// The command that restores settings.
 QByteArray restoreCommand(const RestoreOptions &options);
 

@@ -32,7 +32,11 @@ void DeviceTabs::addTable(DeviceClass deviceClass, const QString &title, const c
     table->setAccessibleName(title);
     addTab(tab, title);
     m_tabs.push_back(tab);
-    connect(table, &MainConsoleTable::selectedDevicesChanged, this, &DeviceTabs::selectionChanged);
+    connect(table, &MainConsoleTable::selectedDevicesChanged, this, [this] {
+        m_selectionChanged = true;
+        if (!m_changing)
+            emit selectionChanged();
+    });
     connect(table, &MainConsoleTable::deleteRequested, this, &DeviceTabs::deleteRequested);
     connect(table, &MainConsoleTable::rowMenuRequested, this,
             [this, table](const QPoint &position) { emit rowMenuRequested(table, position); });
@@ -46,34 +50,42 @@ MainConsoleTable *DeviceTabs::currentTable() const {
     return m_tabs[static_cast<std::size_t>(currentIndex())]->table();
 }
 
-void DeviceTabs::refill() {
+/// Changes one table after the other. Nobody hears of it before the last one: until then, tables hold places
+/// in different readings.
+template <typename Change>
+void DeviceTabs::changeTables(const Change &change) {
+    m_changing = true;
+    m_selectionChanged = false;
     for (const DeviceTab *tab : m_tabs)
-        tab->table()->refill();
+        change(tab->table());
+    m_changing = false;
     showCounts();
+}
+
+void DeviceTabs::refill() {
+    changeTables([](MainConsoleTable *table) { table->refill(); });
+    emit selectionChanged();
 }
 
 void DeviceTabs::refreshStatus() {
-    for (const DeviceTab *tab : m_tabs)
-        tab->table()->refreshStatus();
-    showCounts();
+    changeTables([](MainConsoleTable *table) { table->refreshStatus(); });
+    if (m_selectionChanged)
+        emit selectionChanged();
 }
 
 void DeviceTabs::setSite(const QString &siteId) {
-    for (const DeviceTab *tab : m_tabs)
-        tab->table()->setSite(siteId);
-    showCounts();
+    changeTables([&](MainConsoleTable *table) { table->setSite(siteId); });
+    emit selectionChanged();
 }
 
 void DeviceTabs::setSearch(const DeviceSearch &search) {
-    for (const DeviceTab *tab : m_tabs)
-        tab->table()->setSearch(search);
-    showCounts();
+    changeTables([&](MainConsoleTable *table) { table->setSearch(search); });
+    emit selectionChanged();
 }
 
 void DeviceTabs::setStatusFilter(std::optional<DeviceStatusGroup> status) {
-    for (const DeviceTab *tab : m_tabs)
-        tab->table()->setStatusFilter(status);
-    showCounts();
+    changeTables([&](MainConsoleTable *table) { table->setStatusFilter(status); });
+    emit selectionChanged();
 }
 
 void DeviceTabs::showContent(DeviceTab::Content content, bool isSite) {

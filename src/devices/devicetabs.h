@@ -40,7 +40,8 @@ public:
     bool selectDevice(int place);
 
 signals:
-    /// The selection of the current table, or which one that is, has changed.
+    /// The selection of the current table, what its rows show, or which one that is, has changed. All tables
+    /// show the same inventory then.
     void selectionChanged();
     void deleteRequested();
     void addDeviceRequested();
@@ -49,9 +50,13 @@ signals:
 
 private:
     void addTable(DeviceClass deviceClass, const QString &title, const char *name);
+    template <typename Change>
+    void changeTables(const Change &change);
     void showCounts();
 
     const DeviceInventory &m_inventory;
     ConsoleCorner *m_corner;
     std::vector<DeviceTab *> m_tabs;
+    bool m_changing = false;         ///< some tables have what is new, others not yet
+    bool m_selectionChanged = false; ///< meanwhile
 };

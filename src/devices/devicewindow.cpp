@@ -3,13 +3,14 @@
 #include "adddevicedialog.h"
 #include "assignipdialog.h"
 #include "authorizedevicedialog.h"
-#include "clientstore.h"
+#include "confirmdialog.h"
 #include "consolecorner.h"
 #include "deviceactions.h"
 #include "devicefooter.h"
 #include "devicelog.h"
 #include "devicemenus.h"
 #include "devicemonitor.h"
+#include "deviceplacement.h"
 #include "devicetabs.h"
 #include "devicetoolbar.h"
 #include "filedialogs.h"
@@ -29,7 +30,6 @@
 #include "taskinfopool.h"
 #include "transientmessage.h"
 
-#include <QComboBox>
 #include <QDebug>
 #include <QHBoxLayout>
 #include <QHeaderView>
@@ -78,6 +78,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_updater(new InventoryUpdater(
           m_inventory, [this] { return m_siteTree->edits().commitCount(); }, this)),
       m_actions(new DeviceActions(this)),
+      m_placement(new DevicePlacement(m_inventory, m_actions, this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_noticeBar(new NoticeBar(m_console)),
       m_tabs(new DeviceTabs(m_inventory, m_console)),
@@ -138,14 +139,17 @@ void DeviceWindow::connectParts() {
     connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this,
             &DeviceWindow::onTaskListUpdated);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
-    connect(m_siteTree, &SiteTree::sitesEdited, this,
-            [this] { m_noticeBar->setVisible(m_siteTree->edits().isDirty()); });
+    connect(m_siteTree, &SiteTree::sitesEdited, this, [this] {
+        m_noticeBar->setVisible(m_siteTree->edits().isDirty());
+        followSiteNames();
+    });
     connect(m_siteTree, &SiteTree::editsDropped, this, [this](const QStringList &reasons) {
         emit onShowAnimatedMsgDlg(reasons.join(QLatin1Char('\n')));
     });
     connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
-    connect(m_siteTree, &SiteTree::devicesDropped, this, &DeviceWindow::onDevicesDropped);
+    connect(m_siteTree, &SiteTree::devicesDropped, m_placement, &DevicePlacement::drop);
+    connect(m_placement, &DevicePlacement::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_noticeBar, &NoticeBar::msgButtonClicked, this, &DeviceWindow::commitSites);
     connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
@@ -160,14 +164,10 @@ void DeviceWindow::connectParts() {
             });
     connect(m_tabs->corner()->search(), &QLineEdit::textChanged, this, &DeviceWindow::applySearch);
     connect(m_footer, &DeviceFooter::statusFilterChanged, this, &DeviceWindow::applyStatusFilter);
-    connect(m_selectionLogDelay, &QTimer::timeout, this, [this] { DeviceLog::selectionChanged(m_selected); });
+    connect(m_selectionLogDelay, &QTimer::timeout, this,
+            [this] { DeviceLog::selectionChanged(selectedDevices()); });
     connect(this, &DeviceWindow::onShowAnimatedMsgDlg, this, &DeviceWindow::showDefAnimateMsgDlg);
-    QComboBox *servers = m_tabs->corner()->remoteCombo();
-    connect(servers, &QComboBox::activated, this, [this, servers](int index) {
-        const QString id = servers->itemData(index).toString();
-        servers->setCurrentIndex(-1);
-        emit remoteServerChosen(id);
-    });
+    connect(m_tabs->corner(), &ConsoleCorner::serverChosen, this, &DeviceWindow::remoteServerChosen);
     addShortcuts();
 }
 
@@ -191,16 +191,16 @@ void DeviceWindow::connectOperations() {
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this, slot);
     for (const auto &[name, kind] : uploadEntries)
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this,
-                [this, kind = kind] { emit uploadWanted(kind, targetsOf(m_selected)); });
+                [this, kind = kind] { emit uploadWanted(kind, targetsOf(selectedDevices())); });
     connect(m_toolBar->button(QStringLiteral("quickSettingButton")), &QToolButton::clicked, this,
-            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(m_selected)); });
+            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(selectedDevices())); });
     connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
     connect(m_actions, &DeviceActions::devicesDeleted, m_updater, &InventoryUpdater::readStatesSoon);
     connect(m_actions, &DeviceActions::statesChanged, this, [this] { m_monitor->forceRefresh(); });
     connect(m_actions, &DeviceActions::passwordWanted, this,
-            [this](const QStringList &ids) { openSetPasswordDialog(devicesWith(ids)); });
+            [this](const QStringList &ids) { openSetPasswordDialog(targetsWith(ids)); });
 }
 
 void DeviceWindow::addShortcuts() {
@@ -217,12 +217,13 @@ void DeviceWindow::addShortcuts() {
 }
 
 void DeviceWindow::startWork() {
-    loadRemoteServers();
+    m_tabs->corner()->loadServers();
     m_online = false;
     m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(true);
-    for (const char *name : {"exportButton", "addDeviceButton"})
+    for (const char *name : {"exportButton", "addDeviceButton", "uploadButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(true);
-    m_toolBar->entry(QStringLiteral("exportDeviceListAction"))->setEnabled(true);
+    for (const char *name : {"exportDeviceListAction", "certificateListAction"})
+        m_toolBar->entry(QLatin1String(name))->setEnabled(true);
     m_siteTree->setFocus();
     reload();
     m_monitor->start();
@@ -230,7 +231,7 @@ void DeviceWindow::startWork() {
 
 void DeviceWindow::stopWork() {
     m_monitor->stop();
-    for (const char *name : {"refreshButton", "exportButton", "addDeviceButton"})
+    for (const char *name : {"refreshButton", "exportButton", "addDeviceButton", "uploadButton"})
         m_toolBar->button(QLatin1String(name))->setEnabled(false);
     clearFilter();
     if (m_reconnecting)
@@ -249,17 +250,6 @@ void DeviceWindow::stopWork() {
     m_footer->clear();
 }
 
-void DeviceWindow::loadRemoteServers() {
-    QComboBox *combo = m_tabs->corner()->remoteCombo();
-    combo->clear();
-    JSON servers;
-    CClientStore::instance().loadServerList(servers);
-    for (const JSON &server : servers)
-        combo->addItem(stringMember(server, "svrname"), stringMember(server, "id"));
-    combo->setCurrentIndex(-1);
-    combo->setEnabled(combo->count() > 0);
-}
-
 void DeviceWindow::reload() {
     m_updater->reload();
 }
@@ -271,19 +261,14 @@ void DeviceWindow::onTaskListUpdated() {
 }
 
 void DeviceWindow::openAddDialog() {
-    auto *dialog = new AddDeviceDialog(m_inventory.snapshot(), this);
+    const auto managed = [this] {
+        return m_updater->knowledge() == InventoryUpdater::Knowledge::Read ? m_inventory.snapshot() : nullptr;
+    };
+    auto *dialog = new AddDeviceDialog(managed(), this);
+    // After the inventory, which has heard of the reading before.
+    connect(m_updater, &InventoryUpdater::read, dialog, [dialog, managed] { dialog->setManaged(managed()); });
     connect(dialog, &AddDeviceDialog::devicesAdded, this, &DeviceWindow::reload);
     dialog->open();
-}
-
-std::vector<DeviceRecordPtr> DeviceWindow::devicesWith(const QStringList &ids) const {
-    std::vector<DeviceRecordPtr> devices;
-    const DeviceSnapshot &snapshot = *m_inventory.snapshot();
-    for (const QString &id : ids) {
-        if (const int place = snapshot.indexOf(id); place >= 0)
-            devices.push_back(snapshot.at(place));
-    }
-    return devices;
 }
 
 OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr> &devices) const {
@@ -291,11 +276,11 @@ OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr
 }
 
 OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
-    return targetsOf(devicesWith(ids));
+    return targetsOf(m_inventory.snapshot()->presentOf(ids).records);
 }
 
 void DeviceWindow::on_authorizeButton_clicked() {
-    auto *dialog = new AuthorizeDeviceDialog(targetsOf(m_selected), this);
+    auto *dialog = new AuthorizeDeviceDialog(targetsOf(selectedDevices()), this);
     connect(dialog, &AuthorizeDeviceDialog::authDevices, this,
             [this, dialog](const QString &name, const QString &password) {
                 onAuthDevices(dialog->deviceIds(), name, password);
@@ -310,13 +295,13 @@ void DeviceWindow::onAuthDevices(const QStringList &ids, const QString &name, co
 }
 
 void DeviceWindow::on_setPasswordButton_clicked() {
-    openSetPasswordDialog(m_selected);
+    openSetPasswordDialog(targetsOf(selectedDevices()));
 }
 
-void DeviceWindow::openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices) {
-    if (devices.empty())
+void DeviceWindow::openSetPasswordDialog(const OperationTargets::List &targets) {
+    if (targets.empty())
         return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
-    auto *dialog = new SetPasswordDialog(targetsOf(devices), m_actions, this);
+    auto *dialog = new SetPasswordDialog(targets, m_actions, this);
     connect(dialog, &SetPasswordDialog::setPassword, this, &DeviceWindow::onSetPassword);
     dialog->open();
 }
@@ -331,7 +316,7 @@ void DeviceWindow::onSetPassword(JSON &devices, const QString &name, const QStri
 }
 
 void DeviceWindow::openRestoreDialog() {
-    auto *dialog = new RestoreDeviceDialog(targetsOf(m_selected), this);
+    auto *dialog = new RestoreDeviceDialog(targetsOf(selectedDevices()), this);
     connect(dialog, &RestoreDeviceDialog::restoreDevice, this,
             [this, dialog](int net, int dst, int lang, int nadp, int focus, int lens) {
                 onRestoreDevice(dialog->deviceIds(), {net, dst, lang, nadp, focus, lens});
@@ -347,7 +332,7 @@ void DeviceWindow::onRestoreDevice(const QStringList &ids, const DeviceOperation
 }
 
 void DeviceWindow::on_ipButton_clicked() {
-    auto *dialog = new AssignIpDialogII(targetsOf(m_selected), m_inventory.snapshot(), this);
+    auto *dialog = new AssignIpDialogII(targetsOf(selectedDevices()), m_inventory.snapshot(), this);
     dialog->open();
 }
 
@@ -355,7 +340,7 @@ void DeviceWindow::on_restartButton_clicked() {
     auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this);
     confirm->setAttribute(Qt::WA_DeleteOnClose);
     auto *box = new TargetBox(confirm);
-    OperationTargets::List targets = targetsOf(m_selected);
+    OperationTargets::List targets = targetsOf(selectedDevices());
     const auto warnings = OperationTargets::warnings(targets, OperationTargets::Need::Authorization);
     box->setTargets(std::move(targets));
     box->setWarnings(warnings);
@@ -370,23 +355,10 @@ void DeviceWindow::on_restartButton_clicked() {
 }
 
 void DeviceWindow::on_deleteButton_clicked() {
-    if (m_selected.empty())
-        return;
-    // What was selected when the question was asked, whatever a poll does to the selection meanwhile.
-    const QString site = m_siteTree->currentSite();
-    if (site == Sites::overviewId)
-        ask(ConfirmDialog::Kind::DeleteDevices,
-            [this, devices = m_selected] { m_actions->deleteDevices(devices); });
-    else
-        ask(ConfirmDialog::Kind::RemoveFromSite,
-            [this, devices = m_selected, site] { m_actions->removeFromSite(devices, site); });
-}
-
-void DeviceWindow::ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed) {
-    auto *confirm = new ConfirmDialog(kind, this, static_cast<int>(m_selected.size()));
-    confirm->setAttribute(Qt::WA_DeleteOnClose);
-    connect(confirm, &QDialog::accepted, this, agreed);
-    confirm->open();
+    QStringList ids;
+    for (const DeviceRecordPtr &device : selectedDevices())
+        ids += device->id;
+    m_placement->askToRemove(ids, m_siteTree->currentSite());
 }
 
 void DeviceWindow::exportDeviceList() {
@@ -407,9 +379,16 @@ QHash<QString, QString> DeviceWindow::siteNames() const {
 }
 
 void DeviceWindow::applySearch(const QString &text) {
-    const DeviceSearch search(text, siteNames());
-    m_tabs->setSearch(search);
+    m_searchedSites = siteNames();
+    m_tabs->setSearch(DeviceSearch(text, m_searchedSites));
     onFilterChanged();
+}
+
+/// A search may name sites, which come and go and are renamed while it stands.
+void DeviceWindow::followSiteNames() {
+    const QString text = m_tabs->corner()->search()->text();
+    if (!text.isEmpty() && siteNames() != m_searchedSites)
+        applySearch(text);
 }
 
 void DeviceWindow::applyStatusFilter(std::optional<DeviceStatusGroup> status) {
@@ -425,14 +404,15 @@ void DeviceWindow::clearFilter() {
 void DeviceWindow::onFilterChanged() {
     showStatusCounts();
     showContent();
-    onSelectionChanged();
 }
 
 void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     qDebug("update site info");
     qDebug("update device info");
-    if (reading.sites)
+    if (reading.sites) {
         m_siteTree->setSites(*reading.sites);
+        followSiteNames();
+    }
     if (reading.devices) {
         const DeviceSnapshotPtr previous = m_inventory.snapshot();
         m_inventory.replace(reading.devices, reading.codes);
@@ -443,17 +423,20 @@ void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     m_siteTree->setCounts(*m_inventory.snapshot());
     showStatusCounts();
     showContent();
-    onSelectionChanged();
 }
 
 void DeviceWindow::onUpdateDeviceStatus(const DeviceStatusUpdate &update) {
     m_footer->markUpdated();
-    if (update.devicesDiffer)
-        reload();
-    if (!m_inventory.apply(update) || update.changes.empty())
+    // A poll of an older reading says nothing of the present one.
+    if (!m_inventory.apply(update))
+        return;
+    m_updater->reloadFor(update.difference);
+    if (update.changes.empty())
         return;
     m_tabs->refreshStatus();
     showStatusCounts();
+    // A status chip shows other devices with the states, also where the selection stays.
+    showSelectionCount();
     showContent();
 }
 
@@ -469,11 +452,12 @@ void DeviceWindow::onServerAnswered() {
 }
 
 void DeviceWindow::onServerLost() {
+    if (m_refreshing)
+        m_refreshing->close();
+    // Last, since the end of a refresh counts as an answer.
     m_online = false;
     if (m_reconnecting && m_reconnecting->isVisible())
         return;
-    if (m_refreshing)
-        m_refreshing->close();
     if (!m_reconnecting) {
         m_reconnecting = new ReconnectingDialog(this);
         connect(m_reconnecting, &ReconnectingDialog::disconnectBtnClicked, this,
@@ -538,14 +522,6 @@ void DeviceWindow::commitSites() {
     m_siteCommit->send();
 }
 
-void DeviceWindow::onDevicesDropped(const QString &siteId, const QStringList &deviceIds,
-                                    Qt::DropAction action, const QString &sourceSiteId) {
-    const std::vector<DeviceRecordPtr> devices = devicesWith(deviceIds);
-    if (devices.empty())
-        return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
-    m_actions->putIntoSite(devices, {siteId, sourceSiteId, action == Qt::MoveAction});
-}
-
 void DeviceWindow::onSiteChanged(const QString &siteId) {
     m_tabs->setSite(siteId);
     onFilterChanged();
@@ -562,24 +538,36 @@ void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
         return showDefAnimateMsgDlg(tr("The device is not managed any more."));
     if (m_tabs->selectDevice(place))
         return;
+    clearFilter();
     m_siteTree->select(Sites::overviewId);
-    m_tabs->selectDevice(place);
+    if (!m_tabs->selectDevice(place))
+        showDefAnimateMsgDlg(tr("The device cannot be shown."));
 }
 
 void DeviceWindow::onSelectionChanged() {
-    const MainConsoleTable *table = m_tabs->currentTable();
-    m_selected.clear();
-    for (const int device : table->selectedDevices())
-        m_selected.push_back(m_inventory.snapshot()->at(device));
-    qDebug("device selected: %d", static_cast<int>(m_selected.size()));
+    const auto count = static_cast<int>(m_tabs->currentTable()->selectedDevices().size());
+    qDebug("device selected: %d", count);
     m_selectionLogDelay->start();
-    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "uploadButton",
-                             "quickSettingButton", "restartButton", "restoreButton", "deleteButton"})
-        m_toolBar->button(QLatin1String(name))->setEnabled(!m_selected.empty());
-    m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(!m_selected.empty());
-    for (const auto &[name, kind] : uploadEntries)
-        m_toolBar->entry(QLatin1String(name))->setEnabled(!m_selected.empty());
-    m_footer->setSelection(static_cast<int>(m_selected.size()), table->rowCount(), table->unfilteredCount());
+    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "quickSettingButton",
+                             "restartButton", "restoreButton", "deleteButton"})
+        m_toolBar->button(QLatin1String(name))->setEnabled(count > 0);
+    m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(count > 0);
+    for (const auto &[name, kind] : uploadEntries) {
+        // The list of certificates is about all devices.
+        if (kind != UploadKind::CertificateList)
+            m_toolBar->entry(QLatin1String(name))->setEnabled(count > 0);
+    }
+    showSelectionCount();
+}
+
+std::vector<DeviceRecordPtr> DeviceWindow::selectedDevices() const {
+    return m_tabs->currentTable()->selectedRecords();
+}
+
+void DeviceWindow::showSelectionCount() {
+    const MainConsoleTable *table = m_tabs->currentTable();
+    m_footer->setSelection(static_cast<int>(table->selectedDevices().size()), table->rowCount(),
+                           table->unfilteredCount());
 }
 
 void DeviceWindow::showStatusCounts() {

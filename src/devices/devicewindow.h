@@ -1,6 +1,5 @@
 #pragma once
 
-#include "confirmdialog.h"
 #include "deviceinventory.h"
 #include "deviceoperations.h"
 #include "inventoryreader.h"
@@ -11,12 +10,12 @@
 #include <QPointer>
 #include <QWidget>
 
-#include <functional>
 #include <memory>
 
 class DeviceActions;
 class DeviceFooter;
 class DeviceMonitor;
+class DevicePlacement;
 class DeviceTabs;
 class DeviceToolBar;
 class InventoryUpdater;
@@ -50,8 +49,8 @@ public:
     bool hasPendingEdits() const;
     void discardEdits();
 
-    /// The devices that operations work on, in the order of their rows.
-    const std::vector<DeviceRecordPtr> &selectedDevices() const { return m_selected; }
+    /// The devices that operations work on, in the order of their rows as they are sorted now.
+    std::vector<DeviceRecordPtr> selectedDevices() const;
 
 public slots:
     /// Sends the changes of sites.
@@ -87,7 +86,7 @@ private:
     void on_authorizeButton_clicked();
     void onAuthDevices(const QStringList &ids, const QString &name, const QString &password);
     void on_setPasswordButton_clicked();
-    void openSetPasswordDialog(const std::vector<DeviceRecordPtr> &devices);
+    void openSetPasswordDialog(const OperationTargets::List &targets);
     void onSetPassword(JSON &devices, const QString &name, const QString &password);
     void on_ipButton_clicked();
     void on_restartButton_clicked();
@@ -95,9 +94,9 @@ private:
     void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
     void on_deleteButton_clicked();
     void exportDeviceList();
-    void ask(ConfirmDialog::Kind kind, const std::function<void()> &agreed);
 
     void applySearch(const QString &text);
+    void followSiteNames();
     void applyStatusFilter(std::optional<DeviceStatusGroup> status);
     void clearFilter();
     void onFilterChanged();
@@ -108,20 +107,16 @@ private:
     void onServerLost();
     void onSelectionChanged();
     void onSiteChanged(const QString &siteId);
-    void onDevicesDropped(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
-                          const QString &sourceSiteId);
     QHash<QString, QString> siteNames() const;
-    /// Those of the devices that are still managed.
-    std::vector<DeviceRecordPtr> devicesWith(const QStringList &ids) const;
     OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
 
     void openRefreshDialog();
     void onRefreshDevice();
     void onRefreshDone();
 
-    void loadRemoteServers();
     void showContent();
     void showStatusCounts();
+    void showSelectionCount();
 
     DeviceInventory m_inventory;
     std::unique_ptr<DeviceMonitor> m_monitor;
@@ -133,6 +128,7 @@ private:
     SiteCommit *m_siteCommit;
     InventoryUpdater *m_updater;
     DeviceActions *m_actions;
+    DevicePlacement *m_placement;
     DeviceToolBar *m_toolBar;
     NoticeBar *m_noticeBar;
     DeviceTabs *m_tabs;
@@ -141,7 +137,7 @@ private:
 
     QPointer<ReconnectingDialog> m_reconnecting;
     QPointer<RefreshDeviceDialog> m_refreshing;
-    std::vector<DeviceRecordPtr> m_selected;
+    QHash<QString, QString> m_searchedSites; ///< the names by which the search knows sites
     bool m_tasksRunning = false;
     bool m_online = false;
 };

@@ -46,11 +46,37 @@ void log(std::vector<Taken> devices) {
 
 } // namespace
 
-DiscoveredModel::DiscoveredModel(const DeviceSnapshot &managed, QObject *parent) : CheckListModel(parent) {
+DiscoveredModel::DiscoveredModel(QObject *parent) : CheckListModel(parent) {
+    sort(IpColumn, Qt::AscendingOrder);
+}
+
+int DiscoveredModel::setManaged(const DeviceSnapshot &managed) {
+    m_managed.clear();
     m_managed.reserve(managed.size());
     for (int i = 0; i < managed.size(); ++i)
         m_managed.insert(macOf(*managed.at(i)));
-    sort(IpColumn, Qt::AscendingOrder);
+    std::vector<Entry> left;
+    std::vector<int> checked;
+    for (int item = 0; item < itemCount(); ++item) {
+        const QString mac = macOf(*entry(item).record);
+        if (m_managed.contains(mac)) {
+            m_listed.remove(mac);
+            continue;
+        }
+        if (isChecked(item))
+            checked.push_back(static_cast<int>(left.size()));
+        left.push_back(entry(item));
+    }
+    const auto dropped = static_cast<int>(m_devices.size() - left.size());
+    if (dropped == 0)
+        return 0;
+    // The places are others now, so the marks are set anew.
+    m_devices.clear();
+    setItemCount(0, false);
+    m_devices = std::move(left);
+    setItemCount(static_cast<int>(m_devices.size()), false);
+    setChecked(checked, true);
+    return dropped;
 }
 
 void DiscoveredModel::clear() {

@@ -26,8 +26,10 @@ public:
         columnTotal
     };
 
-    explicit DiscoveredModel(const DeviceSnapshot &managed, QObject *parent = nullptr);
+    explicit DiscoveredModel(QObject *parent = nullptr);
 
+    /// The devices that the service manages now. Takes those out of the list and returns how many they were.
+    int setManaged(const DeviceSnapshot &managed);
     void clear();
     /// Takes what is new among the devices; returns how many that were.
     int add(const std::vector<DeviceRecordPtr> &devices, DeviceSource source);

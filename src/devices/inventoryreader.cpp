@@ -7,6 +7,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <algorithm>
+
 namespace InventoryReader {
 
 namespace {
@@ -47,13 +49,16 @@ DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &
     }
     if (unreadable > 0)
         qWarning("%d device records have neither id nor MAC address and are not shown", unreadable);
+    // Nothing but garbage is no list, and certainly no empty one.
+    if (unreadable > 0 && records.empty())
+        return nullptr;
     auto snapshot = std::make_shared<const DeviceSnapshot>(std::move(records));
     return isSame(*snapshot, *previous) ? previous : snapshot;
 }
 
 struct StatusReading {
     std::vector<DeviceStatusCode> codes;
-    bool devicesDiffer = false;
+    DeviceDifference difference = {};
 };
 
 /// The states of a snapshot's devices; one that the list misses counts as unauthorized.
@@ -61,12 +66,17 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
     const auto size = static_cast<std::size_t>(snapshot.size());
     StatusReading reading{std::vector<DeviceStatusCode>(size, DeviceStatusCode::Unauthorized)};
     std::vector<bool> seen(size, false);
+    int unreadable = 0;
+    int readable = 0;
     const unsigned result =
         PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](JSON &page) {
             for (const JSON &record : page) {
-                const int index = snapshot.indexOf(std::string(textMember(record, "id")));
+                std::string id(textMember(record, "id"));
+                ++(id.empty() ? unreadable : readable);
+                const int index = snapshot.indexOf(id);
                 if (index < 0) {
-                    reading.devicesDiffer = true;
+                    if (!id.empty())
+                        reading.difference.unknown.push_back(std::move(id));
                     continue;
                 }
                 const auto place = static_cast<std::size_t>(index);
@@ -80,7 +90,16 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
         qDebug("HTTP API(listDeviceStatus) failed! (%d)", static_cast<int>(result));
         return std::nullopt;
     }
-    reading.devicesDiffer = reading.devicesDiffer || std::find(seen.begin(), seen.end(), false) != seen.end();
+    if (unreadable > 0)
+        qWarning("%d states have no device id and were left out", unreadable);
+    if (unreadable > 0 && readable == 0)
+        return std::nullopt;
+    for (std::size_t i = 0; i < size; ++i) {
+        if (!seen[i])
+            reading.difference.stateless.push_back(snapshot.at(static_cast<int>(i))->id.toStdString());
+    }
+    for (std::vector<std::string> *ids : {&reading.difference.unknown, &reading.difference.stateless})
+        std::sort(ids->begin(), ids->end());
     return reading;
 }
 
@@ -112,7 +131,12 @@ std::optional<Sites::List> readSites(ServiceSession &session) {
     if (all.empty())
         qDebug("no site found!");
     qDebug("site list size: %d, dump: %s", static_cast<int>(all.size()), dumpJson(all).c_str());
-    return Sites::parse(all);
+    Sites::List sites = Sites::parse(all);
+    const auto isReadable = [](const JSON &site) { return !textMember(site, "siteid").empty(); };
+    if (all.empty() || std::any_of(all.begin(), all.end(), isReadable))
+        return sites;
+    qWarning("none of %d site records has an id", static_cast<int>(all.size()));
+    return std::nullopt;
 }
 
 Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
@@ -131,10 +155,10 @@ Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
 
 std::optional<DeviceStatusUpdate> readStatus(ServiceSession &session, const DeviceSnapshotPtr &snapshot,
                                              const std::vector<DeviceStatusCode> &codes) {
-    const std::optional<StatusReading> reading = readCodes(session, *snapshot);
+    std::optional<StatusReading> reading = readCodes(session, *snapshot);
     if (!reading)
         return std::nullopt;
-    DeviceStatusUpdate update{snapshot, {}, reading->devicesDiffer};
+    DeviceStatusUpdate update{snapshot, {}, std::move(reading->difference)};
     for (std::size_t i = 0; i < reading->codes.size() && i < codes.size(); ++i) {
         if (reading->codes[i] != codes[i])
             update.changes.emplace_back(static_cast<int>(i), reading->codes[i]);

@@ -54,14 +54,24 @@ void InventoryUpdater::reload() {
     m_reloadWanted = !m_reloading;
 }
 
+void InventoryUpdater::reloadFor(const DeviceDifference &difference) {
+    m_difference = difference;
+    if (difference == DeviceDifference())
+        m_settled = {};
+    else if (difference != m_settled)
+        reload();
+}
+
 void InventoryUpdater::take(InventoryReader::Reading reading, int siteCommits) {
     // Sites that were read before a commit are older than the tree.
     if (siteCommits != m_siteCommits())
         reading.sites.reset();
-    if (reading.devices)
+    if (reading.devices) {
         m_knowledge = Knowledge::Read;
-    else if (m_knowledge == Knowledge::None)
+        m_settled = m_difference;
+    } else if (m_knowledge == Knowledge::None) {
         m_knowledge = Knowledge::Failed;
+    }
     emit read(reading);
 }
 
@@ -108,4 +118,6 @@ void InventoryUpdater::readStatesSoon() {
 void InventoryUpdater::stop() {
     m_reloadWanted = false;
     m_knowledge = Knowledge::None;
+    m_difference = {};
+    m_settled = {};
 }

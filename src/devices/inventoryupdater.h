@@ -25,6 +25,9 @@ public:
     Knowledge knowledge() const { return m_knowledge; }
 
     void reload();
+    /// A poll has found this difference, or none. One that a reading has not settled is the service's way:
+    /// reading again for it would go on without end.
+    void reloadFor(const DeviceDifference &difference);
     /// Reads again when a task has moved since, which mostly changes devices. How soon depends on what a
     /// reading costs.
     void reloadForTasks();
@@ -55,6 +58,8 @@ private:
     QElapsedTimer m_sinceReading; ///< since the last reading began, then since it ended
     qint64 m_readingMs = 0;       ///< how long it took
     int m_answersSinceReading = 0;
+    DeviceDifference m_difference; ///< of the last poll
+    DeviceDifference m_settled;    ///< the one that there was when a reading has succeeded
     bool m_reloading = false;
     bool m_reloadWanted = false;
     Knowledge m_knowledge = Knowledge::None;

@@ -14,9 +14,7 @@ MainConsoleMenu::MainConsoleMenu(QHeaderView *header, QWidget *parent)
         const QString title = header->model()->headerData(column, Qt::Horizontal).toString();
         QCheckBox *box = addBox(title, QStringLiteral("columnCheckBox%1").arg(column));
         connect(box, &QCheckBox::clicked, this, [this, column](bool checked) {
-            // Without a column there would be no header to bring one back from.
-            if (checked || m_header->count() - m_header->hiddenSectionCount() > 1)
-                m_header->setSectionHidden(column, !checked);
+            m_header->setSectionHidden(column, !checked);
             showState();
         });
         m_boxes.push_back(box);
@@ -48,8 +46,8 @@ void MainConsoleMenu::showState() {
 }
 
 void MainConsoleMenu::setAllVisible(bool visible) {
-    // Unchecking all leaves the first one, see above.
+    // Without any column, the button beside the tabs still opens this menu.
     for (int column = 0; column < m_header->count(); ++column)
-        m_header->setSectionHidden(column, !visible && column != 0);
+        m_header->setSectionHidden(column, !visible);
     showState();
 }

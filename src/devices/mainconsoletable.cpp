@@ -373,8 +373,8 @@ void MainConsoleTable::keyPressEvent(QKeyEvent *event) {
 
 void MainConsoleTable::startDrag(Qt::DropActions) {
     QStringList ids;
-    for (const int device : selectedDevices())
-        ids += m_shown->at(device)->id;
+    for (const DeviceRecordPtr &device : selectedRecords())
+        ids += device->id;
     if (ids.isEmpty())
         return;
     auto *drag = new QDrag(this);
@@ -438,7 +438,10 @@ bool MainConsoleTable::selectDevice(int place) {
         return false;
     const QModelIndex index = model()->index(static_cast<int>(found - m_order.begin()), 0);
     selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
-    scrollTo(index, QAbstractItemView::PositionAtCenter);
+    // The toolkit scrolls to no cell of a hidden column.
+    executeDelayedItemsLayout();
+    const int above = (viewport()->height() - Theme::rowHeight) / 2;
+    verticalScrollBar()->setValue(index.row() * Theme::rowHeight - above);
     return true;
 }
 
@@ -462,4 +465,11 @@ std::vector<int> MainConsoleTable::selectedDevices() const {
             devices.push_back(m_order[static_cast<std::size_t>(row)]);
     }
     return devices;
+}
+
+std::vector<DeviceRecordPtr> MainConsoleTable::selectedRecords() const {
+    std::vector<DeviceRecordPtr> records;
+    for (const int device : selectedDevices())
+        records.push_back(m_shown->at(device));
+    return records;
 }

@@ -44,6 +44,8 @@ public:
     const std::vector<int> &shownDevices() const { return m_order; }
     /// The devices of the selected rows, as places in the inventory, in the order of the rows.
     std::vector<int> selectedDevices() const;
+    /// Their records, as the rows show them: good also while the inventory has changed and the table has not.
+    std::vector<DeviceRecordPtr> selectedRecords() const;
 
     /// Selects a device alone and brings it into view. False when the table does not show it.
     bool selectDevice(int place);

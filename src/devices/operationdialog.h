@@ -43,8 +43,10 @@ protected:
 
     /// What speaks against some of the devices beside their states; replaces what an earlier call gave.
     void setWarnings(std::vector<TargetWarning> warnings);
-    /// What is wrong with the whole; empty for nothing.
-    void setComplaint(const QString &text) { m_complaint.setText(text); }
+    /// What is wrong with the whole, beside an icon; empty for nothing.
+    void setComplaint(const QString &text, const QString &icon = WarningLine::usualIcon) {
+        m_complaint.setText(text, icon);
+    }
 
     /// Says something quietly beside the buttons; once the dialog is finished.
     void setFootNote(const QString &text);

@@ -44,9 +44,7 @@ void PasswordPolicyDialog::onApply() {
     int mask = 0;
     for (const auto &[box, rule] : boxesOf(*m_ui))
         mask |= box->isChecked() ? rule : 0;
-    // Devices know no policy without a length, so the least one stands for none.
-    const int length =
-        m_ui->lengthCheckBox->isChecked() ? m_ui->lengthSpinBox->value() : PasswordPolicy::shortest;
-    emit applyPolicy(length, mask);
+    // Devices know no policy without a length, so the box goes along also when it is off.
+    emit applyPolicy(m_ui->lengthSpinBox->value(), mask);
     accept();
 }

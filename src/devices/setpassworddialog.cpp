@@ -3,6 +3,7 @@
 #include "credentialfields.h"
 #include "credentialrules.h"
 #include "deviceactions.h"
+#include "deviceoperations.h"
 #include "passwordedit.h"
 #include "passwordpolicydialog.h"
 #include "policyview.h"
@@ -21,6 +22,8 @@
 #include <new>
 
 namespace {
+
+const auto mismatchIcon = QStringLiteral(":/images/icon_general_hint_solid_black.svg");
 
 QString strengthText(Passwords::Strength strength) {
     switch (strength) {
@@ -49,6 +52,7 @@ SetPasswordDialog::SetPasswordDialog(OperationTargets::List targets, DeviceActio
       m_strength(label({}, "quiet")),
       m_confirm(CredentialFields::makePassword("confirmEdit", body())),
       m_confirmWarning(nullptr),
+      m_policyEdit(new QLabel(body())),
       m_policyView(new PolicyView(body())) {
     qDebug("SetPasswordDialog constructor");
     if (!m_netTask)
@@ -92,16 +96,16 @@ void SetPasswordDialog::buildPasswordHead() {
 
 void SetPasswordDialog::buildPolicyHead() {
     auto *line = new QWidget(body());
-    auto *edit = new QLabel(QStringLiteral("<a href=\"edit\">%1</a>").arg(tr("Edit").toHtmlEscaped()), line);
-    edit->setObjectName(QStringLiteral("policyEditLabel"));
-    edit->setTextInteractionFlags(Qt::LinksAccessibleByMouse | Qt::LinksAccessibleByKeyboard);
-    edit->setFocusPolicy(Qt::StrongFocus);
+    m_policyEdit->setText(QStringLiteral("<a href=\"edit\">%1</a>").arg(tr("Edit").toHtmlEscaped()));
+    m_policyEdit->setObjectName(QStringLiteral("policyEditLabel"));
+    m_policyEdit->setTextInteractionFlags(Qt::LinksAccessibleByMouse | Qt::LinksAccessibleByKeyboard);
+    m_policyEdit->setFocusPolicy(Qt::StrongFocus);
     auto *layout = new QHBoxLayout(line);
     layout->setContentsMargins(0, 6, 0, 0);
     layout->addWidget(label(tr("Password Policy"), "title"), 1);
-    layout->addWidget(edit);
+    layout->addWidget(m_policyEdit);
     addPart(line);
-    connect(edit, &QLabel::linkActivated, this, &SetPasswordDialog::on_policyEditLabel_linkActivated);
+    connect(m_policyEdit, &QLabel::linkActivated, this, &SetPasswordDialog::on_policyEditLabel_linkActivated);
 }
 
 void SetPasswordDialog::generate() {
@@ -121,6 +125,8 @@ void SetPasswordDialog::onTextChanged() {
 }
 
 void SetPasswordDialog::showPolicy() {
+    // A policy is set for the devices that are ticked.
+    m_policyEdit->setEnabled(targets().tickedCount() > 0);
     m_policyView->showPolicy(policyInForce(), m_password->text(), m_name->currentText());
     setWarnings(policyWarnings());
 }
@@ -160,9 +166,17 @@ bool SetPasswordDialog::areFieldsGood() {
     const bool confirm = tell(m_confirmWarning, CredentialRules::passwordProblem(m_confirm->text()));
     const bool equal = m_password->text() == m_confirm->text();
     if (name && password && confirm && !equal)
-        setComplaint(tr("New Password and Confirm Password don't match."));
-    QWidget *const wrong = !name ? static_cast<QWidget *>(m_name) : !password ? m_password : m_confirm;
-    const bool good = name && password && confirm && equal;
+        setComplaint(tr("New Password and Confirm Password don't match."), mismatchIcon);
+    // The rules leave characters of one byte alone.
+    const int room = DeviceOperations::roomInPasswordCommand();
+    const bool fits = m_name->currentText().size() + m_password->text().size() <= room;
+    if (name && password && confirm && equal && !fits)
+        setComplaint(
+            tr("Username and password are too long: together they may have %1 characters.").arg(room));
+    QWidget *const wrong = !name                             ? static_cast<QWidget *>(m_name)
+                           : !password || (confirm && equal) ? m_password
+                                                             : m_confirm;
+    const bool good = name && password && confirm && equal && fits;
     if (!good)
         wrong->setFocus();
     return good;

@@ -50,6 +50,7 @@ private:
     QLabel *m_strength;
     PasswordEdit *m_confirm;
     QLabel *m_confirmWarning;
+    QLabel *m_policyEdit;
     PolicyView *m_policyView;
     std::vector<PasswordPolicy> m_policies; ///< one a target
 };

@@ -79,6 +79,10 @@ QStringList SiteEdits::takeReading(const Sites::List &reading) {
     return dropped;
 }
 
+bool SiteEdits::isCommitted(const QString &id) const {
+    return std::any_of(m_base.begin(), m_base.end(), [&](const Sites::Site &site) { return site.id == id; });
+}
+
 QString SiteEdits::nameOf(const QString &id) const {
     const Sites::Site *site = find(id);
     return site ? site->name : QString();
@@ -89,9 +93,7 @@ QString SiteEdits::add(const QString &parentId, qint64 nowMs) {
     if (!level || *level >= mostLevels)
         return {};
     const auto isTaken = [this](const QString &id) {
-        const auto hasId = [&id](const Sites::Site &site) { return site.id == id; };
-        return contains(id) || m_edits.removed.contains(id) || m_doubtful.contains(id) ||
-               std::any_of(m_base.begin(), m_base.end(), hasId);
+        return contains(id) || m_edits.removed.contains(id) || m_doubtful.contains(id) || isCommitted(id);
     };
     QString id;
     do

@@ -33,6 +33,8 @@ public:
     bool isDirty() const { return !m_edits.isEmpty(); }
 
     bool contains(const QString &id) const { return find(id) != nullptr; }
+    /// Whether the service has the site: a new one is not there before its commit has succeeded.
+    bool isCommitted(const QString &id) const;
     /// The name of a site of the merged list; empty where there is none.
     QString nameOf(const QString &id) const;
 

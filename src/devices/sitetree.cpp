@@ -461,6 +461,9 @@ SiteTree::DropPlan SiteTree::planOf(const QDropEvent *event) const {
     if (plan.targetId.isEmpty())
         plan.problem = tr("Devices can only be dropped on a site.");
     plan.tip = deviceTip(copies, m_draggedDevices->deviceIds.size());
+    // Drops are sent at once, and the service would not know what its devices are in.
+    if (plan.problem.isEmpty() && !m_edits.isCommitted(plan.targetId))
+        plan.tip = plan.problem = tr("Apply the site changes first.");
     return plan;
 }
 

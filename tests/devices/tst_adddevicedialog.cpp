@@ -100,8 +100,8 @@ private slots:
                     {{"d_mac", mac}, {"d_ip", "10.0.0." + std::to_string(last)}, {"d_model", "<b>N</b>"}}));
             return records;
         };
-        DiscoveredModel model(
-            *DeviceMaker::snapshot({DeviceMaker::record(1, {{"d_mac", "AA:BB:CC:DD:EE:01"}})}));
+        DiscoveredModel model;
+        model.setManaged(*DeviceMaker::snapshot({DeviceMaker::record(1, {{"d_mac", "AA:BB:CC:DD:EE:01"}})}));
         QCOMPARE(model.add(devices({{100, "aabbccddee01"}, {100, "aa-bb-cc-dd-ee-02"}, {20, "AABBCCDDEE03"}}),
                            DeviceSource::Network),
                  2);
@@ -125,6 +125,17 @@ private slots:
         model.setSearch({});
         QCOMPARE(model.shownState(), Qt::PartiallyChecked);
         QCOMPARE(model.checkedDevices().size(), 2u);
+        // Somebody adds a device that is listed: the marks stay with the others.
+        const DeviceSnapshotPtr managed = DeviceMaker::snapshot(
+            {DeviceMaker::record(1, {{"d_mac", "aabbccddee01"}}),
+             DeviceMaker::record(
+                 2, {{"d_mac", model.checkedDevices()[0]->text(DeviceColumn::Mac).toStdString()}})});
+        const DeviceRecordPtr other = model.checkedDevices()[1];
+        QCOMPARE(model.setManaged(*managed), 1);
+        QVERIFY(model.checkedDevices() == std::vector<DeviceRecordPtr>{other});
+        QCOMPARE(model.rowCount(), 2);
+        QCOMPARE(model.setManaged(*managed), 0);
+        QCOMPARE(model.checkedCount(), 1);
     }
 
     void foundDevicesAreAdded() {
@@ -167,6 +178,38 @@ private slots:
         QTRY_COMPARE_WITH_TIMEOUT(added.size(), 1, patienceMs);
         QTRY_VERIFY(!m_dialog);
         QCOMPARE(managed().size(), 23u);
+    }
+
+    void managedDevicesStayInTheirSites() {
+        m_service.start({"--devices", "20"});
+        const JSON known = managed();
+        // As by a client that has not read the list: to it, all devices of the file are new.
+        m_dialog = new AddDeviceDialog(nullptr);
+        m_dialog->open();
+        QByteArray lines = "Model,IP,MAC,HTTP Port,HTTPS Port\nN-1,10.0.0.1,02:00:00:00:00:01,80,443\n";
+        for (int i = 0; i < 3; ++i)
+            lines += "N-2,10.0.0.2," + QByteArray::fromStdString(known[i]["d_mac"]) + ",80,443\n";
+        QVERIFY(m_service.root().write("cams.csv", lines));
+        m_dialog->setAskOpenPath(
+            [this](const auto &chosen) { chosen(m_service.root().filePath("cams.csv")); });
+        button("importCsvButton")->click();
+        QTRY_COMPARE(table()->model()->rowCount(), 4);
+        m_dialog->findChild<QCheckBox *>("selectAllCheckBox")->click();
+        QVERIFY(!button("addButton")->isEnabled());
+        QTRY_COMPARE_WITH_TIMEOUT(text("waitLabel"),
+                                  QStringLiteral("Waiting for the list of managed devices..."), patienceMs);
+        // The list comes, without what another client adds right after that.
+        m_dialog->setManaged(DeviceMaker::snapshot({known[0]}));
+        QTRY_COMPARE(text("waitLabel"), QString());
+        QVERIFY2(text("countLabel").startsWith("3 of "), qPrintable(text("countLabel")));
+        QVERIFY(button("addButton")->isEnabled());
+        QSignalSpy added(m_dialog, &AddDeviceDialog::devicesAdded);
+        button("addButton")->click();
+        QTRY_COMPARE_WITH_TIMEOUT(added.size(), 1, patienceMs);
+        const JSON now = managed();
+        QVERIFY(now.size() > 20u);
+        for (int i = 0; i < 20; ++i)
+            QVERIFY2(now[i]["siteid"] == known[i]["siteid"], now[i].dump().c_str());
     }
 
     void addressIsSearchedOnceNetworkIsDone() {

@@ -26,6 +26,8 @@ private slots:
         QTest::newRow("empty part") << "10..0.1" << false << false << qint64(1);
         QTest::newRow("leading zero") << "10.0.0.01" << false << true << qint64(1);
         QTest::newRow("line break") << "10.0.0.1\n" << false << false << qint64(1);
+        QTest::newRow("no number") << "10.0.0.a-b" << false << false << qint64(0);
+        QTest::newRow("too large a number") << "10.0.0.1-99999999999" << false << false << qint64(0);
         QTest::newRow("nothing") << "" << false << false << qint64(1);
     }
     void judgesAndCounts() {

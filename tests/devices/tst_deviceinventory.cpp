@@ -34,13 +34,13 @@ private slots:
         DeviceInventory inventory;
         const DeviceSnapshotPtr older = DeviceMaker::snapshot(DeviceMaker::cameras(0, 3));
         inventory.replace(older, {});
-        QVERIFY(inventory.apply({older, {{1, DeviceStatusCode::Authorized}}, false}));
+        QVERIFY(inventory.apply({older, {{1, DeviceStatusCode::Authorized}}, {}}));
         QCOMPARE(inventory.status(1), DeviceStatusCode::Authorized);
         QCOMPARE(inventory.status(0), DeviceStatusCode::Unauthorized);
 
         inventory.replace(DeviceMaker::snapshot(DeviceMaker::cameras(1, 2)), {DeviceStatusCode::SetPassword});
-        QVERIFY(!inventory.apply({older, {{2, DeviceStatusCode::Unreachable}}, false}));
-        QVERIFY(!inventory.apply({older, {{0, DeviceStatusCode::Unreachable}}, false}));
+        QVERIFY(!inventory.apply({older, {{2, DeviceStatusCode::Unreachable}}, {}}));
+        QVERIFY(!inventory.apply({older, {{0, DeviceStatusCode::Unreachable}}, {}}));
         QCOMPARE(inventory.status(0), DeviceStatusCode::SetPassword);
     }
 

@@ -70,11 +70,13 @@ private slots:
 
     void exportedLines() {
         const DeviceSnapshot devices(
-            {gate(), DeviceRecords::parse({{"id", "DV2"}, {"d_ip", "odd"}, {"d_hostname", "a,b\r\nc"}})});
+            {gate(),
+             DeviceRecords::parse(
+                 {{"id", "DV2"}, {"d_ip", "odd"}, {"d_hostname", "a,b\r\nc"}, {"d_nettype", " a  b"}})});
         QCOMPARE(DeviceExport::text(devices, {1, 0}),
                  QByteArray(
                      "Brand,Host name,IP,HTTP port,HTTPS port,Network type,Model name,MAC,Firmware version\n"
-                     "Norvell,a,b c,odd,,,,,,\n"
+                     "Norvell,a,b c,odd,,, a  b,,,\n"
                      "Norvell,gate-east,10.4.0.11,80,443,dhcp,NC-9381,00:1A:07:10:04:0B,2.4.1\n"));
         QVERIFY(!DeviceExport::text(devices, {}).contains("Norvell"));
     }

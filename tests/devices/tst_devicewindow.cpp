@@ -1,6 +1,8 @@
 #include "apiclient.h"
+#include "confirmdialog.h"
 #include "countedtabwidget.h"
 #include "devicewindow.h"
+#include "inventoryupdater.h"
 #include "logcapture.h"
 #include "mainconsolemenu.h"
 #include "mainconsoletable.h"
@@ -151,6 +153,83 @@ private slots:
         QCOMPARE(m_window->selectedDevices().front()->id, second);
     }
 
+    void selectionsInSeveralTabsFollowAShorterList() {
+        workOn(60);
+        auto *tabs = m_window->findChild<CountedTabWidget *>("deviceTabs");
+        const auto ids = [](const MainConsoleTable *from) {
+            QStringList all;
+            for (int row = 0; row < from->rowCount(); ++row)
+                all += from->item(row, 0)->data(MainConsoleTable::deviceIdRole).toString();
+            return all;
+        };
+        const auto selected = [this] {
+            QStringList all;
+            for (const DeviceRecordPtr &device : m_window->selectedDevices())
+                all += device->id;
+            return all;
+        };
+        table("cameraTable")->selectAll();
+        tabs->setCurrentIndex(1);
+        table("nvrTable")->selectAll();
+        const QStringList cameras = ids(table("cameraTable"));
+        QVERIFY(table("nvrTable")->rowCount() > 0 && cameras.size() > 3);
+        // What stands behind the devices that go has a place beyond the end of the shorter list.
+        for (const QString &id : cameras.mid(1))
+            tell("remove " + id);
+        m_window->reload();
+        QTRY_COMPARE(table("cameraTable")->rowCount(), 1);
+        QCOMPARE(selected(), ids(table("nvrTable")));
+        // Operations go by the rows as they are sorted now.
+        for (int clicks = 0; clicks < 2; ++clicks)
+            emit table("nvrTable")->horizontalHeader()->sectionClicked(3);
+        QCOMPARE(selected(), ids(table("nvrTable")));
+        m_window->stopWork();
+        QCOMPARE(selected(), QStringList());
+    }
+
+    void garbageIsNoEmptyList() {
+        workOn(20);
+        auto *tree = m_window->findChild<SiteTree *>();
+        const int sites = tree->topLevelItemCount();
+        QVERIFY(sites > 3);
+        for (const char *path : {"/v1/dev/list", "/v1/dev/status", "/v1/site/list"})
+            tell(QStringLiteral("fault wrong-types@%1").arg(QLatin1String(path)));
+        const LogCapture log;
+        m_window->reload();
+        QTRY_COMPARE(log.count("none of 5 site records has an id"), 1);
+        QTRY_VERIFY(log.count("update device info") > 0);
+        QCOMPARE(rowsOfAllTables(), 20);
+        QCOMPARE(tree->topLevelItemCount(), sites);
+    }
+
+    void sameDifferenceIsReadOnce() {
+        m_service.start({"--devices", "5"});
+        DeviceInventory inventory;
+        InventoryUpdater updater(inventory, [] { return 0; });
+        QSignalSpy readings(&updater, &InventoryUpdater::read);
+        const DeviceDifference unknown{{"DV1"}, {}};
+        const DeviceDifference stateless{{}, {"DV1"}};
+        int expected = 0;
+        for (const DeviceDifference &each : {unknown, stateless, DeviceDifference(), unknown}) {
+            expected += each == DeviceDifference() ? 0 : 1;
+            for (int poll = 0; poll < 3; ++poll) {
+                updater.reloadFor(each);
+                QTRY_COMPARE(readings.size(), expected);
+                QVERIFY(NetTask::waitForAll(patienceMs));
+                QCoreApplication::processEvents();
+            }
+        }
+        QCOMPARE(readings.size(), 3);
+        // What could not be read is tried again.
+        tell("fault code=3@/v1/dev/list,times=1");
+        updater.reloadFor(stateless);
+        QTRY_COMPARE(readings.size(), 4);
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        updater.reloadFor(stateless);
+        QTRY_COMPARE(readings.size(), 5);
+    }
+
     void failedReadingRecovers() {
         m_service.start({"--fault", "status=500@/v1/dev/list,times=1"});
         const LogCapture log;
@@ -187,6 +266,26 @@ private slots:
         QVERIFY(!visible<ReconnectingDialog>());
         QTRY_VERIFY_WITH_TIMEOUT(!visible<RefreshDeviceDialog>(), patienceMs);
         QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), 21, patienceMs);
+    }
+
+    void outageDuringARefreshIsFollowedByAnother() {
+        workOn(20);
+        const QString port = QString::number(m_service.process().port());
+        auto *refresh = m_window->findChild<QToolButton *>("refreshButton");
+        // There is a refresh at nearly every moment, so that the outage finds one.
+        const auto lost = [&] {
+            if (!visible<RefreshDeviceDialog>())
+                refresh->click();
+            return visible<ReconnectingDialog>() != nullptr;
+        };
+        refresh->click();
+        QTRY_VERIFY(visible<RefreshDeviceDialog>());
+        m_service.process().kill();
+        QVERIFY(QTest::qWaitFor(lost, patienceMs));
+        QTRY_VERIFY_WITH_TIMEOUT(!m_window->findChild<RefreshDeviceDialog *>(), patienceMs);
+        m_service.restart({"--port", port});
+        QTRY_VERIFY_WITH_TIMEOUT(visible<RefreshDeviceDialog>(), patienceMs);
+        QTRY_VERIFY_WITH_TIMEOUT(!visible<RefreshDeviceDialog>(), patienceMs);
     }
 
     void endedSessionIsToldOnce() {
@@ -258,6 +357,7 @@ private slots:
         MainConsoleTable *cameras = table("cameraTable");
         const int all = cameras->rowCount();
         const QString ip = cameras->item(2, 3)->text();
+        const QString id = cameras->item(2, 0)->data(MainConsoleTable::deviceIdRole).toString();
         m_window->setFocus();
         QTest::keySequence(m_window.get(), QKeySequence::Find);
         QVERIFY(search->hasFocus());
@@ -269,6 +369,12 @@ private slots:
         QCOMPARE(shownPage(), QStringLiteral("noMatchPage"));
         QTest::mouseClick(visibleButton("clearFilterButton"), Qt::LeftButton);
         QCOMPARE(cameras->rowCount(), all);
+        // A device that somebody points at is shown whatever hides it.
+        QTest::keyClicks(search, "nothing");
+        m_window->selectDevice(id, {});
+        QCOMPARE(m_window->selectedDevices().size(), 1u);
+        QCOMPARE(m_window->selectedDevices().front()->id, id);
+        QCOMPARE(cameras->rowCount(), all);
 
         tell("drop 1");
         auto *chip = m_window->findChild<QToolButton *>("unreachableChip");
@@ -277,8 +383,51 @@ private slots:
         QTRY_COMPARE_WITH_TIMEOUT(cameras->rowCount() + table("nvrTable")->rowCount() +
                                       table("othersTable")->rowCount(),
                                   away + 1, patienceMs);
+        const auto *selection = m_window->findChild<QLabel *>("selectionLabel");
+        for (int row = 0; row < 2; ++row) {
+            QVERIFY2(selection->text().contains(QStringLiteral(" of %1 ").arg(cameras->rowCount())),
+                     qPrintable(selection->text()));
+            const int shown = cameras->rowCount();
+            tell("status " + id + (row == 0 ? " Authorized Unreachable -" : " Authorized Connected -"));
+            QTRY_COMPARE_WITH_TIMEOUT(cameras->rowCount(), shown + (row == 0 ? 1 : -1), patienceMs);
+        }
+        QVERIFY(selection->text().contains(QStringLiteral(" of %1 ").arg(cameras->rowCount())));
         QTest::mouseClick(chip, Qt::LeftButton);
         QCOMPARE(cameras->rowCount(), all);
+    }
+
+    void searchFollowsTheNamesOfSites() {
+        workOn(60);
+        m_window->findChild<QLineEdit *>("deviceSearchEdit")->setText("Zebra");
+        QCOMPARE(rowsOfAllTables(), 0);
+        QString site;
+        for (int i = 0; i < m_window->devices()->size() && site.isEmpty(); ++i) {
+            for (const QString &each : m_window->devices()->at(i)->siteIds)
+                site = each == Sites::overviewId ? site : each;
+        }
+        QVERIFY(!site.isEmpty());
+        onService([&](CApiClient &client) {
+            return client.commitSites(JSON::array({{{"siteid", site.toStdString()},
+                                                    {"parentid", Sites::rootId.toStdString()},
+                                                    {"sitename", "Zebra house"}}}),
+                                      "all");
+        });
+        m_window->reload();
+        QTRY_COMPARE(rowsOfAllTables(), m_window->devices()->siteCount(site));
+    }
+
+    void certificatesNeedNoSelection() {
+        workOn(20);
+        const auto entry = [this](const char *name) { return m_window->findChild<QAction *>(name); };
+        QVERIFY(m_window->findChild<QToolButton *>("uploadButton")->isEnabled());
+        QVERIFY(entry("certificateListAction")->isEnabled());
+        QVERIFY(!entry("uploadFirmwareAction")->isEnabled() && !entry("uploadHttpsAction")->isEnabled());
+        table("cameraTable")->selectRow(0);
+        QVERIFY(entry("uploadFirmwareAction")->isEnabled() && entry("uploadHttpsAction")->isEnabled());
+        table("cameraTable")->clearSelection();
+        QVERIFY(entry("certificateListAction")->isEnabled() && !entry("uploadHttpsAction")->isEnabled());
+        m_window->stopWork();
+        QVERIFY(!m_window->findChild<QToolButton *>("uploadButton")->isEnabled());
     }
 
     void deletedDevicesAreGoneFromTheService() {
@@ -305,6 +454,27 @@ private slots:
             QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), rows, patienceMs);
         }
         QCOMPARE(message[0][0].toString(), QStringLiteral("3 device(s) deleted."));
+    }
+
+    void questionsAreAnsweredForWhatIsStillThere() {
+        workOn(20);
+        MainConsoleTable *cameras = table("cameraTable");
+        cameras->selectRow(0);
+        cameras->selectionModel()->select(cameras->model()->index(1, 0),
+                                          QItemSelectionModel::Select | QItemSelectionModel::Rows);
+        const auto selected = m_window->selectedDevices();
+        QCOMPARE(selected.size(), 2u);
+        QTest::keyClick(cameras, Qt::Key_Delete);
+        QTRY_VERIFY(visible<ConfirmDialog>());
+        tell("remove " + selected[0]->id);
+        m_window->reload();
+        QTRY_COMPARE(rowsOfAllTables(), 19);
+        QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
+        visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
+        QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), 18, patienceMs);
+        QCOMPARE(message[0][0].toString(),
+                 QStringLiteral("1 device(s) deleted. 1 device(s) were left out: the server does not manage "
+                                "them any more."));
     }
 
     void exportWritesTheShownRows() {
@@ -373,8 +543,25 @@ private slots:
         StoreWriter::flush();
         DeviceWindow another;
         QVERIFY(another.findChild<MainConsoleTable *>("cameraTable")->isColumnHidden(2));
+
+        QTest::mouseClick(m_window->findChild<QToolButton *>("columnsButton"), Qt::LeftButton);
+        menu = m_window->findChildren<MainConsoleMenu *>().constLast();
+        const QHeaderView *header = table("cameraTable")->horizontalHeader();
+        for (const int left : {0, header->count()}) { // all were not shown, so they are shown first
+            menu->findChild<QCheckBox *>("columnCheckBoxAll")->click();
+            QCOMPARE(header->hiddenSectionCount(), left);
+        }
+        for (const int left : {header->count() - 1, header->count()}) {
+            menu->findChild<QCheckBox *>("columnCheckBox3")->click();
+            QCOMPARE(header->hiddenSectionCount(), left);
+        }
+        menu->close();
+        m_window->selectDevice(m_window->devices()->at(3)->id, {});
+        QCOMPARE(m_window->selectedDevices().size(), 1u);
         table("cameraTable")->resetColumns();
         QVERIFY(!hidden());
+        QCOMPARE(header->hiddenSectionCount(), 0);
+        QVERIFY(table("cameraTable")->columnWidth(0) > 20 && header->height() > 10);
     }
 
     void stopForgetsTheSession() {

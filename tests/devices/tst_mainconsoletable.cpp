@@ -135,7 +135,7 @@ private slots:
             clickHeader(*m_table, hostColumn);
             QCOMPARE(idAt(*m_table, 0), QStringLiteral("DV1199"));
         } else if (change == QLatin1String("states")) {
-            m_inventory->apply({m_inventory->snapshot(), {{topRow, DeviceStatusCode::Unreachable}}, false});
+            m_inventory->apply({m_inventory->snapshot(), {{topRow, DeviceStatusCode::Unreachable}}, {}});
             m_table->refreshStatus();
         } else {
             show(records);
@@ -171,13 +171,13 @@ private slots:
     void stateChangeShowsAndSorts() {
         show(DeviceMaker::cameras(0, 3));
         const QTableWidgetItem *item = m_table->item(1, 0);
-        m_inventory->apply({m_inventory->snapshot(), {{1, DeviceStatusCode::Maintaining}}, false});
+        m_inventory->apply({m_inventory->snapshot(), {{1, DeviceStatusCode::Maintaining}}, {}});
         m_table->refreshStatus();
         QCOMPARE(item->text(), QStringLiteral("  Maintaining..."));
         QCOMPARE(m_table->item(0, 0)->text(), QStringLiteral("  Unauthorized"));
         clickHeader(*m_table, 0);
         select({"DV0"});
-        m_inventory->apply({m_inventory->snapshot(), {{0, DeviceStatusCode::AccountBlocked}}, false});
+        m_inventory->apply({m_inventory->snapshot(), {{0, DeviceStatusCode::AccountBlocked}}, {}});
         m_table->refreshStatus();
         QCOMPARE(idAt(*m_table, 2), QStringLiteral("DV0"));
         QCOMPARE(m_table->item(2, 0)->text(), QStringLiteral("  Account Blocked"));

@@ -3,6 +3,7 @@
 #include "confirmdialog.h"
 #include "deviceoperations.h"
 #include "devicewindow.h"
+#include "icons.h"
 #include "logcapture.h"
 #include "mainconsoletable.h"
 #include "passwordpolicydialog.h"
@@ -67,8 +68,9 @@ private slots:
                                                  "&system_restoreexceptlen=-1"));
         QCOMPARE(passwordCommand("root", "a%b"),
                  QByteArray("/cgi-bin/admin/editaccount.cgi?method=edit&username=root&userpass=a%b"));
-        const QString longest(64, 'x');
-        QVERIFY(passwordCommand(longest, longest).endsWith('&' + QByteArray("userpass=") + longest.toUtf8()));
+        const QString longest(roomInPasswordCommand() - 4, 'x');
+        QVERIFY(passwordCommand("root", longest).endsWith('&' + QByteArray("userpass=") + longest.toUtf8()));
+        QCOMPARE(passwordCommand("root", longest).size(), 255);
         QCOMPARE(passwordCommand(QString(300, 'x'), "y").size(), 255);
     }
 
@@ -93,7 +95,18 @@ private slots:
         apply();
         QCOMPARE(label(dialog, "msgWarningLabel"),
                  QStringLiteral("New Password and Confirm Password don't match."));
+        const auto *icon = dialog->findChild<QLabel *>("msgWarningIcon");
+        const QPixmap hint =
+            Icons::pixmap(":/images/icon_general_hint_solid_black.svg", {12, 12}, icon->devicePixelRatioF());
+        QCOMPARE(icon->pixmap().toImage(), hint.toImage());
         QVERIFY(dialog->isVisible());
+        for (const char *edit : {"passEdit", "confirmEdit"})
+            dialog->findChild<QLineEdit *>(edit)->setText(QString(200, 'x'));
+        QCOMPARE(dialog->findChild<QLineEdit *>("passEdit")->text().size(), 200);
+        apply();
+        QVERIFY(label(dialog, "msgWarningLabel").startsWith("Username and password are too long"));
+        QVERIFY(dialog->isVisible());
+        type("passEdit", "Fresh-Passw0rd");
         type("confirmEdit", "Fresh-Passw0rd");
         const LogCapture log;
         apply();
@@ -127,6 +140,11 @@ private slots:
         auto *list = visible<TargetListDialog>();
         QVERIFY(list);
         auto *targets = list->findChild<QTableView *>("targetTable");
+        const auto *edit = dialog->findChild<QLabel *>("policyEditLabel");
+        for (const bool ticked : {false, true}) {
+            list->findChild<QCheckBox *>("targetAllCheckBox")->click();
+            QCOMPARE(edit->isEnabled(), ticked);
+        }
         targets->setCurrentIndex(targets->model()->index(0, 0));
         QTest::keyClick(targets, Qt::Key_Space);
         list->accept();
@@ -142,6 +160,7 @@ private slots:
         length->setValue(1);
         QCOMPARE(length->value(), 8);
         length->setValue(12);
+        policy->findChild<QCheckBox *>("lengthCheckBox")->setChecked(false);
         for (const auto *name : {"alphabeticCheckBox", "numericCheckBox", "specialCheckBox",
                                  "uppercaseCheckBox", "lowercaseCheckBox", "usernameCheckBox"})
             policy->findChild<QCheckBox *>(name)->setChecked(true);
@@ -191,6 +210,13 @@ private slots:
         QTRY_VERIFY_WITH_TIMEOUT(ended("deviceRestart"), patienceMs);
         QCOMPARE(int(ended("deviceRestart")->devices.size()), table()->rowCount() - 1);
         QCOMPARE(ended("deviceRestart")->failedDevices, 0);
+    }
+
+    void lostAnswerIsNoFailureToStart() {
+        m_service.tell("fault reset@/v1/cgi/customx,times=1");
+        click("restartButton");
+        visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
+        QTRY_VERIFY_WITH_TIMEOUT(messageHas("Restart Device may have begun: "), patienceMs);
     }
 
     void goesOnWithoutVanishedDevices() {

@@ -238,6 +238,28 @@ private slots:
         QVERIFY(!m_tree->edits().isDirty());
     }
 
+    void devicesNeedACommittedSite() {
+        choose("b", "Add Site");
+        QTRY_VERIFY(editor());
+        QTest::keyClick(editor(), Qt::Key_Return);
+        const QString site = m_tree->currentSite();
+        QVERIFY(site.startsWith("SR"));
+        QMimeData data;
+        data.setData(SiteMembership::mimeType, SiteMembership::encode({Sites::overviewId, {"1"}}));
+        QSignalSpy dropped(m_tree.get(), &SiteTree::devicesDropped);
+        QSignalSpy refused(m_tree.get(), &SiteTree::dropRefused);
+        QCOMPARE(drag(data, place(site), {}), Qt::IgnoreAction);
+        QCOMPARE(tip()->text(), QStringLiteral("Apply the site changes first."));
+        QCOMPARE(drop(data, place(site), {}), Qt::IgnoreAction);
+        QCOMPARE(refused.size(), 1);
+        QCOMPARE(dropped.size(), 0);
+        m_tree->beginCommit();
+        m_tree->endCommit(true);
+        QCOMPARE(drag(data, place(site), {}), Qt::CopyAction);
+        QCOMPARE(drop(data, place(site), {}), Qt::CopyAction);
+        QCOMPARE(dropped.size(), 1);
+    }
+
     void placeSurvivesAReading() {
         QStringList words = chain;
         for (int i = 0; i < 1994; ++i)
