@@ -206,11 +206,11 @@ void TestStores::sessionTokens() {
     QCOMPARE(login.port, 9443u);
     QCOMPARE(openedToken(login.token), "raw-token-of-the-login");
 
-    store.renewAccess("renewed-token", login.generation);
+    store.renewAccess("renewed-token", login.token, login.generation);
     QCOMPARE(openedToken(store.loginInfo().token), "renewed-token");
     QCOMPARE(openedToken(store.access()), "renewed-token");
     QCOMPARE(store.loginInfo().generation, login.generation);
-    store.renewAccess("", login.generation);
+    store.renewAccess("", login.token, login.generation);
     QCOMPARE(openedToken(store.loginInfo().token), "renewed-token");
 }
 
@@ -220,11 +220,11 @@ void TestStores::renewalOfAnEndedSession() {
     store.setLoginInfo("10.0.0.1", 9443, "admin", "P1:first");
     const quint64 first = store.loginInfo().generation;
     store.clearLoginInfo();
-    store.renewAccess("too-late", first);
+    store.renewAccess("too-late", "P1:first", first);
     QVERIFY(store.access().isEmpty() && !store.loginInfo().isComplete());
 
     store.setLoginInfo("10.0.0.2", 9443, "admin", "P1:second");
-    store.renewAccess("too-late", first);
+    store.renewAccess("too-late", "P1:first", first);
     QCOMPARE(store.loginInfo().token, "P1:second");
     QCOMPARE(store.access(), "P1:second");
     store.clearLoginInfo();
