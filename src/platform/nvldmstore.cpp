@@ -62,15 +62,18 @@ bool isDamage(const SQLite::Exception &error) {
     return error.getErrorCode() == SQLITE_NOTADB || error.getErrorCode() == SQLITE_CORRUPT;
 }
 
-/// The damaged file keeps its contents under another name: somebody may still want to rescue them.
+/// The damaged file keeps its contents, and what was not written back to it yet, under another name: somebody
+/// may still want to rescue them.
 void setAside(StoreFile &file, const std::string &path) {
     file.writer.reset();
     const QString name = QString::fromStdString(path);
     const QString aside = name + QStringLiteral(".damaged-") +
                           QDateTime::currentDateTimeUtc().toString(QStringLiteral("yyyyMMddhhmmsszzz"));
     const bool moved = QFile::rename(name, aside);
-    QFile::remove(name + QStringLiteral("-wal"));
-    QFile::remove(name + QStringLiteral("-shm"));
+    if (moved) {
+        QFile::rename(name + QStringLiteral("-wal"), aside + QStringLiteral("-wal"));
+        QFile::remove(name + QStringLiteral("-shm"));
+    }
     qWarning("Store file %s is damaged; %s %s", qUtf8Printable(name),
              moved ? "it was set aside as" : "it could not be renamed to", qUtf8Printable(aside));
 }

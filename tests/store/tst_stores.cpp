@@ -33,6 +33,8 @@ private slots:
     void unreadableAccountIsEmpty();
     void serverList();
     void unreadableServerList();
+    void passwordsOutliveABrokenKey();
+    void removedFileIsBegunAnew();
     void servicePort_data();
     void servicePort();
     void sessionTokens();
@@ -159,6 +161,45 @@ void TestStores::unreadableServerList() {
     QCOMPARE(nvldmstore::replaceTable(path("ndclisvrs.sdb").constData(), "svrsMainT", "taken"), 0);
     QCOMPARE(store.loadServerList(loaded), 1002u);
     QVERIFY(loaded.is_array() && loaded.empty());
+}
+
+void TestStores::passwordsOutliveABrokenKey() {
+    CClientStore &store = CClientStore::instance();
+    const LogCapture log;
+    const JSON servers = {{{"id", "SVR1"}, {"pass", plainPassword}, {"remember", "YES"}}};
+    QVERIFY(store.saveServerList(servers));
+    QVERIFY(m_root.write("nvlcrypto.key", "no key"));
+    JSON loaded;
+    QCOMPARE(store.loadServerList(loaded), 0u);
+    QCOMPARE(textMember(loaded.at(0), "pass"), "");
+    loaded[0]["svrname"] = "Renamed";
+    QVERIFY(store.saveServerList(loaded));
+    QVERIFY2(!store.saveServerList(servers), "a password that cannot be ciphered");
+    QVERIFY(QFile::remove(m_root.filePath("nvlcrypto.key")));
+    QCOMPARE(store.loadServerList(loaded), 0u);
+    QCOMPARE(textMember(loaded.at(0), "svrname"), "Renamed");
+    QCOMPARE(textMember(loaded.at(0), "pass"), plainPassword);
+    QVERIFY(!loaded.at(0).contains("sealed"));
+    loaded[0]["remember"] = "NO";
+    QVERIFY(store.saveServerList(loaded));
+}
+
+void TestStores::removedFileIsBegunAnew() {
+    const LogCapture log;
+    CClientStore &store = CClientStore::instance();
+    QVERIFY(store.setLoginRememberMe(true));
+    for (const char *name : {"nvldmgr.sdb", "ndclisvrs.sdb"}) {
+        for (const char *suffix : {"", "-wal", "-shm"})
+            QFile::remove(m_root.filePath(QLatin1String(name) + suffix));
+    }
+    QVERIFY(store.setLoginRememberMe(true));
+    QVERIFY(store.isLoginRememberMe());
+    QVERIFY(store.saveServerList({{{"id", "SVR1"}}}));
+    JSON loaded;
+    QCOMPARE(store.loadServerList(loaded), 0u);
+    QCOMPARE(loaded.size(), std::size_t(1));
+    QVERIFY(store.saveServerList(JSON::array()));
+    QVERIFY(store.setLoginRememberMe(false));
 }
 
 void TestStores::servicePort_data() {
