@@ -20,16 +20,20 @@ namespace {
 
 constexpr std::size_t shortestToken = 16;
 constexpr std::size_t longestToken = 256;
+constexpr int mostPadding = 2;
 
 const char *textOrEmpty(const char *text) {
     return text ? text : "";
 }
 
-/// Header values come percent-decoded, so anything may stand in one; a token is base64url.
-bool isToken(const std::string &text) {
+/// Header values come percent-decoded, so anything may stand in one; a token is base64url, padded or not.
+bool isToken(std::string_view text) {
     const auto isTokenCharacter = [](unsigned char c) { return std::isalnum(c) || c == '-' || c == '_'; };
-    return text.size() >= shortestToken && text.size() <= longestToken &&
-           std::all_of(text.begin(), text.end(), isTokenCharacter);
+    if (text.size() < shortestToken || text.size() > longestToken)
+        return false;
+    for (int padding = 0; padding < mostPadding && text.back() == '='; ++padding)
+        text.remove_suffix(1);
+    return std::all_of(text.begin(), text.end(), isTokenCharacter);
 }
 
 unsigned judgeUsualCode(int code) {

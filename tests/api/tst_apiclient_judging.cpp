@@ -226,7 +226,10 @@ void TestApiClientJudging::renewal_data() {
     QTest::newRow("scheme word") << 0 << "Bearer " + token << false;
     QTest::newRow("short") << 0 << std::string("short") << false;
     QTest::newRow("long") << 0 << std::string(257, 'a') << false;
-    QTest::newRow("other alphabet") << 0 << token + "==" << false;
+    QTest::newRow("padded") << 0 << token + "==" << true;
+    QTest::newRow("padded too much") << 0 << token + "===" << false;
+    QTest::newRow("padding before the end") << 0 << "=" + token << false;
+    QTest::newRow("other alphabet") << 0 << token + "+" << false;
     QTest::newRow("coded line feed") << 0 << token + "%0D%0AX" << false;
     QTest::newRow("no ASCII") << 0 << token + "\xc3\xa4" << false;
     QTest::newRow("empty") << 0 << std::string() << false;
@@ -240,8 +243,8 @@ void TestApiClientJudging::renewal() {
     m_peer.answer(ScriptedPeer::json({{"code", code}}, {"Authorization: " + header}));
     const auto made = client(m_peer.port());
     QCOMPARE(made->removeSite("SR1") == ApiOk, code == 0);
-    QCOMPARE(made->accessToken(), std::string(taken ? renewed : TestSession::token));
-    QCOMPARE(log.count(QStringLiteral("CApiClient::removeSite > m_strAccess: %1").arg(renewed)),
+    QCOMPARE(made->accessToken(), taken ? header : std::string(TestSession::token));
+    QCOMPARE(log.count("CApiClient::removeSite > m_strAccess: " + QString::fromStdString(header)),
              taken ? 1 : 0);
     const bool refused = code == 0 && !taken && !header.empty();
     QCOMPARE(log.count("the renewed token is malformed"), refused ? 1 : 0);
