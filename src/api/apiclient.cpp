@@ -1,5 +1,6 @@
 #include "apiclient.h"
 
+#include "apppaths.h"
 #include "ciphers.h"
 #include "httpexchange.h"
 #include "messagelog.h"
@@ -13,6 +14,7 @@
 #include <cctype>
 #include <iostream>
 #include <limits>
+#include <mutex>
 #include <stdexcept>
 #include <string_view>
 
@@ -144,7 +146,7 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) 
     request.port = m_uPort;
     request.verb = "POST";
     request.path = call.path;
-    request.authorization = call.genericToken ? Ciphers::genericToken().value_or("") : m_strAccess;
+    request.authorization = call.genericToken ? freshGenericToken() : m_strAccess;
     request.totalTimeout = m_totalTimeout;
     fill(request);
     qDebug("CApiClient::%s > Set authorization to %s", call.method,
@@ -159,6 +161,16 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) 
     if (call.logAnswer)
         call.logAnswer(call, answer);
     return judge(call, answer, output);
+}
+
+std::string CApiClient::freshGenericToken() {
+    if (std::optional<std::string> token = Ciphers::genericToken())
+        return *std::move(token);
+    static std::once_flag told;
+    std::call_once(told, [] {
+        qWarning("The key file %s cannot be used; nothing is sent", qUtf8Printable(AppPaths::keyFile()));
+    });
+    throw std::runtime_error("no generic token");
 }
 
 void CApiClient::logException(const Call &call, const std::string &error) {

@@ -156,7 +156,8 @@ private:
         message.response_handler = [this](const httplib::Response &response) {
             m_head.lift();
             m_receiver.start(response);
-            return true;
+            m_headStatus = response.status;
+            return !m_request.headOnly;
         };
         message.content_receiver = [this](const char *data, std::size_t length, std::uint64_t,
                                           std::uint64_t) { return m_receiver.take(data, length); };
@@ -168,6 +169,8 @@ private:
             m_sender->rethrow();
         if (m_sender && m_sender->refusal() != 0)
             return arrived(m_sender->refusal());
+        if (m_request.headOnly && m_headStatus != 0)
+            return arrived(m_headStatus);
         if (!result || !m_receiver.isWhole())
             return failed(m_request, m_deadline.isOver(),
                           result ? "No length" : httplib::to_string(result.error()));
@@ -188,6 +191,7 @@ private:
     RequestDeadline m_deadline;
     std::optional<Transfer::CutOnCancel> m_cutOnCancel;
     AnswerHead m_head;
+    int m_headStatus = 0; ///< once the head is complete
     Receiver m_receiver;
     std::optional<BodySender> m_sender;
 };

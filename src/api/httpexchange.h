@@ -19,6 +19,7 @@ struct HttpRequest {
     std::string body;
     std::chrono::milliseconds waitTimeout{0};      ///< to connect, and of each read; 0 for the defaults
     std::chrono::milliseconds totalTimeout{60000}; ///< of the whole request; of a transfer without progress
+    bool headOnly = false;                         ///< the answer's body is of no interest, nor its fate
     Transfer *transfer = nullptr;                  ///< makes it a transfer, which this one counts and can end
     MultipartBody *form = nullptr;                 ///< of a transfer: sent in place of body
     DownloadTarget *target = nullptr;              ///< of a transfer: takes the answer's body if it is a file

@@ -298,7 +298,11 @@ void TestApiClientJudging::liveness_data() {
     QTest::addColumn<ScriptedPeer::Reply>("reply");
     QTest::addColumn<unsigned>("result");
     QTest::newRow("alive") << whole("whatever") << 0u;
+    const std::string longer = "HTTP/1.1 200 OK\r\nContent-Length: 100\r\n\r\nthe rest";
+    QTest::newRow("body breaks") << ScriptedPeer::Reply{longer} << 0u;
+    QTest::newRow("body stays away") << ScriptedPeer::Reply{longer, ScriptedPeer::End::Hold} << 0u;
     QTest::newRow("refused") << whole(R"({"code":0})", 401) << 13u;
+    QTest::newRow("head breaks") << ScriptedPeer::Reply{"HTTP/1.1 200 OK\r\nContent-"} << 12u;
     QTest::newRow("closed") << ScriptedPeer::Reply{} << 12u;
 }
 
