@@ -33,6 +33,9 @@ struct HttpAnswer {
     std::string authorization; ///< the answer's header of that name, or empty
     std::string body;
     bool isFile = false; ///< the body went to the request's target, whole
+
+    /// The beginning of the body as it came: a service cannot fill the disk with what is logged of it.
+    std::string loggedBody() const { return body.substr(0, 4096); }
 };
 
 /// Opens a connection, sends the request, reads the answer (64 MiB of body at most) and closes. Blocks; any

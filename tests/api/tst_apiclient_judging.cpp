@@ -1,3 +1,6 @@
+#include "apilocalclient.h"
+#include "certificatemaker.h"
+#include "clientidentity.h"
 #include "isolatedroot.h"
 #include "localstore.h"
 #include "logcapture.h"
@@ -9,6 +12,8 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QTest>
+
+#include <openssl/ui.h>
 
 #include <future>
 
@@ -58,7 +63,9 @@ private slots:
     void liveness();
     void livenessOfASilentPeer();
     void nobodyListens();
-    void brokenClientCertificateIsLeftOut();
+    void clientCertificate_data();
+    void clientCertificate();
+    void nothingIsSentWithoutAKey();
     void endOfTheProgramCutsRequests();
 
 private:
@@ -349,15 +356,64 @@ void TestApiClientJudging::nobodyListens() {
     QCOMPARE(client(closedPort)->removeSite("SR1"), unsigned(ApiTransportError));
 }
 
-void TestApiClientJudging::brokenClientCertificateIsLeftOut() {
+void TestApiClientJudging::clientCertificate_data() {
+    QTest::addColumn<QByteArray>("certificate");
+    QTest::addColumn<QByteArray>("key");
+    QTest::addColumn<bool>("shown");
+    const auto key = CertificateMaker::makeKey();
+    const QByteArray certificate =
+        CertificateMaker::pem(CertificateMaker::makeCertificate(key.get(), "gate"));
+    const QByteArray plain = CertificateMaker::pem(key);
+    QTest::newRow("pair") << certificate << plain << true;
+    QTest::newRow("key under a pass phrase") << certificate << CertificateMaker::pem(key, "secret") << false;
+    QTest::newRow("no certificate") << QByteArray("no certificate") << plain << false;
+    QTest::newRow("no key") << certificate << QByteArray() << false;
+    QTest::newRow("key of another") << certificate << CertificateMaker::pem(CertificateMaker::makeKey())
+                                    << true;
+}
+
+/// One that cannot be used is left out. Nobody is asked for its pass phrase: no thread may wait for that.
+void TestApiClientJudging::clientCertificate() {
+    QFETCH(QByteArray, certificate);
+    QFETCH(QByteArray, key);
+    QFETCH(bool, shown);
+    static int questions;
+    questions = 0;
+    const std::unique_ptr<UI_METHOD, decltype(&UI_destroy_method)> terminal(UI_create_method("test"),
+                                                                            &UI_destroy_method);
+    UI_method_set_opener(terminal.get(), [](UI *) { return ++questions, 0; });
+    const UI_METHOD *before = UI_get_default_method();
+    UI_set_default_method(terminal.get());
     const LogCapture log;
-    const QString before = QDir::currentPath();
-    QVERIFY(m_root.write("client.cer", "no certificate") && m_root.write("client.key", "no key"));
+    const QString folder = QDir::currentPath();
+    QVERIFY(m_root.write("client.cer", certificate) && m_root.write("client.key", key));
     QVERIFY(QDir::setCurrent(m_root.path()));
     m_peer.answer(ScriptedPeer::json({{"code", 0}}));
     const unsigned result = client(m_peer.port())->removeSite("SR1");
-    QVERIFY(QDir::setCurrent(before));
+    const bool isThere = ClientIdentity().isThere();
+    QVERIFY(QDir::setCurrent(folder));
+    UI_set_default_method(before);
     QCOMPARE(result, unsigned(ApiOk));
+    QCOMPARE(isThere, shown);
+    QCOMPARE(questions, 0);
+}
+
+void TestApiClientJudging::nothingIsSentWithoutAKey() {
+    const LogCapture log;
+    const int before = m_peer.connections();
+    QVERIFY(m_root.write("nvlcrypto.key", "no key"));
+    std::uint32_t online = 7;
+    CApiLocalClient local(m_peer.port());
+    JSON members;
+    const unsigned results[] = {local.isServerOnline(online), local.memberList(0, 1, members)};
+    const unsigned login = CApiClient("127.0.0.1", m_peer.port()).loginServer("a", "b");
+    QVERIFY(QFile::remove(m_root.filePath("nvlcrypto.key")));
+    for (const unsigned result : results)
+        QCOMPARE(result, unsigned(ApiException));
+    QCOMPARE(login, unsigned(ApiCipherFailure));
+    QCOMPARE(online, 0u);
+    QCOMPARE(m_peer.connections(), before);
+    QCOMPARE(log.count("The key file " + m_root.filePath("nvlcrypto.key")), 1);
 }
 
 /// The last one: no request gets through afterwards.
