@@ -10,6 +10,7 @@
 struct ServiceManagementStatusDialog::Answer {
     unsigned result = ApiException;
     OrbServiceStatus status;
+    bool wanted = false; ///< the remote access that was asked for
 };
 
 ServiceManagementStatusDialog::ServiceManagementStatusDialog(AccountPermission permission, QWidget *parent)
@@ -99,11 +100,15 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
     switch (answer.result) {
     case ApiOk:
         m_allowed = answer.status.remoteAccess;
-        TransientMessage::show(this, tr("Set remote access successfully!"), TransientMessage::Kind::Success);
+        if (m_allowed == answer.wanted)
+            TransientMessage::show(this, tr("Set remote access successfully!"),
+                                   TransientMessage::Kind::Success);
+        else
+            showNotSet();
         break;
     case ApiServerError:
     case ApiCode108:
-        TransientMessage::show(this, tr("Failed to set remote access."), TransientMessage::Kind::Error);
+        showNotSet();
         break;
     default:
         m_error.setText(OrbTexts::failure(answer.result));
@@ -111,6 +116,10 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
     // The switch shows what holds, also after an attempt that did not succeed.
     m_ui->remoteAccessSwitch->setChecked(m_allowed);
     m_ui->remoteAccessSwitch->setFocus();
+}
+
+void ServiceManagementStatusDialog::showNotSet() {
+    TransientMessage::show(this, tr("Failed to set remote access."), TransientMessage::Kind::Error);
 }
 
 void ServiceManagementStatusDialog::displayServiceDisconnectDialog(bool) {
