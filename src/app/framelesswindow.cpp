@@ -341,14 +341,18 @@ void FramelessWindow::onSessionLost() {
 }
 
 void FramelessWindow::onRemoteServerChosen(const QString &serverId) {
-    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::SwitchServer, this);
-    confirm->setAttribute(Qt::WA_DeleteOnClose);
-    connect(confirm, &QDialog::accepted, this, [this, serverId] {
+    const auto change = [this, serverId] {
         endSession(Notice::TellService);
         openLoginDialog({});
         if (auto *login = qobject_cast<LoginDialog *>(m_dialog))
             login->chooseServer(serverId);
-    });
+    };
+    // One question is enough, and the one that says what is lost says that the session ends as well.
+    if (hasUnfinishedWork())
+        return confirmUnfinished(change);
+    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::SwitchServer, this);
+    confirm->setAttribute(Qt::WA_DeleteOnClose);
+    connect(confirm, &QDialog::accepted, this, [this, change] { confirmUnfinished(change); });
     confirm->open();
 }
 
