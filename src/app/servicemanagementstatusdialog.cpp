@@ -57,8 +57,9 @@ void ServiceManagementStatusDialog::readStatus() {
         "getOrbServiceCachedStatus in ServiceManagementStatusDialog",
         [](ServiceSession &session) {
             Answer answer;
-            answer.result = session.call(
-                [&](CApiClient &client) { return client.getOrbServiceCachedStatus(answer.status); });
+            answer.result = loggedResult("getOrbServiceCachedStatus", session.call([&](CApiClient &client) {
+                return client.getOrbServiceCachedStatus(answer.status);
+            }));
             return answer;
         },
         &ServiceManagementStatusDialog::showStatus);
@@ -88,9 +89,10 @@ void ServiceManagementStatusDialog::enableRemoteAccess(bool on) {
         "toggleRemoteAcess in ServiceManagementStatusDialog",
         [on](ServiceSession &session) {
             Answer answer;
-            answer.result = session.call([&](CApiClient &client) {
+            answer.wanted = on;
+            answer.result = loggedResult("toggleRemoteAccess", session.call([&](CApiClient &client) {
                 return client.toggleRemoteAccess(on, answer.status.remoteAccess);
-            });
+            }));
             return answer;
         },
         &ServiceManagementStatusDialog::onToggled);
@@ -138,7 +140,11 @@ void ServiceManagementStatusDialog::disconnectService() {
     run(
         "disconnectService in ServiceManagementStatusDialog",
         [](ServiceSession &session) {
-            return Answer{session.call([](CApiClient &client) { return client.disconnectOrbService(); }), {}};
+            Answer answer;
+            answer.result =
+                loggedResult("disconnectOrbService",
+                             session.call([](CApiClient &client) { return client.disconnectOrbService(); }));
+            return answer;
         },
         &ServiceManagementStatusDialog::onDisconnected);
 }
