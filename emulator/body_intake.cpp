@@ -50,9 +50,13 @@ bool BodyIntake::takeText(std::string_view bytes) {
 }
 
 void BodyIntake::beginPart(const std::string &name, const std::string &fileName) {
-    if (name != parameterPart) {
-        m_file.emplace(name, fileName);
+    if (name == parameterPart) {
+        return;
     }
+    if (m_onParameters && !m_incoming.body.empty()) {
+        std::exchange(m_onParameters, {})();
+    }
+    m_file.emplace(name, fileName);
 }
 
 bool BodyIntake::takePart(std::string_view bytes) {

@@ -7,6 +7,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace httplib {
@@ -33,6 +34,9 @@ public:
 
     BodyIntake(Incoming &incoming, const BodyLimits &limits, Watch watch);
 
+    /// Called once, when the parameters of a form are there and its files follow.
+    void setOnParameters(std::function<void()> onParameters) { m_onParameters = std::move(onParameters); }
+
     Result readText(const httplib::ContentReader &reader);
     Result readForm(const httplib::ContentReader &reader);
 
@@ -46,6 +50,7 @@ private:
     Incoming &m_incoming;
     BodyLimits m_limits;
     Watch m_watch;
+    std::function<void()> m_onParameters;
     std::optional<FileIntake> m_file; ///< none while the parameters arrive
     std::uint64_t m_size = 0;
     std::uint64_t m_headSize = 0;

@@ -15,8 +15,9 @@ struct Target {
     std::string taskId;
 };
 
-/// The elements of a "devices" argument: ids or objects with "id" and, perhaps, "tid".
-std::vector<Target> targetsOf(const Json &body);
+/// The elements of an argument that names devices: ids or objects with "id" and, perhaps, "tid".
+std::vector<Target> targetsOf(const Json &body, const char *name = "devices");
+std::vector<std::string> idsOf(const std::vector<Target> &targets);
 /// Throws Refusal(UnknownId) when one is no managed device.
 void checkKnown(const Model &model, const std::vector<Target> &targets);
 

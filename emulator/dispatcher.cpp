@@ -71,7 +71,7 @@ Answer Dispatcher::granted(const Endpoint &endpoint, const Incoming &incoming, b
             [&](Model &model) { model.log.add(nowMs(), "System", "Audit", done, call.session.account); });
     }
     if (endpoint.gate != Gate::Anybody) {
-        renewToken(answer, call.session, alwaysRenew);
+        renewToken(answer, incoming.authorization, alwaysRenew);
     }
     return answer;
 }
@@ -106,10 +106,13 @@ SessionToken Dispatcher::sessionOf(const Incoming &incoming, const Json &body, G
     });
 }
 
-void Dispatcher::renewToken(Answer &answer, const SessionToken &session, bool always) {
+/// Looks the token up anew: of requests that came with it at the same time only the first renews it, or the
+/// caller could be left with a token that was replaced already.
+void Dispatcher::renewToken(Answer &answer, const std::string &authorization, bool always) {
     m_service.withModel([&](Model &model) {
-        if (always || model.sessions.isDueForRenewal(session, nowMs())) {
-            answer.token = model.sessions.renew(session.session, nowMs()).value_or(std::string());
+        const auto token = model.sessions.find(authorization, nowMs());
+        if (token && token->isNewest() && (always || Sessions::isDueForRenewal(*token, nowMs()))) {
+            answer.token = model.sessions.renew(token->session, nowMs()).value_or(std::string());
         }
     });
 }

@@ -34,7 +34,7 @@ private:
     Answer granted(const Endpoint &endpoint, const Incoming &incoming, bool alwaysRenew);
     Call callOf(const Endpoint &endpoint, const Incoming &incoming);
     SessionToken sessionOf(const Incoming &incoming, const Json &body, Gate gate);
-    void renewToken(Answer &answer, const SessionToken &session, bool always);
+    void renewToken(Answer &answer, const std::string &authorization, bool always);
 
     Service &m_service;
     std::unordered_map<std::string, Endpoint> m_endpoints;

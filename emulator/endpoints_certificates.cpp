@@ -72,7 +72,8 @@ std::string ownerText(const Json &body) {
         const char *name;
     };
     std::string text;
-    for (const auto &[name, key] : {Part{"org_unit", "OU"}, Part{"locality", "L"}, Part{"state", "ST"}}) {
+    for (const auto &[name, key] :
+         {Part{"org_unit", "OU"}, Part{"org", "O"}, Part{"locality", "L"}, Part{"state", "ST"}}) {
         const std::string value = optionalText(body, name);
         text += value.empty() ? value : std::string(",") + key + '=' + value;
     }

@@ -18,14 +18,6 @@ std::vector<Target> underTask(const std::vector<std::string> &ids, const std::st
     return targets;
 }
 
-std::vector<std::string> idsOf(const std::vector<Target> &targets) {
-    std::vector<std::string> ids;
-    for (const Target &target : targets) {
-        ids.push_back(target.id);
-    }
-    return ids;
-}
-
 Answer assignAutomatically(Service &service, const Call &call) {
     const auto targets = underTask(idsOf(targetsOf(call.body)), filledTextMember(call.body, "tid"));
     service.withModel([&](Model &model) {

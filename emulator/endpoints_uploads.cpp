@@ -1,3 +1,4 @@
+#include "device_targets.h"
 #include "endpoint.h"
 #include "firmware_image.h"
 #include "package_upload.h"
@@ -46,7 +47,7 @@ Answer readFirmware(Service &service, const Call &call) {
 
 Answer uploadConfiguration(Service &service, const Call &call) {
     UploadOrder order = orderOf(call, "deviceConfigFileUpload");
-    order.deviceIds = textsMember(call.body, "device_ids");
+    order.deviceIds = idsOf(targetsOf(call.body, "device_ids"));
     const bool isEmpty = imageOf(call).size == 0;
     startUpload(service, order, [&](const Device &device, const Json &) {
         DeviceWork work;
@@ -60,7 +61,7 @@ Answer uploadConfiguration(Service &service, const Call &call) {
 
 Answer uploadPackage(Service &service, const Call &call) {
     UploadOrder order = orderOf(call, "devicePackageUpload");
-    order.deviceIds = textsMember(call.body, "device_ids");
+    order.deviceIds = idsOf(targetsOf(call.body, "device_ids"));
     const Json &onCard = member(call.body, "sd_card");
     if (!onCard.is_boolean()) {
         throw Refusal(Code::Malformed, "\"sd_card\" is no boolean");

@@ -138,7 +138,8 @@ void HttpsServer::handle(const httplib::Request &request, httplib::Response &res
         response.status = plan.main->number;
         return deliverAndCut(request, response, envelope({}), jsonType);
     }
-    switch (reader ? readBody(request, *reader, incoming, plan) : BodyIntake::Result::Whole) {
+    std::optional<WorkArrival> arrival;
+    switch (reader ? readBody(request, *reader, incoming, plan, arrival) : BodyIntake::Result::Whole) {
     case BodyIntake::Result::TooLong:
         return fail(response, 413, "the body is too long");
     case BodyIntake::Result::Broken:
@@ -150,7 +151,7 @@ void HttpsServer::handle(const httplib::Request &request, httplib::Response &res
 
 BodyIntake::Result HttpsServer::readBody(const httplib::Request &request,
                                          const httplib::ContentReader &reader, Incoming &incoming,
-                                         const FaultPlan &plan) {
+                                         const FaultPlan &plan, std::optional<WorkArrival> &arrival) {
     using Clock = std::chrono::steady_clock;
     const auto start = Clock::now();
     const bool cuts = plan.main && plan.main->kind == FaultKind::CutBody;
@@ -170,6 +171,7 @@ BodyIntake::Result HttpsServer::readBody(const httplib::Request &request,
     const Endpoint *endpoint = m_dispatcher->find(incoming.path);
     const bool isForm = endpoint && endpoint->body == Body::Form && request.is_multipart_form_data();
     BodyIntake intake(incoming, m_limits, watch);
+    intake.setOnParameters([&] { arrival.emplace(m_service, incoming); });
     return isForm ? intake.readForm(reader) : intake.readText(reader);
 }
 

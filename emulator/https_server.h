@@ -2,8 +2,10 @@
 
 #include "body_intake.h"
 #include "certificate.h"
+#include "work_arrival.h"
 
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace httplib {
@@ -49,7 +51,8 @@ private:
     void handle(const httplib::Request &request, httplib::Response &response,
                 const httplib::ContentReader *reader);
     BodyIntake::Result readBody(const httplib::Request &request, const httplib::ContentReader &reader,
-                                Incoming &incoming, const FaultPlan &plan);
+                                Incoming &incoming, const FaultPlan &plan,
+                                std::optional<WorkArrival> &arrival);
     void judge(const httplib::Request &request, httplib::Response &response, const Incoming &incoming,
                const FaultPlan &plan);
     void answer(const httplib::Request &request, httplib::Response &response, const Incoming &incoming,

@@ -84,8 +84,8 @@ void Life::dropSome() {
 }
 
 void Life::keepSomeBusy() {
-    static constexpr std::array actions = {"deviceRestart", "deviceRestart", "configuration_file",
-                                           "quick_setup"};
+    static constexpr std::array actions = {"deviceRestart", "deviceRestart", "deviceConfigFileUpload",
+                                           "deviceQuickSetup"};
     for (std::uint64_t n = shareOf(actionsPerDevice); n > 0; --n) {
         Device *device = pickIdle();
         if (device && device->authorization == Authorization::Authorized) {

@@ -27,6 +27,8 @@ struct SessionToken {
     std::string account;
     std::int64_t issuedAt = 0;
     std::int64_t goodUntil = 0; ///< 0 for the newest
+
+    bool isNewest() const { return goodUntil == 0; }
 };
 
 struct Site {

@@ -38,8 +38,8 @@ std::optional<SessionToken> Sessions::find(const std::string &token, std::int64_
     return found->second;
 }
 
-bool Sessions::isDueForRenewal(const SessionToken &token, std::int64_t nowMs) const {
-    return token.goodUntil == 0 && nowMs - token.issuedAt > renewAfterMs;
+bool Sessions::isDueForRenewal(const SessionToken &token, std::int64_t nowMs) {
+    return token.isNewest() && nowMs - token.issuedAt > renewAfterMs;
 }
 
 std::optional<std::string> Sessions::renew(const std::string &session, std::int64_t nowMs) {
@@ -48,7 +48,7 @@ std::optional<std::string> Sessions::renew(const std::string &session, std::int6
     for (auto &[key, token] : m_tokens) {
         if (token.session == session) {
             account = token.account;
-            if (token.goodUntil == 0) {
+            if (token.isNewest()) {
                 token.goodUntil = nowMs + m_limits.graceMs;
                 m_store.saveToken(token);
             }
@@ -73,12 +73,12 @@ void Sessions::closeAll() {
 }
 
 std::size_t Sessions::count() const {
-    return static_cast<std::size_t>(std::count_if(
-        m_tokens.begin(), m_tokens.end(), [](const auto &entry) { return entry.second.goodUntil == 0; }));
+    return static_cast<std::size_t>(std::count_if(m_tokens.begin(), m_tokens.end(),
+                                                  [](const auto &entry) { return entry.second.isNewest(); }));
 }
 
 bool Sessions::hasEnded(const SessionToken &token, std::int64_t nowMs) const {
-    return token.goodUntil != 0 ? nowMs >= token.goodUntil : nowMs - token.issuedAt > longestUnrenewedMs;
+    return token.isNewest() ? nowMs - token.issuedAt > longestUnrenewedMs : nowMs >= token.goodUntil;
 }
 
 void Sessions::dropEnded(std::int64_t nowMs) {

@@ -27,7 +27,7 @@ public:
     std::optional<SessionToken> find(const std::string &token, std::int64_t nowMs);
 
     /// True when the token is the newest of its session and has been in use for long.
-    bool isDueForRenewal(const SessionToken &token, std::int64_t nowMs) const;
+    static bool isDueForRenewal(const SessionToken &token, std::int64_t nowMs);
 
     /// A fresh token for the session; those before it stay good for a moment. Nothing for a session that has
     /// ended meanwhile.

@@ -103,6 +103,12 @@ void TaskEngine::startWork(const std::string &taskId, const std::vector<DeviceWo
     m_tasks.save(task);
 }
 
+void TaskEngine::endArrival(const std::string &taskId) {
+    if (const auto found = m_arriving.find(taskId); found != m_arriving.end() && --found->second == 0) {
+        m_arriving.erase(found);
+    }
+}
+
 void TaskEngine::close(const std::string &taskId, const std::string &finalState, std::int64_t nowMs) {
     Task &task = m_tasks.get(taskId);
     if (!isFinal(finalState) || isFinal(task.status)) {
@@ -164,7 +170,8 @@ void TaskEngine::wake(Task &task, std::int64_t nowMs) {
 
 /// Work that never comes is given up; a scheduled task may have it as late as at its time.
 bool TaskEngine::dropOverdue(Task &task, std::int64_t nowMs) const {
-    if (nowMs < std::max(task.createdAt, task.scheduledAt) + m_rules.workTimeoutMs) {
+    const std::int64_t due = std::max(task.createdAt, task.scheduledAt) + m_rules.workTimeoutMs;
+    if (nowMs < due || m_arriving.contains(task.id)) {
         return false;
     }
     bool dropped = false;

@@ -38,6 +38,10 @@ public:
     /// Lets a task run, at once or at its time. Throws what judgeWork throws.
     void startWork(const std::string &taskId, const std::vector<DeviceWork> &work, std::int64_t nowMs);
 
+    /// Work for a task arrives: until all of it has, the task does not count as one whose work never came.
+    void beginArrival(const std::string &taskId) { ++m_arriving[taskId]; }
+    void endArrival(const std::string &taskId);
+
     /// Ends a task, and what its devices still do, in a final state. Throws Refusal for a task that is final
     /// or unknown and for a state that is not final.
     void close(const std::string &taskId, const std::string &finalState, std::int64_t nowMs);
@@ -75,6 +79,7 @@ private:
     TaskRules m_rules;
     DeviceOutages m_outages;
     std::vector<Task *> m_open;
+    std::unordered_map<std::string, int> m_arriving;
 };
 
 } // namespace emulator

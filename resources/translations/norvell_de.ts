@@ -2678,6 +2678,10 @@
         <source>Logging in...</source>
         <translation>Anmeldung läuft ...</translation>
     </message>
+    <message>
+        <source>The key file %1 cannot be used. Correct or remove it, then try again.</source>
+        <translation>Die Schlüsseldatei %1 kann nicht verwendet werden. Berichtigen oder entfernen Sie sie und versuchen Sie es erneut.</translation>
+    </message>
 </context>
 <context>
     <name>MainConsoleMenu</name>

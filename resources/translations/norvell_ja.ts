@@ -2640,6 +2640,10 @@
         <source>Logging in...</source>
         <translation>ログインしています...</translation>
     </message>
+    <message>
+        <source>The key file %1 cannot be used. Correct or remove it, then try again.</source>
+        <translation>キーファイル %1 を使用できません。修正または削除してから、もう一度お試しください。</translation>
+    </message>
 </context>
 <context>
     <name>MainConsoleMenu</name>

@@ -48,7 +48,8 @@ unsigned CApiClient::runGeneralCgis(const char *szPath, const JSON &body) {
                           .path = szPath,
                           .logAnswer =
                               [](const Call &call, const HttpAnswer &answer) {
-                                  qDebug("Request %s gets result: %s", call.path, answer.body.c_str());
+                                  qDebug("Request %s gets result: %s", call.path,
+                                         answer.loggedBody().c_str());
                               }},
                          body);
 }

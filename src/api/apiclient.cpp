@@ -1,5 +1,6 @@
 #include "apiclient.h"
 
+#include "apppaths.h"
 #include "ciphers.h"
 #include "httpexchange.h"
 #include "messagelog.h"
@@ -13,6 +14,7 @@
 #include <cctype>
 #include <iostream>
 #include <limits>
+#include <mutex>
 #include <stdexcept>
 #include <string_view>
 
@@ -20,16 +22,20 @@ namespace {
 
 constexpr std::size_t shortestToken = 16;
 constexpr std::size_t longestToken = 256;
+constexpr int mostPadding = 2;
 
 const char *textOrEmpty(const char *text) {
     return text ? text : "";
 }
 
-/// Header values come percent-decoded, so anything may stand in one; a token is base64url.
-bool isToken(const std::string &text) {
+/// Header values come percent-decoded, so anything may stand in one; a token is base64url, padded or not.
+bool isToken(std::string_view text) {
     const auto isTokenCharacter = [](unsigned char c) { return std::isalnum(c) || c == '-' || c == '_'; };
-    return text.size() >= shortestToken && text.size() <= longestToken &&
-           std::all_of(text.begin(), text.end(), isTokenCharacter);
+    if (text.size() < shortestToken || text.size() > longestToken)
+        return false;
+    for (int padding = 0; padding < mostPadding && text.back() == '='; ++padding)
+        text.remove_suffix(1);
+    return std::all_of(text.begin(), text.end(), isTokenCharacter);
 }
 
 unsigned judgeUsualCode(int code) {
@@ -140,7 +146,7 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) 
     request.port = m_uPort;
     request.verb = "POST";
     request.path = call.path;
-    request.authorization = call.genericToken ? Ciphers::genericToken().value_or("") : m_strAccess;
+    request.authorization = call.genericToken ? freshGenericToken() : m_strAccess;
     request.totalTimeout = m_totalTimeout;
     fill(request);
     qDebug("CApiClient::%s > Set authorization to %s", call.method,
@@ -155,6 +161,16 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) 
     if (call.logAnswer)
         call.logAnswer(call, answer);
     return judge(call, answer, output);
+}
+
+std::string CApiClient::freshGenericToken() {
+    if (std::optional<std::string> token = Ciphers::genericToken())
+        return *std::move(token);
+    static std::once_flag told;
+    std::call_once(told, [] {
+        qWarning("The key file %s cannot be used; nothing is sent", qUtf8Printable(AppPaths::keyFile()));
+    });
+    throw std::runtime_error("no generic token");
 }
 
 void CApiClient::logException(const Call &call, const std::string &error) {

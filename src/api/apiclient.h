@@ -235,6 +235,8 @@ private:
 
     unsigned postAboutOrb(const char *method, const char *path, JSON body, JSON *cipheredData = nullptr);
     unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
+    /// What a request without a session is authorized with; throws when none can be made.
+    static std::string freshGenericToken();
     static void logException(const Call &call, const std::string &error);
     void renewToken(const Call &call, const std::string &token);
 

@@ -18,6 +18,20 @@ std::optional<bool> flag(const JSON &object, const char *name) {
     return object.at(name).get<bool>();
 }
 
+/// The remote-access switch of a status record.
+std::optional<bool> remoteAccessOf(const JSON &data) {
+    return data.is_object() && data.contains("remoteAccess") ? flag(data.at("remoteAccess"), "enable")
+                                                             : std::nullopt;
+}
+
+/// The new state: alone, as an object with the switch, or as a status record.
+std::optional<bool> switchedState(const JSON &data) {
+    if (data.is_boolean())
+        return data.get<bool>();
+    const std::optional<bool> state = flag(data, "enable");
+    return state ? state : remoteAccessOf(data);
+}
+
 } // namespace
 
 unsigned CApiClient::postAboutOrb(const char *method, const char *path, JSON body, JSON *cipheredData) {
@@ -63,11 +77,13 @@ unsigned CApiClient::getOrbServiceCachedStatus(OrbServiceStatus &status) {
         return result;
     if (!data.is_object())
         return ApiMissingData;
+    const std::optional<bool> remoteAccess = remoteAccessOf(data);
+    if (!remoteAccess)
+        return ApiMissingData;
     status.machineUuid = textMember(data, "machineUUID");
     status.deviceId = textMember(data, "deviceId");
     status.connected = flag(data, "connected").value_or(false);
-    status.remoteAccess =
-        data.contains("remoteAccess") && flag(data.at("remoteAccess"), "enable").value_or(false);
+    status.remoteAccess = *remoteAccess;
     return ApiOk;
 }
 
@@ -90,7 +106,7 @@ unsigned CApiClient::toggleRemoteAccess(bool bEnable, bool &bState) {
         postAboutOrb("toggleRemoteAccess", "/v1/orb/remote_access", {{"enable", bEnable}}, &data);
     if (result != ApiOk)
         return result;
-    const std::optional<bool> state = flag(data, "enable");
+    const std::optional<bool> state = switchedState(data);
     if (!state)
         return ApiMissingData;
     bState = *state;

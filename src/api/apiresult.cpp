@@ -1,6 +1,7 @@
 #include "apiresult.h"
 
 #include <QCoreApplication>
+#include <QDebug>
 
 namespace {
 struct Texts {
@@ -28,4 +29,10 @@ QString apiResultText(unsigned result) {
     default:
         return Texts::tr("error %1").arg(result);
     }
+}
+
+unsigned loggedResult(const char *method, unsigned result) {
+    if (result != ApiOk)
+        qWarning("HTTP API(%s) failed! (%u)", method, result);
+    return result;
 }

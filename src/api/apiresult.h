@@ -21,3 +21,6 @@ enum ApiResult : unsigned {
 /// What a result other than ApiOk means to the user: the part of a sentence that follows "could not be done:
 /// ".
 QString apiResultText(unsigned result);
+
+/// Logs the failure of a method, if its result is one, and hands the result on.
+unsigned loggedResult(const char *method, unsigned result);

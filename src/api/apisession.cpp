@@ -41,9 +41,10 @@ unsigned CApiClient::isServerOnline(std::uint32_t &uOnline) {
         request.verb = "GET";
         request.path = "/isalive";
         request.contentType = "text/plain";
-        request.authorization = Ciphers::genericToken().value_or("");
+        request.authorization = freshGenericToken();
         request.waitTimeout = probeWait;
         request.totalTimeout = probeTotal;
+        request.headOnly = true;
         qDebug("CApiClient::isServerOnline > Set authorization to %s",
                MessageLog::secret(request.authorization).constData());
         const HttpAnswer answer = exchangeHttp(request);

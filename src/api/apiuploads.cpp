@@ -18,9 +18,6 @@
 
 namespace {
 
-/// An answer's body is logged as it came, but a service cannot fill the disk with one.
-constexpr std::size_t loggedBody = 4096;
-
 constexpr const char *selfSignedMembers[] = {"mode",     "https_port", "country",  "state",
                                              "locality", "org",        "org_unit", "validity"};
 
@@ -77,7 +74,7 @@ int loggedCode(const std::string &body) {
 
 void logFirmwareAnswer(const HttpAnswer &answer) {
     qDebug("FW Upload Response -------> Status Code: %d, Code: %d, Body: %s", answer.status,
-           loggedCode(answer.body), answer.body.substr(0, loggedBody).c_str());
+           loggedCode(answer.body), answer.loggedBody().c_str());
 }
 
 } // namespace

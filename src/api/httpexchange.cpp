@@ -2,12 +2,15 @@
 
 #include "answerhead.h"
 #include "bodysender.h"
+#include "clientidentity.h"
 #include "downloadtarget.h"
 #include "requestdeadline.h"
 #include "transfererror.h"
 
 #include <httplib.h>
+#include <openssl/err.h>
 
+#include <memory>
 #include <optional>
 
 namespace {
@@ -15,15 +18,19 @@ namespace {
 constexpr std::size_t bodyLimit = 64u << 20;
 constexpr int tooLarge = 413;
 constexpr std::chrono::seconds transportGrace{5};
-constexpr const char *clientCertificate = "./client.cer";
-constexpr const char *clientKey = "./client.key";
 
 /// With the client certificate when both of its files load, else without one: the service decides.
 std::unique_ptr<httplib::SSLClient> makeClient(const HttpRequest &request) {
     const int port = static_cast<int>(request.port);
-    auto client = std::make_unique<httplib::SSLClient>(request.host, port, clientCertificate, clientKey);
-    if (!client->is_valid())
+    const ClientIdentity identity;
+    std::unique_ptr<httplib::SSLClient> client;
+    if (identity.isThere())
+        client =
+            std::make_unique<httplib::SSLClient>(request.host, port, identity.certificate(), identity.key());
+    if (!client || !client->is_valid())
         client = std::make_unique<httplib::SSLClient>(request.host, port);
+    // What is left in the queue would be taken for the handshake's.
+    ERR_clear_error();
     return client;
 }
 
@@ -156,7 +163,8 @@ private:
         message.response_handler = [this](const httplib::Response &response) {
             m_head.lift();
             m_receiver.start(response);
-            return true;
+            m_headStatus = response.status;
+            return !m_request.headOnly;
         };
         message.content_receiver = [this](const char *data, std::size_t length, std::uint64_t,
                                           std::uint64_t) { return m_receiver.take(data, length); };
@@ -168,6 +176,8 @@ private:
             m_sender->rethrow();
         if (m_sender && m_sender->refusal() != 0)
             return arrived(m_sender->refusal());
+        if (m_request.headOnly && m_headStatus != 0)
+            return arrived(m_headStatus);
         if (!result || !m_receiver.isWhole())
             return failed(m_request, m_deadline.isOver(),
                           result ? "No length" : httplib::to_string(result.error()));
@@ -188,6 +198,7 @@ private:
     RequestDeadline m_deadline;
     std::optional<Transfer::CutOnCancel> m_cutOnCancel;
     AnswerHead m_head;
+    int m_headStatus = 0; ///< once the head is complete
     Receiver m_receiver;
     std::optional<BodySender> m_sender;
 };

@@ -19,6 +19,7 @@ struct HttpRequest {
     std::string body;
     std::chrono::milliseconds waitTimeout{0};      ///< to connect, and of each read; 0 for the defaults
     std::chrono::milliseconds totalTimeout{60000}; ///< of the whole request; of a transfer without progress
+    bool headOnly = false;                         ///< the answer's body is of no interest, nor its fate
     Transfer *transfer = nullptr;                  ///< makes it a transfer, which this one counts and can end
     MultipartBody *form = nullptr;                 ///< of a transfer: sent in place of body
     DownloadTarget *target = nullptr;              ///< of a transfer: takes the answer's body if it is a file
@@ -32,6 +33,9 @@ struct HttpAnswer {
     std::string authorization; ///< the answer's header of that name, or empty
     std::string body;
     bool isFile = false; ///< the body went to the request's target, whole
+
+    /// The beginning of the body as it came: a service cannot fill the disk with what is logged of it.
+    std::string loggedBody() const { return body.substr(0, 4096); }
 };
 
 /// Opens a connection, sends the request, reads the answer (64 MiB of body at most) and closes. Blocks; any

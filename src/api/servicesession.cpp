@@ -11,7 +11,11 @@ bool ServiceSession::isPresent() const {
 }
 
 unsigned ServiceSession::call(const std::function<unsigned(CApiClient &)> &endpoint) {
-    const unsigned result = send(endpoint);
+    unsigned result = send(endpoint);
+    // Only that token was refused when there is another one; its refusal was the answer, so nothing is done
+    // twice.
+    while (result == ApiCode105 && CLocalStore::instance().replaceRefused(m_carried, m_login.generation))
+        result = send(endpoint);
     if (result == ApiCode105)
         m_lost = true;
     return result;
@@ -19,26 +23,34 @@ unsigned ServiceSession::call(const std::function<unsigned(CApiClient &)> &endpo
 
 unsigned ServiceSession::callWithSignIn(const std::function<unsigned(CApiClient &)> &endpoint) {
     const unsigned result = send(endpoint);
+    if (result != ApiCode105)
+        return result;
+    const QByteArray carried = m_carried;
     bool added = false;
-    if (result == ApiCode105)
-        call([&](CApiClient &client) { return client.isOrbServiceAdded(added); });
-    return result;
+    call([&](CApiClient &client) { return client.isOrbServiceAdded(added); });
+    // It was the token that was refused, and the question has found a better one.
+    return m_lost || m_carried == carried ? result : send(endpoint);
+}
+
+void ServiceSession::log(const LoginInfo &login) {
+    qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
+           static_cast<int>(login.port), qUtf8Printable(login.account),
+           MessageLog::secret(login.token).constData());
 }
 
 unsigned ServiceSession::send(const std::function<unsigned(CApiClient &)> &endpoint) {
     const LoginInfo present = CLocalStore::instance().loginInfo();
     if (present.generation != m_login.generation)
         return ApiInvalidArgument;
-    qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(present.address),
-           static_cast<int>(present.port), qUtf8Printable(present.account),
-           MessageLog::secret(present.token).constData());
+    log(present);
+    m_carried = present.token;
     CApiClient client(present.address.toUtf8().constData(), present.port);
     client.setAccount(present.account.toUtf8().constData());
     client.setAccessToken(present.token.constData());
     const std::string before = client.accessToken();
     const unsigned result = endpoint(client);
     if (client.accessToken() != before)
-        CLocalStore::instance().renewAccess(QByteArray::fromStdString(client.accessToken()),
+        CLocalStore::instance().renewAccess(QByteArray::fromStdString(client.accessToken()), m_carried,
                                             m_login.generation);
     return result;
 }

@@ -11,8 +11,9 @@ class ServiceSession {
 public:
     explicit ServiceSession(LoginInfo login);
 
-    /// Makes one call and returns its result. Nothing is sent, and ApiInvalidArgument returned, when the
-    /// session was ended meanwhile.
+    /// Makes one call and returns its result; it is made again with another token of the session when the
+    /// service refuses the one it carried and there is another. Nothing is sent, and ApiInvalidArgument
+    /// returned, when the session was ended meanwhile.
     unsigned call(const std::function<unsigned(CApiClient &)> &endpoint);
 
     /// The same for a call that works with a sign-in of the service elsewhere, of which ApiCode105 may speak
@@ -27,9 +28,13 @@ public:
 
     const LoginInfo &login() const { return m_login; }
 
+    /// Writes the log line of a session that a request is about to use.
+    static void log(const LoginInfo &login);
+
 private:
     unsigned send(const std::function<unsigned(CApiClient &)> &endpoint);
 
     LoginInfo m_login;
+    QByteArray m_carried; ///< the token, in cipher form, of the last call
     bool m_lost = false;
 };

@@ -1,20 +1,20 @@
 #include "aboutdialog.h"
 
 #include "icons.h"
+#include "shippedparts.h"
 #include "ui_aboutdialog.h"
 
 #include <QHeaderView>
 
+#include <algorithm>
+#include <iterator>
+#include <vector>
+
 namespace {
 
-/// What is shipped with the program or inside it.
-struct Part {
-    const char *name;
-    const char *version;
-    const char *licence;
-};
+constexpr int rowsInSight = 10;
 
-constexpr Part parts[] = {
+constexpr ShippedPart parts[] = {
     {"Qt", NVLDM_QT_VERSION, "LGPL 3"},
     {"OpenSSL", NVLDM_OPENSSL_VERSION, "Apache 2.0"},
     {"SQLite", NVLDM_SQLITE_VERSION, "Public domain"},
@@ -25,6 +25,13 @@ constexpr Part parts[] = {
     {"Inter", "", "SIL Open Font License 1.1"},
     {"Symbola", "", "Free for any use"},
 };
+
+std::vector<ShippedPart> allParts() {
+    std::vector<ShippedPart> all(std::begin(parts), std::end(parts));
+    const std::span<const ShippedPart> further = systemParts();
+    all.insert(all.end(), further.begin(), further.end());
+    return all;
+}
 
 QTableWidgetItem *cell(const char *text) {
     return new QTableWidgetItem(QString::fromLatin1(text));
@@ -47,13 +54,17 @@ AboutDialog::~AboutDialog() = default;
 
 void AboutDialog::fillParts() {
     QTableWidget *table = m_ui->partsTable;
-    table->setRowCount(static_cast<int>(std::size(parts)));
-    for (int row = 0; row < table->rowCount(); ++row) {
-        table->setItem(row, 0, cell(parts[row].name));
-        table->setItem(row, 1, cell(parts[row].version));
-        table->setItem(row, 2, cell(parts[row].licence));
+    for (const ShippedPart &part : allParts()) {
+        const int row = table->rowCount();
+        table->setRowCount(row + 1);
+        table->setItem(row, 0, cell(part.name));
+        table->setItem(row, 1, cell(part.version));
+        table->setItem(row, 2, cell(part.licence));
     }
     table->horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
-    table->setFixedHeight(table->horizontalHeader()->sizeHint().height() + table->verticalHeader()->length());
+    const int rows = std::min(table->rowCount(), rowsInSight);
+    table->setFixedHeight(table->horizontalHeader()->sizeHint().height() +
+                          rows * table->verticalHeader()->defaultSectionSize());
+    table->setFocusPolicy(rows < table->rowCount() ? Qt::StrongFocus : Qt::NoFocus);
 }

@@ -3,6 +3,8 @@
 #include "apilocalclient.h"
 #include "configstore.h"
 
+#include <QDebug>
+
 #include <nlohmann/json.hpp>
 
 namespace {
@@ -23,6 +25,7 @@ AccountPermission permissionOf(const JSON &account) {
 
 AccountPermission permissionOnThisComputer(const QString &email) {
     const quint32 port = CConfigStore().serverPort();
+    qDebug("get local server port: %d", static_cast<int>(port));
     for (int page = 0; page < mostPages; ++page) {
         JSON members;
         if (CApiLocalClient(port).memberList(page * pageSize, pageSize, members) != ApiOk)

@@ -14,6 +14,7 @@ namespace {
 
 unsigned newAccount(const QString &email, const QString &password, bool remember) {
     const quint32 port = CConfigStore().serverPort();
+    qDebug("get local server port: %d", static_cast<int>(port));
     qDebug("create account: email: %s, pass: %s", qUtf8Printable(email),
            MessageLog::secret(password).constData());
     const unsigned result = CApiLocalClient(port).newMember(

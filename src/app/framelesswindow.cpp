@@ -47,6 +47,10 @@ constexpr QSize startSize{1280, 720};
 constexpr QSize smallestSize{1100, 640};
 constexpr auto finalLogOffTime = 3000ms;
 
+void warnOfLogOff() {
+    qWarning("Encountered unexpected error when onLogOff() while FramelessWindow");
+}
+
 unsigned logOut(CApiClient &client, const LoginInfo &login) {
     client.setTotalTimeout(finalLogOffTime);
     return client.logoutServer(login.token.constData());
@@ -63,6 +67,7 @@ FramelessWindow::FramelessWindow(QWidget *parent)
       m_startCheck(new StartCheck(this)),
       m_serviceManagement(new ServiceManagement(this)),
       m_idle(new IdleWatch(this)) {
+    qDebug("FramelessWindow constructor");
     setObjectName(QStringLiteral("FramelessWindow"));
     setWindowTitle(QCoreApplication::applicationName());
     buildLayout();
@@ -83,7 +88,7 @@ FramelessWindow::~FramelessWindow() {
         result = ServiceSession(login).call([&](CApiClient &client) { return logOut(client, login); });
     });
     if (result != ApiOk)
-        qWarning("Encountered unexpected error when onLogOff() while FramelessWindow");
+        warnOfLogOff();
 }
 
 void FramelessWindow::buildLayout() {
@@ -341,14 +346,18 @@ void FramelessWindow::onSessionLost() {
 }
 
 void FramelessWindow::onRemoteServerChosen(const QString &serverId) {
-    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::SwitchServer, this);
-    confirm->setAttribute(Qt::WA_DeleteOnClose);
-    connect(confirm, &QDialog::accepted, this, [this, serverId] {
+    const auto change = [this, serverId] {
         endSession(Notice::TellService);
         openLoginDialog({});
         if (auto *login = qobject_cast<LoginDialog *>(m_dialog))
             login->chooseServer(serverId);
-    });
+    };
+    // One question is enough, and the one that says what is lost says that the session ends as well.
+    if (hasUnfinishedWork())
+        return confirmUnfinished(change);
+    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::SwitchServer, this);
+    confirm->setAttribute(Qt::WA_DeleteOnClose);
+    connect(confirm, &QDialog::accepted, this, [this, change] { confirmUnfinished(change); });
     confirm->open();
 }
 
@@ -377,6 +386,7 @@ void FramelessWindow::tellLogOff() {
     NetJob::post(
         NetJob::createRunner("onLogOff() in FramelessWindow"), this,
         [login] {
+            ServiceSession::log(login);
             CApiClient client(login.address.toUtf8().constData(), login.port);
             client.setAccount(login.account.toUtf8().constData());
             client.setAccessToken(login.token.constData());
@@ -384,6 +394,10 @@ void FramelessWindow::tellLogOff() {
         },
         [](unsigned result) {
             if (result != ApiOk)
-                qWarning("Encountered unexpected error when onLogOff() while FramelessWindow");
+                warnOfLogOff();
+        },
+        [](JobEnd end) {
+            if (end != JobEnd::Delivered)
+                warnOfLogOff();
         });
 }

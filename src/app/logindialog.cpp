@@ -1,6 +1,8 @@
 #include "logindialog.h"
 
 #include "apiclient.h"
+#include "apppaths.h"
+#include "ciphers.h"
 #include "clientstore.h"
 #include "configstore.h"
 #include "localstore.h"
@@ -31,6 +33,11 @@ struct LoginDialog::Outcome {
     QByteArray token; ///< in cipher form
 };
 
+QString LoginDialog::unusableKeyText() {
+    return tr("The key file %1 cannot be used. Correct or remove it, then try again.")
+        .arg(AppPaths::keyFile());
+}
+
 LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
     : FramelessDialog(parent),
       m_ui(formIn<Ui::LoginDialog>(content())),
@@ -51,7 +58,7 @@ LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
     connect(this, &LoginDialog::loginFail, this, [this](const QString &reason) { m_tip.setText(reason); });
     onUpdateSvr();
     offerKnownAccounts();
-    m_tip.setText(tip);
+    m_tip.setText(Ciphers::genericToken() ? tip : unusableKeyText());
 }
 
 LoginDialog::~LoginDialog() {
@@ -65,7 +72,7 @@ void LoginDialog::offerKnownAccounts() {
     m_ui->localPassEdit->setText(local.password);
     const AccountInfo remote = store.remoteComputerAccount();
     if (!remote.server.isEmpty()) {
-        m_ui->remoteComboBox->setEditText(remote.server);
+        showServer(remote.server);
         m_ui->remoteEmailEdit->setText(remote.email);
         m_ui->remotePassEdit->setText(remote.password);
     }
@@ -90,6 +97,8 @@ void LoginDialog::showChosenFields() {
 
 void LoginDialog::chooseServer(const QString &serverId) {
     m_ui->remoteRadio->setChecked(true);
+    // The server may be shown already, with the account of the last login.
+    showServer({});
     for (std::size_t i = 0; i < m_servers->size(); ++i) {
         if (stringMember((*m_servers)[i], "id") == serverId)
             m_ui->remoteComboBox->setCurrentIndex(static_cast<int>(i));
@@ -189,8 +198,9 @@ void LoginDialog::onOutcome(const Outcome &outcome) {
     }
     if (outcome.result != ApiOk) {
         qDebug("login failed! res: %d", static_cast<int>(outcome.result));
-        emit loginFail(outcome.result == ApiCode108 ? tr("Server full.")
-                                                    : tr("Incorrect email or password. Try again."));
+        emit loginFail(outcome.result == ApiCode108         ? tr("Server full.")
+                       : outcome.result == ApiCipherFailure ? unusableKeyText()
+                                                            : tr("Incorrect email or password. Try again."));
         return;
     }
     CLocalStore::instance().setLoginInfo(outcome.address, outcome.port, outcome.account, outcome.token);
@@ -212,8 +222,16 @@ void LoginDialog::onUpdateSvr() {
     m_ui->remoteComboBox->clear();
     for (const JSON &server : *m_servers)
         m_ui->remoteComboBox->addItem(stringMember(server, "info"));
-    m_ui->remoteComboBox->setCurrentIndex(-1);
-    m_ui->remoteComboBox->setEditText(typed);
+    showServer(typed);
+}
+
+/// Leaves the other fields as they are. An entry of that very text becomes the current one: the combo box
+/// would choose it by itself as soon as the field is left, and the fields would be filled from it.
+void LoginDialog::showServer(const QString &text) {
+    const QSignalBlocker blocker(m_ui->remoteComboBox);
+    m_ui->remoteComboBox->setCurrentIndex(
+        m_ui->remoteComboBox->findText(text, Qt::MatchExactly | Qt::MatchCaseSensitive));
+    m_ui->remoteComboBox->setEditText(text);
 }
 
 void LoginDialog::on_remoteComboBox_currentIndexChanged(int index) {

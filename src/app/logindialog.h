@@ -41,12 +41,14 @@ private:
     struct Outcome;
 
     void offerKnownAccounts();
+    void showServer(const QString &text);
     void showChosenFields();
     void startLogin(const Credentials &credentials);
     void onOutcome(const Outcome &outcome);
     void setBusy(bool busy);
     void manageServers();
 
+    static QString unusableKeyText();
     static Outcome logIn(const Credentials &credentials, const QString &address,
                          const std::atomic_bool &closed);
 

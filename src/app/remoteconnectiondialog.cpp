@@ -16,8 +16,10 @@ namespace {
 
 /// The list as a log line carries it.
 QByteArray logText(JSON servers) {
-    for (JSON &server : servers)
+    for (JSON &server : servers) {
+        server.erase("sealed");
         server["pass"] = MessageLog::secret(server.value("pass", std::string())).toStdString();
+    }
     return QByteArray::fromStdString(dumpJson(servers));
 }
 
@@ -63,8 +65,12 @@ RemoteConnectionDialog::RemoteConnectionDialog(QWidget *parent)
 RemoteConnectionDialog::~RemoteConnectionDialog() = default;
 
 void RemoteConnectionDialog::load() {
-    if (CClientStore::instance().loadServerList(*m_servers) != 0)
+    const bool loaded = CClientStore::instance().loadServerList(*m_servers) == 0;
+    if (!loaded)
         m_warning.setText(tr("The saved servers could not be read."));
+    // A list that was begun anew would take the place of the one that could not be read.
+    m_ui->addButton->setEnabled(loaded);
+    m_ui->saveButton->setEnabled(loaded);
     qDebug("list server: %s, size: %d", logText(*m_servers).constData(), static_cast<int>(m_servers->size()));
     fillTable();
 }
@@ -145,7 +151,8 @@ void RemoteConnectionDialog::onEditServer(const QString &remember, const QString
     if (row < 0)
         return;
     JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
-    server = record(stringMember(server, "id"), remember, name, info, email, password);
+    // A password that could not be opened is kept while nobody enters another.
+    server.update(record(stringMember(server, "id"), remember, name, info, email, password));
     fillTable();
     m_ui->tableWidget->selectRow(row);
 }

@@ -13,6 +13,15 @@ struct ServiceManagement::Answer {
     AccountPermission permission = AccountPermission::Unknown;
 };
 
+namespace {
+
+unsigned askWhetherAdded(ServiceSession &session, bool &added) {
+    return loggedResult("isOrbServiceAdded",
+                        session.call([&](CApiClient &client) { return client.isOrbServiceAdded(added); }));
+}
+
+} // namespace
+
 ServiceManagement::ServiceManagement(QWidget *frame) : QObject(frame) {}
 
 QWidget *ServiceManagement::frame() const {
@@ -30,8 +39,7 @@ void ServiceManagement::validateOrbServiceAdded() {
     emit connectToOrbMessage(tr("connecting to ORB..."), QStringLiteral("loading"), 0, 0);
     const auto work = [](ServiceSession &session) {
         Answer answer;
-        answer.result =
-            session.call([&](CApiClient &client) { return client.isOrbServiceAdded(answer.added); });
+        answer.result = askWhetherAdded(session, answer.added);
         if (answer.result == ApiOk && CClientStore::instance().isThisComputer())
             answer.permission = permissionOnThisComputer(session.login().account);
         return answer;
@@ -76,8 +84,7 @@ void ServiceManagement::lookUp() {
         NetJob::createRunner("lookUp in ServiceManagement", NetTask::Turn::Beside), this,
         [](ServiceSession &session) {
             Answer answer;
-            answer.result =
-                session.call([&](CApiClient &client) { return client.isOrbServiceAdded(answer.added); });
+            answer.result = askWhetherAdded(session, answer.added);
             return answer;
         },
         [this](const Answer &answer) {

@@ -96,13 +96,14 @@ void ServiceManagementAddServiceDialog::signIn(const QString &email, const QStri
     setBusy(true);
     const auto work = [email, password](ServiceSession &session) {
         SignIn outcome;
-        outcome.result = session.callWithSignIn([&](CApiClient &client) {
+        outcome.result = loggedResult("authenticateWithOrb", session.callWithSignIn([&](CApiClient &client) {
             return client.authenticateWithOrb(email.toUtf8().constData(), password.toUtf8().constData());
-        });
+        }));
         JSON organizations;
         if (outcome.result == ApiOk)
-            outcome.listed = session.callWithSignIn(
-                [&](CApiClient &client) { return client.browseOrbOrgs(organizations); });
+            outcome.listed = loggedResult("browseOrbOrgs", session.callWithSignIn([&](CApiClient &client) {
+                return client.browseOrbOrgs(organizations);
+            }));
         if (outcome.listed == ApiOk && !organizations.is_array())
             outcome.listed = ApiMissingData;
         outcome.organizations = readOrganizations(organizations);
@@ -189,9 +190,9 @@ void ServiceManagementAddServiceDialog::onApply() {
     const bool started = ServiceRequest::post(
         NetJob::createRunner("addService in ServiceManagementAddServiceDialog"), this,
         [organizationId = organization.id, site](ServiceSession &session) {
-            return session.callWithSignIn([&](CApiClient &client) {
+            return loggedResult("addService", session.callWithSignIn([&](CApiClient &client) {
                 return client.addService(organizationId.toUtf8().constData(), site.toUtf8().constData());
-            });
+            }));
         },
         [this](unsigned result) {
             setBusy(false);

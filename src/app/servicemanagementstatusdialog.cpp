@@ -10,6 +10,7 @@
 struct ServiceManagementStatusDialog::Answer {
     unsigned result = ApiException;
     OrbServiceStatus status;
+    bool wanted = false; ///< the remote access that was asked for
 };
 
 ServiceManagementStatusDialog::ServiceManagementStatusDialog(AccountPermission permission, QWidget *parent)
@@ -56,8 +57,9 @@ void ServiceManagementStatusDialog::readStatus() {
         "getOrbServiceCachedStatus in ServiceManagementStatusDialog",
         [](ServiceSession &session) {
             Answer answer;
-            answer.result = session.call(
-                [&](CApiClient &client) { return client.getOrbServiceCachedStatus(answer.status); });
+            answer.result = loggedResult("getOrbServiceCachedStatus", session.call([&](CApiClient &client) {
+                return client.getOrbServiceCachedStatus(answer.status);
+            }));
             return answer;
         },
         &ServiceManagementStatusDialog::showStatus);
@@ -87,9 +89,10 @@ void ServiceManagementStatusDialog::enableRemoteAccess(bool on) {
         "toggleRemoteAcess in ServiceManagementStatusDialog",
         [on](ServiceSession &session) {
             Answer answer;
-            answer.result = session.call([&](CApiClient &client) {
+            answer.wanted = on;
+            answer.result = loggedResult("toggleRemoteAccess", session.call([&](CApiClient &client) {
                 return client.toggleRemoteAccess(on, answer.status.remoteAccess);
-            });
+            }));
             return answer;
         },
         &ServiceManagementStatusDialog::onToggled);
@@ -99,11 +102,15 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
     switch (answer.result) {
     case ApiOk:
         m_allowed = answer.status.remoteAccess;
-        TransientMessage::show(this, tr("Set remote access successfully!"), TransientMessage::Kind::Success);
+        if (m_allowed == answer.wanted)
+            TransientMessage::show(this, tr("Set remote access successfully!"),
+                                   TransientMessage::Kind::Success);
+        else
+            showNotSet();
         break;
     case ApiServerError:
     case ApiCode108:
-        TransientMessage::show(this, tr("Failed to set remote access."), TransientMessage::Kind::Error);
+        showNotSet();
         break;
     default:
         m_error.setText(OrbTexts::failure(answer.result));
@@ -111,6 +118,10 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
     // The switch shows what holds, also after an attempt that did not succeed.
     m_ui->remoteAccessSwitch->setChecked(m_allowed);
     m_ui->remoteAccessSwitch->setFocus();
+}
+
+void ServiceManagementStatusDialog::showNotSet() {
+    TransientMessage::show(this, tr("Failed to set remote access."), TransientMessage::Kind::Error);
 }
 
 void ServiceManagementStatusDialog::displayServiceDisconnectDialog(bool) {
@@ -129,7 +140,11 @@ void ServiceManagementStatusDialog::disconnectService() {
     run(
         "disconnectService in ServiceManagementStatusDialog",
         [](ServiceSession &session) {
-            return Answer{session.call([](CApiClient &client) { return client.disconnectOrbService(); }), {}};
+            Answer answer;
+            answer.result =
+                loggedResult("disconnectOrbService",
+                             session.call([](CApiClient &client) { return client.disconnectOrbService(); }));
+            return answer;
         },
         &ServiceManagementStatusDialog::onDisconnected);
 }

@@ -38,6 +38,7 @@ private:
     void readStatus();
     void showStatus(const Answer &answer);
     void onToggled(const Answer &answer);
+    void showNotSet();
     void disconnectService();
     void onDisconnected(const Answer &answer);
     void run(const char *purpose, Request request,

@@ -54,7 +54,6 @@ SetPasswordDialog::SetPasswordDialog(OperationTargets::List targets, DeviceActio
       m_confirmWarning(nullptr),
       m_policyEdit(new QLabel(body())),
       m_policyView(new PolicyView(body())) {
-    qDebug("SetPasswordDialog constructor");
     if (!m_netTask)
         qDebug("net task create failed!should not be this case!");
     setObjectName(QStringLiteral("SetPasswordDialog"));
@@ -73,9 +72,7 @@ SetPasswordDialog::SetPasswordDialog(OperationTargets::List targets, DeviceActio
     m_password->setFocus();
 }
 
-SetPasswordDialog::~SetPasswordDialog() {
-    qDebug("SetPasswordDialog destructor");
-}
+SetPasswordDialog::~SetPasswordDialog() {}
 
 /// Below the password: how strong it is, and the way to one that the program makes.
 void SetPasswordDialog::buildPasswordHead() {

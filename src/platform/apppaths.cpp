@@ -21,6 +21,10 @@ QString clientStoreFolder() {
 #endif
 }
 
+QString keyFile() {
+    return clientStoreFolder() + QStringLiteral("/nvlcrypto.key");
+}
+
 QString serviceStoreFile() {
     if (const QString folder = root(); !folder.isEmpty())
         return folder + QStringLiteral("/nvldmsvc.sdb");

@@ -11,6 +11,9 @@ QString root();
 /// Folder of the client's store files; not created here.
 QString clientStoreFolder();
 
+/// The file that, where there is one, holds the key of the ciphers.
+QString keyFile();
+
 /// The local service's own store file, which the client only reads.
 QString serviceStoreFile();
 

@@ -66,9 +66,10 @@ bool append(const QDateTime &time, const QByteArray &line) {
         return false;
     QFile file(folder + QLatin1Char('/') + time.toString(QStringLiteral("yyyy-MM-dd")) +
                QStringLiteral(".log"));
-    // One unbuffered write a line keeps lines whole, also beside another process.
-    return file.open(QIODevice::WriteOnly | QIODevice::Append | QIODevice::Unbuffered, ownerOnly) &&
-           file.write(line) == line.size();
+    // One write a line keeps lines whole, also beside another process; without the buffer the end of a line
+    // would be a write of its own where text files have a longer one.
+    return file.open(QIODevice::WriteOnly | QIODevice::Append | QIODevice::Text, ownerOnly) &&
+           file.write(line) == line.size() && file.flush();
 }
 
 QByteArray withoutMarks(QByteArray text) {

@@ -42,6 +42,12 @@ StoreFile &storeFile(const std::string &path) {
     return *entry;
 }
 
+/// Closing the last connection to a file deletes its log, also when the file is damaged and took nothing from
+/// it.
+void keepLogAtClose(SQLite::Database &database, bool keep) {
+    sqlite3_db_config(database.getHandle(), SQLITE_DBCONFIG_NO_CKPT_ON_CLOSE, keep ? 1 : 0, nullptr);
+}
+
 /// A connection that writes is kept; it is opened anew when the file was removed under it.
 SQLite::Database &writer(StoreFile &file, const std::string &path) {
     const QString name = QString::fromStdString(path);
@@ -51,8 +57,10 @@ SQLite::Database &writer(StoreFile &file, const std::string &path) {
         if (!PrivateFiles::ensureFile(name))
             throw std::runtime_error("store file cannot be created");
         auto database = std::make_unique<SQLite::Database>(path, SQLite::OPEN_READWRITE, busyMilliseconds);
+        keepLogAtClose(*database, true);
         database->exec("PRAGMA journal_mode=WAL");
         database->exec("PRAGMA synchronous=FULL");
+        keepLogAtClose(*database, false);
         file.writer = std::move(database);
     }
     return *file.writer;
@@ -62,15 +70,18 @@ bool isDamage(const SQLite::Exception &error) {
     return error.getErrorCode() == SQLITE_NOTADB || error.getErrorCode() == SQLITE_CORRUPT;
 }
 
-/// The damaged file keeps its contents under another name: somebody may still want to rescue them.
+/// The damaged file keeps its contents, and what was not written back to it yet, under another name: somebody
+/// may still want to rescue them.
 void setAside(StoreFile &file, const std::string &path) {
     file.writer.reset();
     const QString name = QString::fromStdString(path);
     const QString aside = name + QStringLiteral(".damaged-") +
                           QDateTime::currentDateTimeUtc().toString(QStringLiteral("yyyyMMddhhmmsszzz"));
     const bool moved = QFile::rename(name, aside);
-    QFile::remove(name + QStringLiteral("-wal"));
-    QFile::remove(name + QStringLiteral("-shm"));
+    if (moved) {
+        QFile::rename(name + QStringLiteral("-wal"), aside + QStringLiteral("-wal"));
+        QFile::remove(name + QStringLiteral("-shm"));
+    }
     qWarning("Store file %s is damaged; %s %s", qUtf8Printable(name),
              moved ? "it was set aside as" : "it could not be renamed to", qUtf8Printable(aside));
 }

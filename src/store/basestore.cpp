@@ -8,8 +8,12 @@
 CBaseStore::CBaseStore(const QString &file, const QString &table, Access access)
     : m_file(file.toUtf8()), m_table(table.toUtf8()), m_access(access) {
     if (m_access == Access::Own)
-        nvldmstore::createDBTable(m_file.constData(), m_table.constData(),
-                                  "key TEXT PRIMARY KEY, value TEXT");
+        createTable();
+}
+
+bool CBaseStore::createTable() {
+    return nvldmstore::createDBTable(m_file.constData(), m_table.constData(),
+                                     "key TEXT PRIMARY KEY, value TEXT") == 0;
 }
 
 QString CBaseStore::query(const QString &key) const {
@@ -30,7 +34,11 @@ bool CBaseStore::replace(const QString &key, const QString &value) {
         return text.replace(QLatin1Char('\''), QLatin1String("''")).toUtf8();
     };
     const QByteArray values = '\'' + doubled(key) + "','" + doubled(value) + '\'';
-    return nvldmstore::replaceData(m_file.constData(), m_table.constData(), values.constData()) == 0;
+    const auto write = [&] {
+        return nvldmstore::replaceData(m_file.constData(), m_table.constData(), values.constData()) == 0;
+    };
+    // A file that was removed under the program is there anew, without its table.
+    return write() || (createTable() && write());
 }
 
 bool CBaseStore::queryFlag(const QString &key) const {

@@ -26,6 +26,8 @@ public:
     bool replaceFlag(const QString &key, bool on);
 
 private:
+    bool createTable();
+
     QByteArray m_file;
     QByteArray m_table;
     Access m_access;

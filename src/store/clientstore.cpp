@@ -8,6 +8,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <optional>
+
 namespace {
 
 const QString kIsThisComputer = QStringLiteral("kIsThisComputer");
@@ -21,14 +23,36 @@ constexpr const char *serverColumns =
 constexpr const char *serverTable = "svrsMainT";
 constexpr const char *scratchTable = "tempSvrsMainT";
 
-/// The row as it is stored: a password leaves memory as cipher text only, and only if it is wanted again.
-JSON storedRow(const JSON &server) {
+/// A password's cipher text that could not be opened; a row keeps it for when its key is back.
+constexpr const char *sealed = "sealed";
+
+/// The password as it is stored: as cipher text only, and only if it is wanted again. Nothing when it cannot
+/// be ciphered.
+std::optional<std::string> storedPassword(const JSON &server) {
+    if (textMember(server, "remember") != "YES")
+        return std::string();
+    const std::string_view password = textMember(server, "pass");
+    return password.empty() ? std::string(textMember(server, sealed)) : Ciphers::sealSecret(password);
+}
+
+std::optional<JSON> storedRow(const JSON &server) {
     JSON row;
     for (const char *name : {"id", "svrname", "info", "acc", "remember"})
         row[name] = textMember(server, name);
-    const bool remember = textMember(server, "remember") == "YES";
-    row["pass"] = remember ? Ciphers::sealSecret(textMember(server, "pass")).value_or("") : "";
+    const std::optional<std::string> password = storedPassword(server);
+    if (!password)
+        return std::nullopt;
+    row["pass"] = *password;
     return row;
+}
+
+/// Turns a stored row into the server that callers know.
+void openRow(JSON &server) {
+    const std::string cipher(textMember(server, "pass"));
+    const std::optional<std::string> password = Ciphers::openSecret(cipher);
+    server["pass"] = password.value_or("");
+    if (!password && !cipher.empty())
+        server[sealed] = cipher;
 }
 
 } // namespace
@@ -108,15 +132,21 @@ unsigned CClientStore::loadServerList(JSON &servers) const {
         return serverListUnreadable;
     }
     for (JSON &server : servers)
-        server["pass"] = Ciphers::openSecret(textMember(server, "pass")).value_or("");
+        openRow(server);
     return 0;
 }
 
 bool CClientStore::saveServerList(const JSON &servers) {
     JSON rows = JSON::array();
-    for (const JSON &server : servers)
-        rows.push_back(storedRow(server));
-    return nvldmstore::createDBTable(m_serverFile.constData(), scratchTable, serverColumns) == 0 &&
+    for (const JSON &server : servers) {
+        std::optional<JSON> row = storedRow(server);
+        if (!row)
+            return false;
+        rows.push_back(*std::move(row));
+    }
+    // The file may have been removed since the list was made.
+    return nvldmstore::createDBTable(m_serverFile.constData(), serverTable, serverColumns) == 0 &&
+           nvldmstore::createDBTable(m_serverFile.constData(), scratchTable, serverColumns) == 0 &&
            nvldmstore::insertListData(m_serverFile.constData(), scratchTable, dumpJson(rows).c_str()) == 0 &&
            nvldmstore::replaceTable(m_serverFile.constData(), scratchTable, serverTable) == 0;
 }

@@ -35,11 +35,12 @@ public:
     bool setAlarmReadHistory(const QString &json);
 
     /// Reads the saved servers: an array of objects with "id", "svrname", "info", "acc", "pass" (plain) and
-    /// "remember". Returns 0, or serverListUnreadable with an empty array.
+    /// "remember"; besides "sealed", for saving it again, where the password does not decipher. Returns 0, or
+    /// serverListUnreadable with an empty array.
     unsigned loadServerList(JSON &servers) const;
 
     /// Replaces the saved servers in one swap; the old list stays when that fails. A password is kept only
-    /// where "remember" is "YES", and in cipher form.
+    /// where "remember" is "YES", and in cipher form; nothing is saved when one cannot be ciphered.
     bool saveServerList(const JSON &servers);
 
 private:

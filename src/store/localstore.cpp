@@ -15,6 +15,8 @@ const QString kFwUploadOnlyApplyFail = QStringLiteral("kFwUploadOnlyApplyFail");
 const QString kFWUploadScheduleOnOff = QStringLiteral("kFWUploadScheduleOnOff");
 const QString kFwRolloutsPrefix = QStringLiteral("kFwRollouts_");
 
+constexpr qsizetype mostSpares = 8;
+
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
     const auto cipher =
@@ -49,6 +51,7 @@ void CLocalStore::setLoginInfo(const QString &address, quint32 port, const QStri
     const std::lock_guard lock(m_mutex);
     m_login = {address, port, account, token, m_login.generation + 1};
     m_access = token;
+    m_spares.clear();
 }
 
 LoginInfo CLocalStore::loginInfo() const {
@@ -60,6 +63,7 @@ void CLocalStore::clearLoginInfo() {
     const std::lock_guard lock(m_mutex);
     m_login = {{}, 0, {}, {}, m_login.generation + 1};
     m_access.clear();
+    m_spares.clear();
 }
 
 void CLocalStore::setAccess(const QByteArray &rawToken) {
@@ -68,13 +72,29 @@ void CLocalStore::setAccess(const QByteArray &rawToken) {
     m_access = token;
 }
 
-void CLocalStore::renewAccess(const QByteArray &rawToken, quint64 generation) {
+void CLocalStore::renewAccess(const QByteArray &rawToken, const QByteArray &carried, quint64 generation) {
     const QByteArray token = cipherOf(rawToken);
     const std::lock_guard lock(m_mutex);
     if (m_login.generation != generation || token.isEmpty())
         return;
+    if (m_login.token == carried)
+        m_spares.clear();
+    else if (m_spares.size() < mostSpares)
+        m_spares.append(m_login.token);
     m_access = token;
     m_login.token = token;
+}
+
+bool CLocalStore::replaceRefused(const QByteArray &carried, quint64 generation) {
+    const std::lock_guard lock(m_mutex);
+    if (m_login.generation != generation)
+        return false;
+    if (m_login.token != carried)
+        return true;
+    if (m_spares.isEmpty())
+        return false;
+    m_login.token = m_access = m_spares.takeLast();
+    return true;
 }
 
 QByteArray CLocalStore::access() const {

@@ -3,6 +3,7 @@
 #include "basestore.h"
 
 #include <QByteArray>
+#include <QByteArrayList>
 
 #include <mutex>
 
@@ -34,8 +35,14 @@ public:
 
     /// Ciphers a raw token and keeps it as the present one.
     void setAccess(const QByteArray &rawToken);
-    /// The same for a token that the service renewed, unless its session was ended meanwhile.
-    void renewAccess(const QByteArray &rawToken, quint64 generation);
+    /// The same for a token that the service renewed, unless its session was ended meanwhile. carried: the
+    /// token, in cipher form, of the request that brought it. Where that is not the present one, requests
+    /// were under way together and their answers came in any order: the present token may be the newer one,
+    /// and is kept as a spare.
+    void renewAccess(const QByteArray &rawToken, const QByteArray &carried, quint64 generation);
+    /// The service does not accept the token that a request carried. True when there is another to try, which
+    /// is the present one then.
+    bool replaceRefused(const QByteArray &carried, quint64 generation);
     QByteArray access() const;
 
     /// How the user has arranged a part of a window, under a name of the part's own; empty where nothing is
@@ -72,4 +79,5 @@ private:
     bool m_localServiceInstalled = false;
     LoginInfo m_login;
     QByteArray m_access;
+    QByteArrayList m_spares; ///< tokens of the session in cipher form, the latest at the end
 };

@@ -3,6 +3,7 @@
 #include "dialogdragger.h"
 #include "icons.h"
 
+#include <QDebug>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QKeyEvent>
@@ -58,6 +59,13 @@ FramelessDialog::FramelessDialog(QWidget *parent)
     layout->addWidget(window);
 
     connect(this, &QWidget::windowTitleChanged, m_title, &QLabel::setText);
+    // A dialog's object name is that of its class, which is not known here yet.
+    connect(this, &QObject::objectNameChanged, this,
+            [](const QString &name) { qDebug("%s constructor", qUtf8Printable(name)); });
+}
+
+FramelessDialog::~FramelessDialog() {
+    qDebug("%s destructor", qUtf8Printable(objectName()));
 }
 
 void FramelessDialog::setClosable(bool closable) {

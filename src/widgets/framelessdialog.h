@@ -11,12 +11,14 @@ class QVBoxLayout;
 /// A dialog in the program's own frame: title area with a close cross, below it the content of a form.
 ///
 /// Its parts carry the object names "dialogWindow", "dialogFrame", "dialogDragger", "dialogTitleLabel" and
-/// "dialogCloseButton".
+/// "dialogCloseButton". The dialog's own object name is that of its class, under which its beginning and its
+/// end are logged.
 class FramelessDialog : public QDialog {
     Q_OBJECT
 
 public:
     explicit FramelessDialog(QWidget *parent = nullptr);
+    ~FramelessDialog() override;
 
     /// The widget that a form's setupUi fills.
     QWidget *content() const { return m_content; }

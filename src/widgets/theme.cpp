@@ -82,7 +82,8 @@ QPalette palette() {
 
 QString styleSheet() {
     QString sheet;
-    for (const char *name : {"combobox", "checkbox", "spinbox", "radiobutton", "base"})
+    // Of rules that weigh the same the later one holds, and what all widgets share weighs as much as a class.
+    for (const char *name : {"base", "combobox", "checkbox", "spinbox", "radiobutton"})
         sheet += readSheet(name);
     return withColours(sheet);
 }

@@ -150,6 +150,10 @@ void TestApiClientCgis::generalAnswerIsLoggedBeforeItIsJudged() {
     QCOMPARE(client(m_peer.port())->runGeneralCgis("/v1/x", {{"devices", targets}}),
              unsigned(ApiHttpStatusError));
     QCOMPARE(log.count("Request /v1/x gets result: down"), 1);
+    m_peer.answer({ScriptedPeer::http(500, std::string(5000, 'x'))});
+    client(m_peer.port())->runGeneralCgis("/v1/x", {{"devices", targets}});
+    QCOMPARE(log.count(QString(4096, u'x')), 1);
+    QCOMPARE(log.count(QString(4097, u'x')), 0);
 }
 
 QTEST_GUILESS_MAIN(TestApiClientCgis)

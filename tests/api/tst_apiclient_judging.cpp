@@ -1,3 +1,6 @@
+#include "apilocalclient.h"
+#include "certificatemaker.h"
+#include "clientidentity.h"
 #include "isolatedroot.h"
 #include "localstore.h"
 #include "logcapture.h"
@@ -9,6 +12,8 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QTest>
+
+#include <openssl/ui.h>
 
 #include <future>
 
@@ -58,7 +63,9 @@ private slots:
     void liveness();
     void livenessOfASilentPeer();
     void nobodyListens();
-    void brokenClientCertificateIsLeftOut();
+    void clientCertificate_data();
+    void clientCertificate();
+    void nothingIsSentWithoutAKey();
     void endOfTheProgramCutsRequests();
 
 private:
@@ -226,7 +233,10 @@ void TestApiClientJudging::renewal_data() {
     QTest::newRow("scheme word") << 0 << "Bearer " + token << false;
     QTest::newRow("short") << 0 << std::string("short") << false;
     QTest::newRow("long") << 0 << std::string(257, 'a') << false;
-    QTest::newRow("other alphabet") << 0 << token + "==" << false;
+    QTest::newRow("padded") << 0 << token + "==" << true;
+    QTest::newRow("padded too much") << 0 << token + "===" << false;
+    QTest::newRow("padding before the end") << 0 << "=" + token << false;
+    QTest::newRow("other alphabet") << 0 << token + "+" << false;
     QTest::newRow("coded line feed") << 0 << token + "%0D%0AX" << false;
     QTest::newRow("no ASCII") << 0 << token + "\xc3\xa4" << false;
     QTest::newRow("empty") << 0 << std::string() << false;
@@ -240,8 +250,8 @@ void TestApiClientJudging::renewal() {
     m_peer.answer(ScriptedPeer::json({{"code", code}}, {"Authorization: " + header}));
     const auto made = client(m_peer.port());
     QCOMPARE(made->removeSite("SR1") == ApiOk, code == 0);
-    QCOMPARE(made->accessToken(), std::string(taken ? renewed : TestSession::token));
-    QCOMPARE(log.count(QStringLiteral("CApiClient::removeSite > m_strAccess: %1").arg(renewed)),
+    QCOMPARE(made->accessToken(), taken ? header : std::string(TestSession::token));
+    QCOMPARE(log.count("CApiClient::removeSite > m_strAccess: " + QString::fromStdString(header)),
              taken ? 1 : 0);
     const bool refused = code == 0 && !taken && !header.empty();
     QCOMPARE(log.count("the renewed token is malformed"), refused ? 1 : 0);
@@ -295,7 +305,11 @@ void TestApiClientJudging::liveness_data() {
     QTest::addColumn<ScriptedPeer::Reply>("reply");
     QTest::addColumn<unsigned>("result");
     QTest::newRow("alive") << whole("whatever") << 0u;
+    const std::string longer = "HTTP/1.1 200 OK\r\nContent-Length: 100\r\n\r\nthe rest";
+    QTest::newRow("body breaks") << ScriptedPeer::Reply{longer} << 0u;
+    QTest::newRow("body stays away") << ScriptedPeer::Reply{longer, ScriptedPeer::End::Hold} << 0u;
     QTest::newRow("refused") << whole(R"({"code":0})", 401) << 13u;
+    QTest::newRow("head breaks") << ScriptedPeer::Reply{"HTTP/1.1 200 OK\r\nContent-"} << 12u;
     QTest::newRow("closed") << ScriptedPeer::Reply{} << 12u;
 }
 
@@ -305,7 +319,10 @@ void TestApiClientJudging::liveness() {
     const LogCapture log;
     m_peer.answer(reply);
     std::uint32_t online = 7;
+    QElapsedTimer timer;
+    timer.start();
     QCOMPARE(client(m_peer.port())->isServerOnline(online), result);
+    QVERIFY2(timer.elapsed() < 1500, "nothing more was to be waited for");
     QCOMPARE(online, result == 0 ? 1u : 0u);
     const ScriptedPeer::Request request = m_peer.takeRequests().at(0);
     QCOMPARE(request.verb + " " + request.path, "GET /isalive");
@@ -342,15 +359,64 @@ void TestApiClientJudging::nobodyListens() {
     QCOMPARE(client(closedPort)->removeSite("SR1"), unsigned(ApiTransportError));
 }
 
-void TestApiClientJudging::brokenClientCertificateIsLeftOut() {
+void TestApiClientJudging::clientCertificate_data() {
+    QTest::addColumn<QByteArray>("certificate");
+    QTest::addColumn<QByteArray>("key");
+    QTest::addColumn<bool>("shown");
+    const auto key = CertificateMaker::makeKey();
+    const QByteArray certificate =
+        CertificateMaker::pem(CertificateMaker::makeCertificate(key.get(), "gate"));
+    const QByteArray plain = CertificateMaker::pem(key);
+    QTest::newRow("pair") << certificate << plain << true;
+    QTest::newRow("key under a pass phrase") << certificate << CertificateMaker::pem(key, "secret") << false;
+    QTest::newRow("no certificate") << QByteArray("no certificate") << plain << false;
+    QTest::newRow("no key") << certificate << QByteArray() << false;
+    QTest::newRow("key of another") << certificate << CertificateMaker::pem(CertificateMaker::makeKey())
+                                    << true;
+}
+
+/// One that cannot be used is left out. Nobody is asked for its pass phrase: no thread may wait for that.
+void TestApiClientJudging::clientCertificate() {
+    QFETCH(QByteArray, certificate);
+    QFETCH(QByteArray, key);
+    QFETCH(bool, shown);
+    static int questions;
+    questions = 0;
+    const std::unique_ptr<UI_METHOD, decltype(&UI_destroy_method)> terminal(UI_create_method("test"),
+                                                                            &UI_destroy_method);
+    UI_method_set_opener(terminal.get(), [](UI *) { return ++questions, 0; });
+    const UI_METHOD *before = UI_get_default_method();
+    UI_set_default_method(terminal.get());
     const LogCapture log;
-    const QString before = QDir::currentPath();
-    QVERIFY(m_root.write("client.cer", "no certificate") && m_root.write("client.key", "no key"));
+    const QString folder = QDir::currentPath();
+    QVERIFY(m_root.write("client.cer", certificate) && m_root.write("client.key", key));
     QVERIFY(QDir::setCurrent(m_root.path()));
     m_peer.answer(ScriptedPeer::json({{"code", 0}}));
     const unsigned result = client(m_peer.port())->removeSite("SR1");
-    QVERIFY(QDir::setCurrent(before));
+    const bool isThere = ClientIdentity().isThere();
+    QVERIFY(QDir::setCurrent(folder));
+    UI_set_default_method(before);
     QCOMPARE(result, unsigned(ApiOk));
+    QCOMPARE(isThere, shown);
+    QCOMPARE(questions, 0);
+}
+
+void TestApiClientJudging::nothingIsSentWithoutAKey() {
+    const LogCapture log;
+    const int before = m_peer.connections();
+    QVERIFY(m_root.write("nvlcrypto.key", "no key"));
+    std::uint32_t online = 7;
+    CApiLocalClient local(m_peer.port());
+    JSON members;
+    const unsigned results[] = {local.isServerOnline(online), local.memberList(0, 1, members)};
+    const unsigned login = CApiClient("127.0.0.1", m_peer.port()).loginServer("a", "b");
+    QVERIFY(QFile::remove(m_root.filePath("nvlcrypto.key")));
+    for (const unsigned result : results)
+        QCOMPARE(result, unsigned(ApiException));
+    QCOMPARE(login, unsigned(ApiCipherFailure));
+    QCOMPARE(online, 0u);
+    QCOMPARE(m_peer.connections(), before);
+    QCOMPARE(log.count("The key file " + m_root.filePath("nvlcrypto.key")), 1);
 }
 
 /// The last one: no request gets through afterwards.

@@ -170,8 +170,8 @@ private:
 };
 
 void TestApiClientRequests::initTestCase() {
-    const std::string data =
-        TestSession::sealed(R"({"siteid":"SR1","is_orb_service_added":true,"enable":false})");
+    const std::string data = TestSession::sealed(
+        R"({"siteid":"SR1","is_orb_service_added":true,"enable":false,"remoteAccess":{"enable":false}})");
     m_peer.answer(ScriptedPeer::json({{"code", 0}, {"data", data}}));
 }
 

@@ -62,10 +62,11 @@ void TestApiRemote::outputs_data() {
     QTest::newRow("all there") << R"({"is_orb_service_added":true,"enable":true,"connected":true,
         "machineUUID":"u","deviceId":"d","remoteAccess":{"enable":true}})"
                                << 0u << 0u << 0u;
-    QTest::newRow("no members") << "{}" << 14u << 14u << 0u;
+    QTest::newRow("no members") << "{}" << 14u << 14u << 14u;
     QTest::newRow("wrong types") << R"({"is_orb_service_added":"true","enable":1,"connected":1,
         "machineUUID":7,"deviceId":null,"remoteAccess":true})"
-                                 << 14u << 14u << 0u;
+                                 << 14u << 14u << 14u;
+    QTest::newRow("switch of another type") << R"({"remoteAccess":{"enable":"on"}})" << 14u << 14u << 14u;
     QTest::newRow("no object") << "[true]" << 14u << 14u << 14u;
 }
 
@@ -89,6 +90,13 @@ void TestApiRemote::outputs() {
     QCOMPARE(read.machineUuid + read.deviceId, whole ? "ud" : "");
     m_peer.answer(ScriptedPeer::json({{"code", 0}}));
     QCOMPARE(client(m_peer.port())->isOrbServiceAdded(isAdded), unsigned(ApiMissingData));
+    // The new state of the switch may come in three forms.
+    for (const char *form : {"true", R"({"enable":true})", R"({"remoteAccess":{"enable":true}})"}) {
+        state = false;
+        m_peer.answer(ScriptedPeer::json({{"code", 0}, {"data", sealed(form)}}));
+        QCOMPARE(client(m_peer.port())->toggleRemoteAccess(true, state), unsigned(ApiOk));
+        QVERIFY2(state, form);
+    }
 }
 
 void TestApiRemote::failuresAreLogged() {

@@ -36,6 +36,8 @@ private slots:
     void answerAfterTheLogOff();
     void nothingIsSentAfterTheLogOff();
     void lostSessionIsReportedOnce();
+    void renewalsThatCrossed_data();
+    void renewalsThatCrossed();
     void failureIsAResult();
 
 private:
@@ -148,6 +150,51 @@ void TestServiceRequest::lostSessionIsReportedOnce() {
     QVERIFY(post());
     QTRY_COMPARE(m_ends.size(), 4);
     QCOMPARE(lost.size(), 2);
+}
+
+void TestServiceRequest::renewalsThatCrossed_data() {
+    QTest::addColumn<QStringList>("ended");
+    QTest::addColumn<QStringList>("carried"); ///< by the call that comes later
+    QTest::newRow("good") << QStringList() << QStringList{"first"};
+    QTest::newRow("the older one has ended") << QStringList{"first"} << QStringList{"first", "second"};
+    QTest::newRow("all have ended") << QStringList{"first", "second"} << QStringList{"first", "second"};
+}
+
+/// Two requests carry the same token, both answers renew it, and that of the second comes first.
+void TestServiceRequest::renewalsThatCrossed() {
+    QFETCH(QStringList, ended);
+    QFETCH(QStringList, carried);
+    const QString tail = QStringLiteral("_token-0123456789");
+    QStringList renewals{"second", "first"};
+    m_peer.follow([&](const ScriptedPeer::Request &request) {
+        const QString token = QString::fromStdString(request.header("authorization")).remove(tail);
+        if (ended.contains(token))
+            return ScriptedPeer::json({{"code", 105}});
+        if (renewals.isEmpty())
+            return ScriptedPeer::json({{"code", 0}});
+        const std::string header = "Authorization: " + (renewals.takeFirst() + tail).toStdString();
+        return ScriptedPeer::json({{"code", 0}}, {header});
+    });
+    const LoginInfo login = CLocalStore::instance().loginInfo();
+    ServiceSession outer(login);
+    const unsigned result = outer.call([&](CApiClient &client) {
+        ServiceSession inner(login);
+        const unsigned first = removeSite(inner);
+        return first == ApiOk ? client.removeSite("SR2") : first;
+    });
+    QCOMPARE(result, unsigned(ApiOk));
+    QCOMPARE(storedToken(), "first" + tail);
+    m_peer.takeRequests();
+
+    ServiceSession later(login);
+    const bool isOver = ended.size() == 2;
+    QCOMPARE(removeSite(later), unsigned(isOver ? ApiCode105 : ApiOk));
+    QCOMPARE(later.isLost(), isOver);
+    QStringList sent;
+    for (const ScriptedPeer::Request &request : m_peer.takeRequests())
+        sent << QString::fromStdString(request.header("authorization")).remove(tail);
+    QCOMPARE(sent, carried);
+    QCOMPARE(storedToken(), carried.last() + tail);
 }
 
 void TestServiceRequest::failureIsAResult() {

@@ -346,14 +346,21 @@ private slots:
         logIn();
         auto *combo = m_window->findChild<QComboBox *>("remoteConnectionComboBox");
         QCOMPARE(combo->currentIndex(), -1);
-        for (const char *answer : {"cancelButton", "acceptButton"}) {
+        // The last two leave a change of the sites behind.
+        for (const char *answer : {"cancelButton", "cancelButton", "acceptButton"}) {
             combo->setFocus();
             QTest::keyClick(combo, Qt::Key_Down);
             QTRY_VERIFY(QApplication::activeModalWidget());
             QVERIFY(m_window->isLoggedIn());
             QCOMPARE(QApplication::activeModalWidget()->objectName(), QStringLiteral("ConfirmDialog"));
+            const auto *device = m_window->findChild<DeviceWindow *>();
+            QCOMPARE(QApplication::activeModalWidget()->windowTitle(),
+                     device->hasPendingEdits() ? QStringLiteral("Site Changes")
+                                               : QStringLiteral("Remote Connection"));
             Form::click(QApplication::activeModalWidget(), answer);
-            QTRY_VERIFY(!QApplication::activeModalWidget());
+            QTRY_VERIFY(!QApplication::activeModalWidget() || Form::visible<LoginDialog>());
+            if (m_window->isLoggedIn() && !device->hasPendingEdits())
+                Form::part<QToolButton>(device, "addTopSiteButton")->click();
         }
         QVERIFY(!m_window->isLoggedIn());
         QTRY_VERIFY(Form::visible<LoginDialog>());

@@ -10,6 +10,7 @@
 #include "scriptedpeer.h"
 
 #include <QComboBox>
+#include <QFile>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QSignalSpy>
@@ -191,6 +192,56 @@ private slots:
         QCOMPARE(combo->count(), 2);
         QCOMPARE(combo->currentText(), QStringLiteral("half.typ"));
         QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("me@norvell.example"));
+    }
+
+    /// The combo box chooses an entry of the very text that it shows as soon as it is left.
+    void offeredAccountIsKept_data() {
+        QTest::addColumn<bool>("again");
+        QTest::newRow("at the start") << false;
+        QTest::newRow("when the list was read again") << true;
+    }
+    void offeredAccountIsKept() {
+        QFETCH(bool, again);
+        const auto store = [](const JSON &servers) {
+            QVERIFY(CClientStore::instance().saveServerList(servers));
+        };
+        store(again ? JSON::array() : savedServers);
+        CClientStore::instance().setThisComputer(false);
+        CClientStore::instance().setRemoteComputerAccount({"south.example:443", "you@south", "Mine1!"});
+        open();
+        if (again) {
+            store(savedServers);
+            m_dialog->onUpdateSvr();
+        }
+        auto *combo = Form::part<QComboBox>(m_dialog.get(), "remoteComboBox");
+        QTest::mouseClick(combo->lineEdit(), Qt::LeftButton);
+        QVERIFY(combo->hasFocus() || combo->lineEdit()->hasFocus());
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+        QTest::mouseClick(Form::part(m_dialog.get(), "remoteEmailEdit"), Qt::LeftButton);
+        QCOMPARE(combo->currentText(), QStringLiteral("south.example:443"));
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("you@south"));
+        QCOMPARE(Form::text(m_dialog.get(), "remotePassEdit"), QStringLiteral("Mine1!"));
+        // Somebody who asks for the server gets what was saved with it.
+        m_dialog->chooseServer("SVRsouth");
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("me@south"));
+        QCOMPARE(Form::text(m_dialog.get(), "remotePassEdit"), QString());
+    }
+
+    void brokenKeyFileIsTold() {
+        const LogCapture log;
+        const QString told =
+            QStringLiteral("The key file %1 cannot be used.").arg(m_root.filePath("nvlcrypto.key"));
+        QVERIFY(m_root.write("nvlcrypto.key", "no key"));
+        fillLocal(email, password);
+        Form::click(m_dialog.get(), "loginButton");
+        QTRY_VERIFY_WITH_TIMEOUT(tip().startsWith(told), patienceMs);
+        open();
+        const QString atOnce = tip();
+        QVERIFY(QFile::remove(m_root.filePath("nvlcrypto.key")));
+        QVERIFY2(atOnce.startsWith(told), qPrintable(atOnce));
+        m_dialog.reset();
+        QCOMPARE(log.count("LoginDialog constructor"), 1);
+        QCOMPARE(log.count("LoginDialog destructor"), 2);
     }
 
     void mayBeClosedWhileTheLoginRuns() {

@@ -2,6 +2,8 @@
 #include "customtable.h"
 #include "form.h"
 #include "isolatedroot.h"
+#include "logcapture.h"
+#include "nvldmstore.h"
 #include "remoteconnectiondialog.h"
 #include "serverdialog.h"
 
@@ -10,6 +12,11 @@
 #include <QSignalSpy>
 
 #include <nlohmann/json.hpp>
+
+namespace {
+constexpr const char *columns =
+    "id TEXT PRIMARY KEY, svrname TEXT, info TEXT, acc TEXT, pass TEXT, remember TEXT";
+} // namespace
 
 class TestRemoteConnectionDialog : public QObject {
     Q_OBJECT
@@ -115,6 +122,19 @@ private slots:
         Form::click(m_dialog.get(), "deleteButton");
         Form::click(m_dialog.get(), "saveButton");
         QCOMPARE(saved("svrname"), QStringLiteral("Alpha|<b>Mike</b>"));
+    }
+
+    /// What is stored is not replaced by a list that never showed it.
+    void unreadableListIsLeftAlone() {
+        const QByteArray file = m_root.filePath("ndclisvrs.sdb").toUtf8();
+        const LogCapture log;
+        QCOMPARE(nvldmstore::createDBTable(file.constData(), "kept", columns), 0);
+        QCOMPARE(nvldmstore::replaceTable(file.constData(), "svrsMainT", "kept"), 0);
+        m_dialog = std::make_unique<RemoteConnectionDialog>();
+        QCOMPARE(Form::text(m_dialog.get(), "msgWarningLabel"),
+                 QStringLiteral("The saved servers could not be read."));
+        QVERIFY(!Form::part(m_dialog.get(), "addButton")->isEnabled());
+        QVERIFY(!Form::part(m_dialog.get(), "saveButton")->isEnabled());
     }
 
     void searchHidesTheOthers() {

@@ -4,7 +4,9 @@
 #include "form.h"
 #include "isolatedroot.h"
 #include "localstore.h"
+#include "logcapture.h"
 #include "nettask.h"
+#include "scriptedpeer.h"
 #include "servicemanagement.h"
 #include "servicemanagementaddservicedialog.h"
 #include "servicemanagementstatusdialog.h"
@@ -18,6 +20,8 @@
 #include <QLabel>
 #include <QSignalSpy>
 #include <QTextDocumentFragment>
+
+#include <nlohmann/json.hpp>
 
 #include <memory>
 
@@ -252,6 +256,7 @@ private slots:
         auto *toggle = Form::part<ToggleSwitch>(status, "remoteAccessSwitch");
         QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
         QSignalSpy changed(status, &StatusDialog::statusChanged);
+        const LogCapture log;
         tell(texts[0]);
         if (texts[0].contains("remote_access")) {
             QTest::mouseClick(toggle, Qt::LeftButton);
@@ -266,7 +271,34 @@ private slots:
         QVERIFY(!toggle->isChecked() && status->isVisible());
         QCOMPARE(shown(status, "errorMessage"), texts[1]);
         QCOMPARE(message(status), texts[2]);
+        QCOMPARE(log.count(texts[0].contains("remote_access") ? "HTTP API(toggleRemoteAccess) failed! ("
+                                                              : "HTTP API(disconnectOrbService) failed! ("),
+                 1);
         QCOMPARE(changed.size(), 0);
+    }
+
+    void switchAnsweredOtherwise() {
+        ScriptedPeer peer;
+        peer.follow([](const ScriptedPeer::Request &request) {
+            return ScriptedPeer::sealed(request.path == "/v1/orb/remote_access"
+                                            ? JSON{{"enable", false}}
+                                            : JSON{{"is_orb_service_added", true},
+                                                   {"connected", true},
+                                                   {"remoteAccess", {{"enable", false}}}});
+        });
+        link();
+        const LoginInfo login = CLocalStore::instance().loginInfo();
+        CLocalStore::instance().setLoginInfo("127.0.0.1", peer.port(), login.account, login.token);
+        StatusDialog *status = openStatusDialog();
+        auto *toggle = Form::part<ToggleSwitch>(status, "remoteAccessSwitch");
+        QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
+        QTest::mouseClick(toggle, Qt::LeftButton);
+        QTRY_COMPARE_WITH_TIMEOUT(message(status), QStringLiteral("Failed to set remote access."),
+                                  patienceMs);
+        QVERIFY(!toggle->isChecked());
+        CLocalStore::instance().clearLoginInfo();
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
     }
 
     void statusThatIsNotKnown_data() {

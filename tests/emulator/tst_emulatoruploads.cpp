@@ -239,14 +239,14 @@ private slots:
     }
 
     void selfSigned() {
-        Json body = {{"mode", "https"}, {"https_port", "8445"}, {"country", "DE"}, {"state", ""},
-                     {"locality", ""},  {"org_unit", "Gates"},  {"validity", 2}};
+        Json body = {{"mode", "https"}, {"https_port", "8445"}, {"country", "DE"},     {"state", ""},
+                     {"locality", ""},  {"org", "Yard"},        {"org_unit", "Gates"}, {"validity", 2}};
         body["devices"] = under(newTask("deviceGenSelfSignedCert", 1));
         const qint64 before = QDateTime::currentMSecsSinceEpoch();
         QCOMPARE(code("/v1/gencert", body), 0);
         COMPARE_JSON(outcomes(), Json::array({done}));
         const std::string ip = record(0).at("d_ip");
-        COMPARE_JSON(record(0).at("d_cert_subject"), "CN=" + ip + ",OU=Gates,C=DE");
+        COMPARE_JSON(record(0).at("d_cert_subject"), "CN=" + ip + ",OU=Gates,O=Yard,C=DE");
         QVERIFY(record(0).at("d_cert_expires") >= before + 2 * 86400000LL && record(0).at("d_https") == 8445);
         for (const Json &bad :
              {Json{{"validity", 0}}, Json{{"https_port", 70000}}, Json{{"country", "Deu"}}}) {
@@ -283,6 +283,20 @@ private slots:
         const int peak = all.mid(all.indexOf("VmHWM:") + 6, 12).trimmed().split(' ')[0].toInt();
         QVERIFY2(peak > 0 && peak < 35000, QByteArray::number(peak));
 #endif
+    }
+
+    /// The files may take longer than a task waits for work of which nothing comes.
+    void slowArrival() {
+        fresh({"--task-work-timeout", "500", "--fault", "slow-body=50@/v1/config_file_upload"});
+        const Json task = newTask("deviceConfigFileUpload", 2);
+        Json ids = Json::array({m_devices[0].at("id")});
+        ids.push_back({{"id", m_devices[1].at("id")}});
+        const std::string content(75000, 'x');
+        QCOMPARE(send("/v1/config_file_upload", {{"tid", task.at("tid")}, {"device_ids", ids}},
+                      {{"fimage", "a.cfg", content}}),
+                 0);
+        COMPARE_JSON(outcomes(), Json::array({done, done}));
+        m_emulator.reset();
     }
 
     void refused_data() {

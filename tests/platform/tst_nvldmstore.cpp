@@ -224,11 +224,13 @@ void TestNvldmStore::damagedFileIsSetAside() {
     QFETCH(QByteArray, contents);
     const QString name = QFileInfo(m_file).fileName();
     QVERIFY(m_root.write(name, contents));
+    QVERIFY(m_root.write(name + "-wal", "what was not written back yet"));
     const LogCapture log;
     QCOMPARE(createDBTable(m_file.constData(), table, keyColumns), 0);
     QCOMPARE(replaceValue(m_file, "k", "v"), 0);
     QCOMPARE(rows(m_file), R"([{"key":"k","value":"v"}])");
-    const QStringList aside = QDir(m_root.path()).entryList({name + ".damaged-*"});
+    QStringList aside = QDir(m_root.path()).entryList({name + ".damaged-*"});
+    QCOMPARE(m_root.read(aside.takeLast()), "what was not written back yet");
     QCOMPARE(aside.size(), 1);
     QCOMPARE(m_root.read(aside[0]), contents);
     QCOMPARE(log.count(aside[0]), 1);

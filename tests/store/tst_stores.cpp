@@ -35,6 +35,8 @@ private slots:
     void unreadableAccountIsEmpty();
     void serverList();
     void unreadableServerList();
+    void passwordsOutliveABrokenKey();
+    void removedFileIsBegunAnew();
     void servicePort_data();
     void servicePort();
     void sessionTokens();
@@ -164,6 +166,45 @@ void TestStores::unreadableServerList() {
     QVERIFY(loaded.is_array() && loaded.empty());
 }
 
+void TestStores::passwordsOutliveABrokenKey() {
+    CClientStore &store = CClientStore::instance();
+    const LogCapture log;
+    const JSON servers = {{{"id", "SVR1"}, {"pass", plainPassword}, {"remember", "YES"}}};
+    QVERIFY(store.saveServerList(servers));
+    QVERIFY(m_root.write("nvlcrypto.key", "no key"));
+    JSON loaded;
+    QCOMPARE(store.loadServerList(loaded), 0u);
+    QCOMPARE(textMember(loaded.at(0), "pass"), "");
+    loaded[0]["svrname"] = "Renamed";
+    QVERIFY(store.saveServerList(loaded));
+    QVERIFY2(!store.saveServerList(servers), "a password that cannot be ciphered");
+    QVERIFY(QFile::remove(m_root.filePath("nvlcrypto.key")));
+    QCOMPARE(store.loadServerList(loaded), 0u);
+    QCOMPARE(textMember(loaded.at(0), "svrname"), "Renamed");
+    QCOMPARE(textMember(loaded.at(0), "pass"), plainPassword);
+    QVERIFY(!loaded.at(0).contains("sealed"));
+    loaded[0]["remember"] = "NO";
+    QVERIFY(store.saveServerList(loaded));
+}
+
+void TestStores::removedFileIsBegunAnew() {
+    const LogCapture log;
+    CClientStore &store = CClientStore::instance();
+    QVERIFY(store.setLoginRememberMe(true));
+    for (const char *name : {"nvldmgr.sdb", "ndclisvrs.sdb"}) {
+        for (const char *suffix : {"", "-wal", "-shm"})
+            QFile::remove(m_root.filePath(QLatin1String(name) + suffix));
+    }
+    QVERIFY(store.setLoginRememberMe(true));
+    QVERIFY(store.isLoginRememberMe());
+    QVERIFY(store.saveServerList({{{"id", "SVR1"}}}));
+    JSON loaded;
+    QCOMPARE(store.loadServerList(loaded), 0u);
+    QCOMPARE(loaded.size(), std::size_t(1));
+    QVERIFY(store.saveServerList(JSON::array()));
+    QVERIFY(store.setLoginRememberMe(false));
+}
+
 void TestStores::servicePort_data() {
     QTest::addColumn<QString>("value");
     QTest::addColumn<quint32>("port");
@@ -209,11 +250,11 @@ void TestStores::sessionTokens() {
     QCOMPARE(login.port, 9443u);
     QCOMPARE(openedToken(login.token), "raw-token-of-the-login");
 
-    store.renewAccess("renewed-token", login.generation);
+    store.renewAccess("renewed-token", login.token, login.generation);
     QCOMPARE(openedToken(store.loginInfo().token), "renewed-token");
     QCOMPARE(openedToken(store.access()), "renewed-token");
     QCOMPARE(store.loginInfo().generation, login.generation);
-    store.renewAccess("", login.generation);
+    store.renewAccess("", login.token, login.generation);
     QCOMPARE(openedToken(store.loginInfo().token), "renewed-token");
 }
 
@@ -223,11 +264,11 @@ void TestStores::renewalOfAnEndedSession() {
     store.setLoginInfo("10.0.0.1", 9443, "admin", "P1:first");
     const quint64 first = store.loginInfo().generation;
     store.clearLoginInfo();
-    store.renewAccess("too-late", first);
+    store.renewAccess("too-late", "P1:first", first);
     QVERIFY(store.access().isEmpty() && !store.loginInfo().isComplete());
 
     store.setLoginInfo("10.0.0.2", 9443, "admin", "P1:second");
-    store.renewAccess("too-late", first);
+    store.renewAccess("too-late", "P1:first", first);
     QCOMPARE(store.loginInfo().token, "P1:second");
     QCOMPARE(store.access(), "P1:second");
     store.clearLoginInfo();

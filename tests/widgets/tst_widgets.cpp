@@ -7,15 +7,21 @@
 #include "transientmessage.h"
 #include "warningline.h"
 
+#include <QCheckBox>
+#include <QComboBox>
 #include <QFile>
 #include <QLabel>
+#include <QRadioButton>
 #include <QRegularExpression>
 #include <QSignalSpy>
+#include <QSpinBox>
 #include <QTabBar>
 #include <QTemporaryDir>
 #include <QTest>
 #include <QTextDocument>
 #include <QToolButton>
+
+#include <tuple>
 
 class TestWidgets : public QObject {
     Q_OBJECT
@@ -135,6 +141,26 @@ private slots:
         QTest::mouseClick(tabs.tabBar(), Qt::LeftButton, {}, tabs.tabBar()->tabRect(1).center());
         QCOMPARE(tabs.currentIndex(), 1);
         QCOMPARE(tabs.tabBar()->tabRect(0).width(), wide);
+    }
+
+    /// What all widgets share gives way to the sheets of the four controls.
+    void controlsHaveFontsOfTheirOwn() {
+        QWidget window;
+        window.setStyleSheet(Theme::styleSheet());
+        const QString symbols = QStringLiteral("Segoe UI Symbol");
+        const std::tuple<QWidget *, int, QString, int> controls[] = {
+            {new QRadioButton(&window), 16, Theme::fontFamily(), QFont::DemiBold},
+            {new QCheckBox(&window), 14, Theme::fontFamily(), QFont::Normal},
+            {new QComboBox(&window), 14, symbols, QFont::Normal},
+            {new QSpinBox(&window), 14, symbols, QFont::Normal},
+            {new QLabel(&window), 13, Theme::fontFamily(), QFont::Normal}};
+        for (const auto &[control, size, family, weight] : controls) {
+            control->ensurePolished();
+            QCOMPARE(control->font().pixelSize(), size);
+            QCOMPARE(control->font().families(), QStringList(family));
+            QCOMPARE(control->font().weight(), weight);
+        }
+        QCOMPARE(std::get<0>(controls[1])->palette().color(QPalette::WindowText), Theme::textDim);
     }
 
     void styleSheetNamesPicturesThatExist() {
