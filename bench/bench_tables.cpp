@@ -173,7 +173,7 @@ Times measureDeviceTable(const std::vector<DeviceRecordPtr> &records) {
         emit table.horizontalHeader()->sectionClicked(static_cast<int>(DeviceColumn::Ip));
         table.viewport()->repaint();
     });
-    DeviceStatusUpdate update{snapshot, {}, false};
+    DeviceStatusUpdate update{snapshot, {}, {}};
     for (int i = 0; i < snapshot->size(); i += 10)
         update.changes.emplace_back(i, DeviceStatusCode::Unreachable);
     times.poll = milliseconds([&] {
