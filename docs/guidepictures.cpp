@@ -3,6 +3,7 @@
 //   guide-pictures FOLDER
 
 #include "devicewindow.h"
+#include "filefield.h"
 #include "mainconsoletable.h"
 #include "mainwindow.h"
 #include "program.h"
@@ -195,7 +196,7 @@ private:
         if (auto *waves = form->findChild<QAbstractButton *>("inWavesCheckBox"))
             waves->setChecked(true);
         if (form->objectName() == "ExportDebugInfoDialog")
-            type(form, "pathEdit", QDir::tempPath());
+            part<FileField>("folderField", form)->setPath(QDir::tempPath());
     }
 
     void showUploads() {

@@ -32,11 +32,13 @@
 #include <QApplication>
 #include <QCloseEvent>
 #include <QDebug>
+#include <QScreen>
 #include <QStackedWidget>
 #include <QTimer>
 #include <QToolButton>
 #include <QVBoxLayout>
 
+#include <algorithm>
 #include <chrono>
 
 using namespace std::chrono_literals;
@@ -113,8 +115,17 @@ void FramelessWindow::buildLayout() {
     layout->addWidget(frame);
     setMinimumSize(smallestSize);
     resize(startSize);
+    moveToScreenCentre();
     m_titleBar->helpButton()->hide();
     m_titleBar->accountButton()->hide();
+}
+
+/// A place that is asked for is known at once; one that the window system chooses comes after the first dialog,
+/// which then stands beside the middle of the frame.
+void FramelessWindow::moveToScreenCentre() {
+    const QRect room = screen()->availableGeometry();
+    const QPoint centred = room.center() - rect().center();
+    move(std::max(centred.x(), room.left()), std::max(centred.y(), room.top()));
 }
 
 void FramelessWindow::probeLocalService() {

@@ -81,6 +81,7 @@ private:
     enum class Notice { TellService, Silent };
 
     void buildLayout();
+    void moveToScreenCentre();
     void connectParts();
     void connectServiceManagement();
     void probeLocalService();
