@@ -9,6 +9,7 @@
 
 #include <atomic>
 #include <cstdio>
+#include <cstdlib>
 #include <mutex>
 
 namespace MessageLog {
@@ -84,7 +85,7 @@ QByteArray masked(QByteArray text) {
     return text;
 }
 
-void handle(QtMsgType type, const QMessageLogContext &context, const QString &message) {
+void write(QtMsgType type, const QMessageLogContext &context, const QString &message) {
     const QByteArray marked = message.toUtf8();
     const QByteArray text = withoutMarks(marked);
     const std::lock_guard lock(logMutex);
@@ -99,6 +100,13 @@ void handle(QtMsgType type, const QMessageLogContext &context, const QString &me
     if (!append(time, line))
         print("Failed to open log file");
     CrashReport::remember(begin + masked(marked));
+}
+
+void handle(QtMsgType type, const QMessageLogContext &context, const QString &message) {
+    write(type, context, message);
+    // The toolkit would end the process here too, on some systems without a word to who catches crashes.
+    if (type == QtFatalMsg)
+        std::abort();
 }
 
 } // namespace

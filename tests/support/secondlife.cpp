@@ -58,7 +58,8 @@ Outcome run(const QStringList &arguments, const QProcessEnvironment &environment
     Outcome outcome;
     outcome.exited = ended && process.exitStatus() == QProcess::NormalExit;
     outcome.status = process.exitCode();
-    outcome.output = process.readAllStandardOutput();
+    // Lines end as the system has them.
+    outcome.output = process.readAllStandardOutput().replace("\r\n", "\n");
     return outcome;
 }
 
