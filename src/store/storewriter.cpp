@@ -1,5 +1,6 @@
 #include "storewriter.h"
 
+#include <QCoreApplication>
 #include <QThreadPool>
 
 namespace StoreWriter {
@@ -10,6 +11,8 @@ QThreadPool &writer() {
     static QThreadPool *const pool = [] {
         auto *made = new QThreadPool;
         made->setMaxThreadCount(1);
+        // A thread that the end of the process finds at rest holds it up on some systems.
+        qAddPostRoutine(flush);
         return made;
     }();
     return *pool;
