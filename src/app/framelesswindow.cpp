@@ -120,8 +120,8 @@ void FramelessWindow::buildLayout() {
     m_titleBar->accountButton()->hide();
 }
 
-/// A place that is asked for is known at once; one that the window system chooses comes after the first dialog,
-/// which then stands beside the middle of the frame.
+/// A place that is asked for is known at once; one that the window system chooses comes after the first
+/// dialog, which then stands beside the middle of the frame.
 void FramelessWindow::moveToScreenCentre() {
     const QRect room = screen()->availableGeometry();
     const QPoint centred = room.center() - rect().center();

@@ -59,7 +59,8 @@ private:
             return text;
         // Blanks in front stay: a text that is cut begins where the others do.
         QString line = text.left(longestShownText);
-        std::replace_if(line.begin(), line.end(), [](QChar each) { return each.isSpace(); }, QChar(u' '));
+        std::replace_if(
+            line.begin(), line.end(), [](QChar each) { return each.isSpace(); }, QChar(u' '));
         return QFontMetrics(font).elidedText(line, Qt::ElideRight, width);
     }
 
