@@ -46,13 +46,14 @@ int runWindows(QApplication &application, const std::function<void(QWidget &)> &
     splash.showMessage(QCoreApplication::applicationName(), Qt::AlignLeft | Qt::AlignBottom, Qt::white);
 
     FramelessWindow frame;
-    auto *content = new MainWindow(frame.contentParent());
-    content->setWindowTitle(QCoreApplication::translate("main", "Norvell Device Manager"));
-    frame.setContent(content);
     frame.show();
     if (shown)
         shown(frame);
     splash.finish(&frame);
+    // Nobody sees it before the login, so the first frame does not wait for it.
+    auto *content = new MainWindow(frame.contentParent());
+    content->setWindowTitle(QCoreApplication::translate("main", "Norvell Device Manager"));
+    frame.setContent(content);
     return application.exec();
 }
 

@@ -17,6 +17,7 @@
 
 #include <algorithm>
 #include <tuple>
+#include <utility>
 
 namespace {
 
@@ -110,6 +111,19 @@ void LogSidebar::addQuickFrames(QVBoxLayout *layout) {
     layout->addSpacing(4);
 }
 
+/// Calendars are large, and made when the page is first seen.
+void LogSidebar::showEvent(QShowEvent *event) {
+    QFrame::showEvent(event);
+    if (std::exchange(m_hasCalendars, true))
+        return;
+    QTextCharFormat plain;
+    plain.setForeground(Theme::text);
+    for (const QDateEdit *date : {m_startDate, m_endDate}) {
+        for (const Qt::DayOfWeek day : {Qt::Saturday, Qt::Sunday})
+            date->calendarWidget()->setWeekdayTextFormat(day, plain);
+    }
+}
+
 std::pair<QDateEdit *, QTimeEdit *> LogSidebar::addTimes(QVBoxLayout *layout, const QString &caption,
                                                          const char *dateName, const char *timeName) {
     auto *date = new QDateEdit(this);
@@ -118,10 +132,6 @@ std::pair<QDateEdit *, QTimeEdit *> LogSidebar::addTimes(QVBoxLayout *layout, co
     date->setObjectName(QLatin1String(dateName));
     date->setDisplayFormat(QStringLiteral("yyyy/MM/dd"));
     date->setCalendarPopup(true);
-    QTextCharFormat plain;
-    plain.setForeground(Theme::text);
-    for (const Qt::DayOfWeek day : {Qt::Saturday, Qt::Sunday})
-        date->calendarWidget()->setWeekdayTextFormat(day, plain);
     // The service counts from there, and knows no time before it.
     date->setMinimumDate(QDate(1970, 1, 1));
     date->setAccessibleName(tr("%1, date").arg(caption));

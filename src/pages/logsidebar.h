@@ -40,6 +40,9 @@ signals:
     void searchRequested();
     void filterChanged();
 
+protected:
+    void showEvent(QShowEvent *event) override;
+
 private:
     enum class Quick { None, LastHour, Today, SevenDays };
 
@@ -51,6 +54,7 @@ private:
     void showQuick(Quick quick);
     void setEnds(const QDateTime &start, const QDateTime &end);
 
+    bool m_hasCalendars = false;
     QDateEdit *m_startDate = nullptr;
     QTimeEdit *m_startTime = nullptr;
     QDateEdit *m_endDate = nullptr;

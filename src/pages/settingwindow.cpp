@@ -22,11 +22,12 @@
 #include <algorithm>
 #include <new>
 
-SettingWindow::SettingWindow(QWidget *parent)
-    : QWidget(parent), m_runner(new (std::nothrow) NetTask), m_form(new SettingsForm) {
+SettingWindow::SettingWindow(QWidget *parent) : QWidget(parent), m_runner(new (std::nothrow) NetTask) {
     qDebug("SettingWindow constructor");
     setObjectName(QStringLiteral("SettingWindow"));
-    auto *scroll = new QScrollArea;
+    // Each in its place from the start: widgets that move to another parent are styled all over again.
+    auto *scroll = new QScrollArea(this);
+    m_form = new SettingsForm(scroll->viewport());
     scroll->setObjectName(QStringLiteral("settingsScroll"));
     scroll->setWidgetResizable(true);
     scroll->setFocusPolicy(Qt::NoFocus);
