@@ -1,5 +1,6 @@
+#include "processsetup.h"
 #include "program.h"
 
 int main(int argc, char *argv[]) {
-    return Program::run(argc, argv);
+    return ProcessSetup::leave(Program::run(argc, argv));
 }

@@ -8,6 +8,11 @@
 #ifdef __linux__
 #include <sys/prctl.h>
 #endif
+#ifdef _WIN32
+#include <windows.h>
+
+#include <cstdio>
+#endif
 
 namespace ProcessSetup {
 
@@ -26,6 +31,14 @@ void keepMemoryPrivate() {
     // A limit does not hold where the system pipes images to a collector; debuggers need the other build.
     ::prctl(PR_SET_DUMPABLE, 0, 0, 0, 0);
 #endif
+}
+
+int leave(int status) {
+#ifdef _WIN32
+    std::fflush(nullptr);
+    ::TerminateProcess(::GetCurrentProcess(), static_cast<UINT>(status));
+#endif
+    return status;
 }
 
 } // namespace ProcessSetup

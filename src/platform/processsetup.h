@@ -10,4 +10,8 @@ void ignoreBrokenPipes();
 /// passwords stand there.
 void keepMemoryPrivate();
 
+/// The last step of main(): gives its status back, or ends the process with it at once where libraries that
+/// tidy up behind it may wait for threads that the system has ended already.
+int leave(int status);
+
 } // namespace ProcessSetup
