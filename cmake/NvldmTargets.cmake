@@ -21,7 +21,9 @@ endfunction()
 # crash's text are looked up in what packaging takes off the programs and keeps.
 function(nvldm_release_options target)
     target_compile_options(${target} PRIVATE
-        "$<$<CONFIG:Release>:-g1;-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=;-ffile-prefix-map=${PROJECT_BINARY_DIR}/=>")
+        "$<$<CONFIG:Release>:-g1;-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=;-ffile-prefix-map=${PROJECT_BINARY_DIR}/=>"
+        # The folder that the compiler runs in, which has no slash behind it.
+        "$<$<CONFIG:Release>:-fdebug-prefix-map=${PROJECT_BINARY_DIR}=.>")
     if(CMAKE_CXX_COMPILER_ID STREQUAL GNU AND CMAKE_CXX_COMPILER_VERSION VERSION_LESS 13)
         # Where it optimises most, this version sees texts overlap that are put together; none does.
         target_compile_options(${target} PRIVATE "$<$<CONFIG:Release>:-Wno-restrict>")
