@@ -2,7 +2,8 @@
 
 #include <QString>
 
-/// Folders and files that belong to the user alone (0700 and 0600 where the system knows modes, an access list elsewhere).
+/// Folders and files that belong to the user alone (0700 and 0600 where the system knows modes, an access
+/// list elsewhere).
 namespace PrivateFiles {
 
 /// Creates the folder with its missing parents. False when it cannot be had.

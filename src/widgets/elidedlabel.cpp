@@ -24,8 +24,8 @@ QSize ElidedLabel::minimumSizeHint() const {
 void ElidedLabel::paintEvent(QPaintEvent *) {
     QPainter painter(this);
     const QString shown = fontMetrics().elidedText(text(), Qt::ElideRight, contentsRect().width());
-    style()->drawItemText(&painter, contentsRect(), static_cast<int>(alignment()), palette(), isEnabled(), shown,
-                          foregroundRole());
+    style()->drawItemText(&painter, contentsRect(), static_cast<int>(alignment()), palette(), isEnabled(),
+                          shown, foregroundRole());
 }
 
 bool ElidedLabel::event(QEvent *event) {
