@@ -54,7 +54,8 @@ function(nvldm_qt_library name)
 endfunction()
 
 function(nvldm_qt_options target)
-    set_target_properties(${target} PROPERTIES AUTOMOC ON AUTOUIC ON)
+    # Generated code names headers as sources do, not by the way from the build folder to them.
+    set_target_properties(${target} PROPERTIES AUTOMOC ON AUTOMOC_PATH_PREFIX ON AUTOUIC ON)
     target_compile_definitions(${target} PRIVATE
         QT_MESSAGELOGCONTEXT QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_DISABLE_DEPRECATED_BEFORE=0x060400)
 endfunction()
