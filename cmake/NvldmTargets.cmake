@@ -37,13 +37,17 @@ endfunction()
 
 # A static library of one folder. PUBLIC and PRIVATE name what it may include: a header of a library that is
 # not linked here is not on the include path.
-#   nvldm_library(name SOURCES … [PUBLIC …] [PRIVATE …])
+# PRECOMPILED names the headers that are compiled once (NvldmPrecompiled).
+#   nvldm_library(name [PRECOMPILED kind] SOURCES … [PUBLIC …] [PRIVATE …])
 function(nvldm_library name)
-    cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
+    cmake_parse_arguments(ARG "" "PRECOMPILED" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
     add_library(${name} STATIC ${ARG_SOURCES})
     target_include_directories(${name} PUBLIC "${CMAKE_CURRENT_SOURCE_DIR}")
     target_link_libraries(${name} PUBLIC ${ARG_PUBLIC} PRIVATE ${ARG_PRIVATE})
     nvldm_compile_options(${name})
+    if(ARG_PRECOMPILED)
+        nvldm_precompile(${name} ${ARG_PRECOMPILED})
+    endif()
 endfunction()
 
 # The same for a library of Qt code: moc and uic run, strings stay QString on purpose, and log lines carry
@@ -62,9 +66,9 @@ endfunction()
 
 # A Qt Test program, registered with ctest under its own name, off screen. One whose other side is written for POSIX
 # systems, as the scripted peers are, is left out on others.
-#   nvldm_test(tst_name [POSIX] LIBS … [SOURCES …] [TIMEOUT s])
+#   nvldm_test(tst_name [POSIX] [PRECOMPILED kind] LIBS … [SOURCES …] [TIMEOUT s])
 function(nvldm_test name)
-    cmake_parse_arguments(ARG "POSIX" "TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    cmake_parse_arguments(ARG "POSIX" "PRECOMPILED;TIMEOUT" "LIBS;SOURCES" ${ARGN})
     if(ARG_POSIX AND NOT UNIX)
         return()
     endif()
@@ -72,6 +76,9 @@ function(nvldm_test name)
     target_link_libraries(${name} PRIVATE ${ARG_LIBS} Qt6::Test)
     nvldm_compile_options(${name})
     nvldm_qt_options(${name})
+    if(ARG_PRECOMPILED)
+        nvldm_precompile(${name} ${ARG_PRECOMPILED})
+    endif()
     add_test(NAME ${name} COMMAND ${name})
     if(NOT ARG_TIMEOUT)
         set(ARG_TIMEOUT 120)
