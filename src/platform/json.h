@@ -10,8 +10,9 @@
 /// The JSON value of every request, answer and record.
 using JSON = nlohmann::json;
 
-/// Parses text from outside. Throws the JSON library's exception for text that is not JSON, and for values
-/// nested deeper than 64 levels, which later copies and dumps would overflow the stack with.
+/// Parses text from outside. Throws the JSON library's exception for text that is not JSON, and
+/// std::length_error for more than 64 levels, with which later copies and dumps would overflow the stack, and
+/// for more than five million values.
 JSON parseJson(std::string_view text);
 
 /// Serialises; bytes that are not UTF-8 are replaced instead of throwing.

@@ -1,5 +1,6 @@
 #include "json.h"
 
+#include <QElapsedTimer>
 #include <QTest>
 
 #include <nlohmann/json.hpp>
@@ -12,6 +13,7 @@ private slots:
     void nesting();
     void refusesWhatIsNoJson_data();
     void refusesWhatIsNoJson();
+    void takesAsLongAsTheTextIs();
     void dumpReplacesWhatIsNoUtf8();
 };
 
@@ -33,6 +35,8 @@ void TestJson::nesting_data() {
     QTest::newRow("65 objects") << nested(65, R"({"a":)", "}") << false;
     QTest::newRow("a million arrays, never closed") << std::string(1000000, '[') << false;
     QTest::newRow("many values side by side") << "[" + nested(1000, "[],", "") + "]" << true;
+    QTest::newRow("brackets in strings")
+        << R"(["\"\\)" + std::string(100, '[') + R"(","\\",{"{[":1}])" << true;
 }
 
 void TestJson::nesting() {
@@ -56,6 +60,20 @@ void TestJson::refusesWhatIsNoJson_data() {
 void TestJson::refusesWhatIsNoJson() {
     QFETCH(std::string, text);
     QVERIFY_THROWS_EXCEPTION(JSON::parse_error, parseJson(text));
+}
+
+/// Siblings by the hundred thousand took minutes each when every end of an object walked all of them.
+void TestJson::takesAsLongAsTheTextIs() {
+    std::string text = "[";
+    while (text.size() < 4u << 20)
+        text += "{},";
+    QElapsedTimer timer;
+    timer.start();
+    QCOMPARE(parseJson(text + "{}]").size(), text.size() / 3 + 1);
+    QVERIFY2(timer.elapsed() < 5000, qPrintable(QString::number(timer.elapsed())));
+    while (text.size() < 16u << 20)
+        text += "0,";
+    QVERIFY_THROWS_EXCEPTION(std::length_error, parseJson(text + "0]"));
 }
 
 void TestJson::dumpReplacesWhatIsNoUtf8() {
