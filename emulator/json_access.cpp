@@ -9,7 +9,7 @@ namespace emulator {
 namespace {
 
 constexpr int deepest = 64;
-constexpr std::int64_t largestPage = 1000;
+constexpr std::int64_t maxPageSize = 2000;
 
 /// Copying and writing a JSON value recurse, so the nesting is bounded before anything is built.
 bool nestsTooDeeply(std::string_view text) {
@@ -122,7 +122,7 @@ Page pageOf(const Json &body) {
     if (count < 0) {
         refuseMember("count");
     }
-    return {static_cast<std::size_t>(start), static_cast<std::size_t>(std::min(count, largestPage))};
+    return {static_cast<std::size_t>(start), static_cast<std::size_t>(std::min(count, maxPageSize))};
 }
 
 } // namespace emulator

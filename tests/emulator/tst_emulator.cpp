@@ -8,6 +8,8 @@
 #include <QRegularExpression>
 #include <QTest>
 
+#include <httplib.h>
+#include <openssl/x509_vfy.h>
 #include <sqlite3.h>
 
 #include <set>
@@ -46,6 +48,15 @@ QString stateOf(const QString &root) {
     return last;
 }
 
+/// How the certificate that the server shows stands to the one in the file.
+long verifyCertificate(int port, const QString &file) {
+    httplib::SSLClient client("127.0.0.1", port);
+    client.enable_server_certificate_verification(true);
+    client.set_ca_cert_path(QFile::encodeName(file).constData());
+    client.Get("/");
+    return client.get_openssl_verify_result();
+}
+
 ServiceCaller admin(const EmulatorProcess &emulator) {
     ServiceCaller caller(emulator.port());
     caller.login("admin", "admin");
@@ -79,6 +90,7 @@ private slots:
     void sameSeed_data();
     void sameSeed();
     void oddRecords();
+    void pageSize();
     void commands();
 };
 
@@ -169,6 +181,8 @@ void EmulatorTest::survives() {
     const Json sites = first.list("/v1/site/list");
     const Json settings = first.call("/v1/config/get").data;
     const Json accounts = first.post("/v1/accm/list", {{"start", 0}, {"count", 10}}).data;
+    const QString certificate = emulator.root() + "/../certificate.pem";
+    QVERIFY(QFile::copy(emulator.root() + "/nvldm-emulator.pem", certificate));
     crash ? emulator.kill() : static_cast<void>(emulator.stop());
 
     QVERIFY(emulator.start({"--devices", "3", "--sites", "1", "--seed", "99"}));
@@ -183,6 +197,7 @@ void EmulatorTest::survives() {
     COMPARE_JSON(get("/v1/dstatus/list"), statuses);
     COMPARE_JSON(get("/v1/site/list"), sites);
     COMPARE_JSON(get("/v1/config/get"), settings);
+    QCOMPARE(verifyCertificate(emulator.port(), certificate), long{X509_V_OK});
     QVERIFY(emulator.command("counts").startsWith("ok devices=19 "));
     QVERIFY(emulator.diagnostics().contains("keeps the 19 devices"));
 }
@@ -249,6 +264,14 @@ void EmulatorTest::oddRecords() {
     }));
     // What the service itself handed out it takes back.
     QCOMPARE(caller.call("/v1/dev/commit", {{"state", "all"}, {"devices", devices}}).code, 0);
+}
+
+void EmulatorTest::pageSize() {
+    EmulatorProcess emulator;
+    QVERIFY(emulator.start({"--devices", "2100"}));
+    ServiceCaller caller = admin(emulator);
+    QCOMPARE(caller.list("/v1/dev/list", 2000).size(), std::size_t{2100});
+    QCOMPARE(caller.call("/v1/dev/list", {{"start", 0}, {"count", 5000}}).data.size(), std::size_t{2000});
 }
 
 void EmulatorTest::commands() {
