@@ -58,13 +58,14 @@ void logDefect(const httplib::Request &request, const std::exception_ptr &defect
 
 } // namespace
 
-HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &stop, const ServerRules &rules)
+HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &stop, const ServerRules &rules,
+                         ServerIdentity identity)
     : m_service(service),
       m_faults(faults),
       m_stop(stop),
       m_latencyMs(rules.latencyMs),
       m_limits(rules.limits),
-      m_identity(makeServerIdentity()),
+      m_identity(std::move(identity)),
       m_dispatcher(std::make_unique<Dispatcher>(service)),
       m_server(std::make_unique<httplib::SSLServer>(m_identity.certificate.get(), m_identity.key.get())) {
     if (!m_server->is_valid()) {

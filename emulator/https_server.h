@@ -33,7 +33,8 @@ struct ServerRules {
 /// Takes requests over HTTPS and answers them, badly where a fault says so.
 class HttpsServer {
 public:
-    HttpsServer(Service &service, Faults &faults, const StopSignal &stop, const ServerRules &rules);
+    HttpsServer(Service &service, Faults &faults, const StopSignal &stop, const ServerRules &rules,
+                ServerIdentity identity);
     ~HttpsServer();
 
     /// Listens on the port; for 0 on the last one if it is still free, or on any. Gives the port; throws

@@ -65,7 +65,8 @@ int serve(const emulator::Options &options) {
     emulator::ServerRules rules;
     rules.latencyMs = options.latencyMs;
     rules.limits.upload = options.uploadLimit;
-    emulator::HttpsServer server(service, faults, stop, rules);
+    emulator::HttpsServer server(service, faults, stop, rules,
+                                 emulator::loadServerIdentity(files.identityPath()));
     const int port = server.bind(options.host, options.port, files.lastPort());
     files.writePort(port);
     files.writeRunning();

@@ -21,6 +21,7 @@ Place and store
   --host ADDRESS        address to listen on (127.0.0.1)
   --port N              port to listen on; 0: that of the last run, or a free one (0)
   --fresh               throw an existing store away; without it the store's fleet is kept
+The server's key and certificate are kept as nvldm-emulator.pem in DIR; it makes others when that is missing.
 Fleet
   --devices N           devices of a new fleet (500)
   --sites N             sites of a new fleet (12)

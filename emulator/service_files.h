@@ -15,6 +15,8 @@ public:
 
     std::filesystem::path storePath() const { return m_folder / "nvldm-emulator.sdb"; }
     void discardStore() const;
+    /// The server's key and certificate; without the file the next run makes others.
+    std::filesystem::path identityPath() const { return m_folder / "nvldm-emulator.pem"; }
 
     /// The port of the last run, or 0 where there was none.
     int lastPort() const;
