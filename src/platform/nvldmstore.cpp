@@ -1,16 +1,20 @@
 #include "nvldmstore.h"
 
 #include "privatefiles.h"
+#include "storerescue.h"
+#include "storetrouble.h"
 
 #include <QDateTime>
 #include <QDebug>
 #include <QFile>
 #include <QFileInfo>
+#include <QUrl>
 
 #include <SQLiteCpp/SQLiteCpp.h>
 #include <nlohmann/json.hpp>
 #include <sqlite3.h>
 
+#include <chrono>
 #include <map>
 #include <memory>
 #include <mutex>
@@ -24,12 +28,16 @@ namespace {
 
 constexpr int busyMilliseconds = 5000;
 
-enum class Access { Read, Write };
+/// After a repair that failed, the next attempt waits: it reads the whole file.
+constexpr auto repairPause = std::chrono::minutes(1);
 
 /// One store file of this process: its lock, and its connections once they were needed.
 struct StoreFile {
     std::mutex mutex;
     std::unique_ptr<SQLite::Database> writer;
+    bool own = false;
+    std::map<std::string, std::string> tables; ///< the columns of those that were created, by name
+    std::chrono::steady_clock::time_point nextRepair;
 };
 
 StoreFile &storeFile(const std::string &path) {
@@ -55,7 +63,7 @@ SQLite::Database &writer(StoreFile &file, const std::string &path) {
         file.writer.reset();
     if (!file.writer) {
         if (!PrivateFiles::ensureFile(name))
-            throw std::runtime_error("store file cannot be created");
+            throw SQLite::Exception("store file cannot be created", SQLITE_CANTOPEN);
         auto database = std::make_unique<SQLite::Database>(path, SQLite::OPEN_READWRITE, busyMilliseconds);
         keepLogAtClose(*database, true);
         database->exec("PRAGMA journal_mode=WAL");
@@ -70,32 +78,123 @@ bool isDamage(const SQLite::Exception &error) {
     return error.getErrorCode() == SQLITE_NOTADB || error.getErrorCode() == SQLITE_CORRUPT;
 }
 
-/// The damaged file keeps its contents, and what was not written back to it yet, under another name: somebody
-/// may still want to rescue them.
-void setAside(StoreFile &file, const std::string &path) {
+/// A full disk, a folder without permission: nothing that a repair could mend.
+bool isRefusal(const SQLite::Exception &error) {
+    const int code = error.getErrorCode();
+    return code == SQLITE_FULL || code == SQLITE_IOERR || code == SQLITE_CANTOPEN ||
+           code == SQLITE_READONLY || code == SQLITE_PERM || code == SQLITE_AUTH;
+}
+
+/// Table names are words of the program; quoting them keeps a mistake from becoming another statement.
+std::string quoted(const std::string &name) {
+    std::string text = "\"";
+    for (const char character : name)
+        text += character == '"' ? std::string("\"\"") : std::string(1, character);
+    return text + '"';
+}
+
+std::string creation(const std::string &table, const std::string &columns) {
+    return "CREATE TABLE IF NOT EXISTS " + quoted(table) + " (" + columns + ")";
+}
+
+/// Makes a new file beside the damaged one with what can be read of it.
+int rescue(const StoreFile &file, const std::string &path, const std::string &fresh) {
+    const QString name = QString::fromStdString(fresh);
+    if (!PrivateFiles::ensureFile(name))
+        throw std::runtime_error("store file cannot be created");
+    SQLite::Database target(fresh, SQLite::OPEN_READWRITE, busyMilliseconds);
+    const int rows = StoreRescue::copyReadableRows(path, target);
+    for (const auto &[table, columns] : file.tables)
+        target.exec(creation(table, columns));
+    return rows;
+}
+
+/// Puts the new file in the place of the damaged one. That keeps its contents, and what was not written back
+/// to it yet, under another name: somebody may still want to look at them.
+bool swap(const QString &name, const QString &fresh, const QString &aside) {
+    if (!QFile::rename(name, aside))
+        return false;
+    const QString log = name + QStringLiteral("-wal");
+    if (QFileInfo(log).size() > 0)
+        QFile::rename(log, aside + QStringLiteral("-wal"));
+    else
+        QFile::remove(log);
+    QFile::remove(name + QStringLiteral("-shm"));
+    if (QFile::rename(fresh, name))
+        return true;
+    QFile::rename(aside + QStringLiteral("-wal"), name + QStringLiteral("-wal"));
+    QFile::rename(aside, name);
+    return false;
+}
+
+bool repair(StoreFile &file, const std::string &path) {
+    const auto now = std::chrono::steady_clock::now();
+    if (now < file.nextRepair)
+        return false;
+    file.nextRepair = now + repairPause;
+    if (file.writer)
+        keepLogAtClose(*file.writer, true);
     file.writer.reset();
     const QString name = QString::fromStdString(path);
     const QString aside = name + QStringLiteral(".damaged-") +
                           QDateTime::currentDateTimeUtc().toString(QStringLiteral("yyyyMMddhhmmsszzz"));
-    const bool moved = QFile::rename(name, aside);
-    if (moved) {
-        QFile::rename(name + QStringLiteral("-wal"), aside + QStringLiteral("-wal"));
-        QFile::remove(name + QStringLiteral("-shm"));
+    const QString fresh = aside + QStringLiteral(".new");
+    std::string reason = "it cannot be renamed";
+    try {
+        const int rows = rescue(file, path, fresh.toStdString());
+        if (swap(name, fresh, aside)) {
+            file.nextRepair = {};
+            qWarning("Store file %s is damaged; it was set aside as %s, and %d entries could be read",
+                     qUtf8Printable(name), qUtf8Printable(aside), rows);
+            StoreTrouble::report({StoreTrouble::Kind::Repaired, name, aside, rows});
+            return true;
+        }
+    } catch (const std::exception &error) {
+        reason = error.what();
     }
-    qWarning("Store file %s is damaged; %s %s", qUtf8Printable(name),
-             moved ? "it was set aside as" : "it could not be renamed to", qUtf8Printable(aside));
+    QFile::remove(fresh);
+    qWarning("Store file %s is damaged and could not be repaired: %s", qUtf8Printable(name), reason.c_str());
+    StoreTrouble::report({StoreTrouble::Kind::Unrepaired, name, {}, 0});
+    return false;
+}
+
+/// Runs an operation, and once more after a repair.
+template <typename Operation>
+void runRepairing(StoreFile &file, const std::string &path, Operation &operation) {
+    try {
+        operation(file);
+    } catch (const SQLite::Exception &error) {
+        if (!isDamage(error) || !file.own || !repair(file, path))
+            throw;
+        operation(file);
+    }
+}
+
+enum class Access { Read, Write };
+
+void reportRefusal(const StoreFile &file, Access access, const char *path) {
+    if (!file.own || (access == Access::Read && !QFileInfo::exists(QString::fromUtf8(path))))
+        return;
+    const auto kind =
+        access == Access::Read ? StoreTrouble::Kind::Unreadable : StoreTrouble::Kind::Unwritable;
+    StoreTrouble::report({kind, QString::fromUtf8(path), {}, 0});
 }
 
 /// Runs an operation under the file's lock and turns every failure into a log line and 1.
 template <typename Operation>
-int guarded(const char *name, const char *path, Operation operation) {
+int guarded(const char *name, Access access, const char *path, Operation operation) {
     if (!path || !*path)
         return 1;
     StoreFile &file = storeFile(path);
     const std::lock_guard lock(file.mutex);
+    file.own = file.own || access == Access::Write;
     try {
-        operation(file);
+        runRepairing(file, path, operation);
         return 0;
+    } catch (const SQLite::Exception &error) {
+        qWarning("Store %s failed for %s: %s", name, path, error.what());
+        if (isRefusal(error))
+            reportRefusal(file, access, path);
     } catch (const std::exception &error) {
         qWarning("Store %s failed for %s: %s", name, path, error.what());
     } catch (...) {
@@ -128,14 +227,6 @@ std::optional<std::vector<std::string>> parseValues(const std::string &text) {
         if (text[at++] != ',')
             return std::nullopt;
     }
-}
-
-/// Table names are words of the program; quoting them keeps a mistake from becoming another statement.
-std::string quoted(const char *name) {
-    std::string text = "\"";
-    for (; name && *name; ++name)
-        text += *name == '"' ? std::string("\"\"") : std::string(1, *name);
-    return text + '"';
 }
 
 std::string placeholders(std::size_t count) {
@@ -174,36 +265,53 @@ nlohmann::json readRows(SQLite::Database &database, const char *table, const cha
     return rows;
 }
 
+/// Opens a file beside which no log can be kept, as on a full disk. A log that is there is read into memory,
+/// which needs the file for this connection alone; without one the file is complete as it stands.
+SQLite::Database openWithoutLog(const std::string &path) {
+    const QString name = QString::fromStdString(path);
+    if (QFileInfo(name + QStringLiteral("-wal")).size() == 0) {
+        const QByteArray url = QUrl::fromLocalFile(name).toEncoded() + "?immutable=1";
+        return {url.toStdString(), SQLite::OPEN_READONLY | SQLite::OPEN_URI, busyMilliseconds};
+    }
+    SQLite::Database database(path, SQLite::OPEN_READWRITE, busyMilliseconds);
+    keepLogAtClose(database, true);
+    database.exec("PRAGMA locking_mode=EXCLUSIVE");
+    return database;
+}
+
+nlohmann::json queryRows(const StoreFile &file, const char *path, const char *table, const char *condition) {
+    if (file.writer)
+        return readRows(*file.writer, table, condition);
+    try {
+        SQLite::Database reader(path, SQLite::OPEN_READONLY, busyMilliseconds);
+        return readRows(reader, table, condition);
+    } catch (const SQLite::Exception &error) {
+        if (!file.own || !isRefusal(error))
+            throw;
+    }
+    SQLite::Database reader = openWithoutLog(path);
+    return readRows(reader, table, condition);
+}
+
 } // namespace
 
 int createDBTable(const char *file, const char *table, const char *columns) {
-    return guarded("createDBTable", file, [&](StoreFile &store) {
-        const std::string statement =
-            "CREATE TABLE IF NOT EXISTS " + quoted(table) + " (" + (columns ? columns : "") + ")";
-        try {
-            writer(store, file).exec(statement);
-        } catch (const SQLite::Exception &error) {
-            if (!isDamage(error))
-                throw;
-            setAside(store, file);
-            writer(store, file).exec(statement);
-        }
+    return guarded("createDBTable", Access::Write, file, [&](StoreFile &store) {
+        store.tables[table] = columns;
+        writer(store, file).exec(creation(table, columns));
     });
 }
 
 int queryData(const char *file, const char *table, const char *condition, std::string &result) {
     result.clear();
-    return guarded("queryData", file, [&](StoreFile &store) {
-        std::optional<SQLite::Database> reader;
-        if (!store.writer)
-            reader.emplace(file, SQLite::OPEN_READONLY, busyMilliseconds);
-        result = readRows(reader ? *reader : *store.writer, table, condition)
+    return guarded("queryData", Access::Read, file, [&](StoreFile &store) {
+        result = queryRows(store, file, table, condition)
                      .dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
     });
 }
 
 int replaceData(const char *file, const char *table, const char *values) {
-    return guarded("replaceData", file, [&](StoreFile &store) {
+    return guarded("replaceData", Access::Write, file, [&](StoreFile &store) {
         const std::optional<std::vector<std::string>> texts = parseValues(values ? values : "");
         if (!texts)
             throw std::invalid_argument("values are not a list of quoted texts");
@@ -216,7 +324,7 @@ int replaceData(const char *file, const char *table, const char *values) {
 }
 
 int insertListData(const char *file, const char *table, const char *rows) {
-    return guarded("insertListData", file, [&](StoreFile &store) {
+    return guarded("insertListData", Access::Write, file, [&](StoreFile &store) {
         const nlohmann::json list = nlohmann::json::parse(rows ? rows : "");
         if (!list.is_array())
             throw std::invalid_argument("rows are not an array");
@@ -237,7 +345,7 @@ int insertListData(const char *file, const char *table, const char *rows) {
 }
 
 int replaceTable(const char *file, const char *source, const char *target) {
-    return guarded("replaceTable", file, [&](StoreFile &store) {
+    return guarded("replaceTable", Access::Write, file, [&](StoreFile &store) {
         SQLite::Database &database = writer(store, file);
         SQLite::Transaction transaction(database);
         database.exec("DELETE FROM " + quoted(target));

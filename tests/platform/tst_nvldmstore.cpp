@@ -2,6 +2,7 @@
 #include "logcapture.h"
 #include "nvldmstore.h"
 #include "secondlife.h"
+#include "storetrouble.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -10,9 +11,13 @@
 
 #include <nlohmann/json.hpp>
 #include <sqlite3.h>
+#include <sys/resource.h>
 #include <unistd.h>
 
+#include <csignal>
+#include <functional>
 #include <future>
+#include <map>
 #include <thread>
 
 using Json = nlohmann::json;
@@ -24,6 +29,7 @@ constexpr const char *keyColumns = "key TEXT PRIMARY KEY, value TEXT";
 constexpr const char *listColumns = "id TEXT PRIMARY KEY, name TEXT";
 constexpr const char *table = "mainT";
 constexpr const char *scratch = "tempMainT";
+constexpr int manyRows = 300;
 
 int replaceValue(const QByteArray &file, const std::string &key, const std::string &value) {
     const QByteArray doubled = QByteArray::fromStdString(value).replace('\'', "''");
@@ -48,6 +54,36 @@ int writeAndWait(const QByteArray &file) {
     if (replaceValue(file, "k", "written") == 0)
         SecondLife::reportAndWait("written");
     return 1;
+}
+
+QString longValue(int row) {
+    return QStringLiteral("value-%1-").arg(row).leftJustified(300, QLatin1Char('x'));
+}
+
+/// Fills a file of many pages and leaves it closed, or with its log beside it.
+int fillAndEnd(const QByteArray &file, bool closed) {
+    createDBTable(file.constData(), table, keyColumns);
+    Json list = Json::array();
+    for (int row = 0; row < manyRows; ++row)
+        list.push_back({{"key", std::to_string(row)}, {"value", longValue(row).toStdString()}});
+    insertListData(file.constData(), table, list.dump().c_str());
+    if (!closed)
+        SecondLife::reportAndWait("filled");
+    return 0;
+}
+
+/// Uses a file on a disk that takes nothing more.
+int useWithoutRoom(const QByteArray &file) {
+    std::signal(SIGXFSZ, SIG_IGN);
+    const rlimit none{0, 0};
+    ::setrlimit(RLIMIT_FSIZE, &none);
+    int told = 0;
+    StoreTrouble::setReceiver(
+        [&](const StoreTrouble::Report &report) { told += report.kind == StoreTrouble::Kind::Unwritable; });
+    const bool refused =
+        createDBTable(file.constData(), table, keyColumns) == 1 && replaceValue(file, "k", "new") == 1;
+    const bool readable = Json::parse(rows(file)).size() == manyRows;
+    return refused && readable && told == 1 ? 0 : 1;
 }
 
 /// Tries to write as a user who may only read: the super user may always write.
@@ -92,6 +128,10 @@ private slots:
     void interruptedFillIsForgotten();
     void damagedFileIsSetAside_data();
     void damagedFileIsSetAside();
+    void readableRowsAreRescued_data();
+    void readableRowsAreRescued();
+    void fullDiskIsNoDamage_data();
+    void fullDiskIsNoDamage();
     void removedFileIsBegunAnew();
     void unwritableFile();
     void waitsForAnotherConnection();
@@ -100,6 +140,11 @@ private slots:
     void filesAreOfTheUserAlone();
 
 private:
+    void fill(bool closed) const;
+    QStringList setAside() const {
+        return QDir(m_root.path()).entryList({QFileInfo(m_file).fileName() + ".damaged-*"});
+    }
+
     IsolatedRoot m_root;
     QByteArray m_file;
     int m_files = 0;
@@ -229,11 +274,92 @@ void TestNvldmStore::damagedFileIsSetAside() {
     QCOMPARE(createDBTable(m_file.constData(), table, keyColumns), 0);
     QCOMPARE(replaceValue(m_file, "k", "v"), 0);
     QCOMPARE(rows(m_file), R"([{"key":"k","value":"v"}])");
-    QStringList aside = QDir(m_root.path()).entryList({name + ".damaged-*"});
+    QStringList aside = setAside();
     QCOMPARE(m_root.read(aside.takeLast()), "what was not written back yet");
     QCOMPARE(aside.size(), 1);
     QCOMPARE(m_root.read(aside[0]), contents);
     QCOMPARE(log.count(aside[0]), 1);
+}
+
+void TestNvldmStore::fill(bool closed) const {
+    QProcess writer;
+    SecondLife::start(writer, {closed ? "fill" : "fillAndWait", m_file});
+    if (!closed) {
+        QVERIFY(SecondLife::waitForLine(writer, "filled"));
+        writer.kill();
+    }
+    QVERIFY(writer.waitForFinished());
+    QVERIFY(!closed || !QFile::exists(m_file + "-wal"));
+}
+
+void TestNvldmStore::readableRowsAreRescued_data() {
+    using Operation = std::function<int(const QByteArray &)>;
+    QTest::addColumn<QByteArrayList>(
+        "damaged");                // texts whose pages are overwritten; none: the end is cut off
+    QTest::addColumn<int>("lost"); // rows at most
+    QTest::addColumn<Operation>("operation");
+    const Operation query = [](const QByteArray &file) { return rows(file) == "failed" ? 1 : 0; };
+    const Operation replace = [](const QByteArray &file) { return replaceValue(file, "10", "new"); };
+    const Operation fillList = [](const QByteArray &file) {
+        return insertListData(file.constData(), table, R"([{"key":"1","value":"a"}])");
+    };
+    QTest::newRow("query") << QByteArrayList{"value-150-"} << 20 << query;
+    QTest::newRow("replace") << QByteArrayList{"value-10-"} << 20 << replace;
+    QTest::newRow("list") << QByteArrayList{"value-10-"} << manyRows << fillList;
+    QTest::newRow("several pages") << QByteArrayList{"value-10-", "value-150-", "value-290-"} << 60 << query;
+    QTest::newRow("end cut off") << QByteArrayList{} << 60 << query;
+}
+
+void TestNvldmStore::readableRowsAreRescued() {
+    constexpr int pageSize = 4096;
+    QFETCH(QByteArrayList, damaged);
+    QFETCH(int, lost);
+    QFETCH(std::function<int(const QByteArray &)>, operation);
+    fill(true);
+    const QString name = QFileInfo(m_file).fileName();
+    QByteArray contents = m_root.read(name);
+    for (const QByteArray &text : damaged) {
+        const qsizetype found = contents.indexOf(text);
+        QVERIFY(found > pageSize);
+        contents.replace(found / pageSize * pageSize, pageSize, QByteArray(pageSize, '\xff'));
+    }
+    if (damaged.isEmpty())
+        contents.chop(4 * pageSize);
+    QVERIFY(m_root.write(name, contents));
+
+    std::vector<StoreTrouble::Report> told;
+    StoreTrouble::setReceiver([&](const StoreTrouble::Report &report) {
+        if (report.file == QString::fromUtf8(m_file))
+            told.push_back(report);
+    });
+    const LogCapture log;
+    QCOMPARE(createDBTable(m_file.constData(), table, keyColumns), 0);
+    QCOMPARE(operation(m_file), 0);
+    QCOMPARE(replaceValue(m_file, "200", "later"), 0);
+    StoreTrouble::setReceiver({});
+    const Json kept = Json::parse(rows(m_file));
+    QVERIFY2(static_cast<int>(kept.size()) >= manyRows - lost, std::to_string(kept.size()).c_str());
+    for (const Json &row : kept)
+        QVERIFY(row["value"].get<std::string>().size() == 300 || row["key"] == "200" || lost == manyRows ||
+                row["key"] == "10");
+    QCOMPARE(m_root.read(setAside().value(0)), contents);
+    QCOMPARE(setAside().size(), 1);
+    QCOMPARE(told.size(), std::size_t{1});
+    QVERIFY(told[0].kind == StoreTrouble::Kind::Repaired && told[0].keptAs.endsWith(setAside()[0]));
+}
+
+void TestNvldmStore::fullDiskIsNoDamage_data() {
+    QTest::addColumn<bool>("closed");
+    QTest::newRow("closed file") << true;
+    QTest::newRow("file with its log") << false;
+}
+
+void TestNvldmStore::fullDiskIsNoDamage() {
+    QFETCH(bool, closed);
+    fill(closed);
+    QCOMPARE(SecondLife::run({"noRoom", m_file}).status, 0);
+    QVERIFY(setAside().isEmpty());
+    QCOMPARE(Json::parse(rows(m_file)).size(), std::size_t{manyRows});
 }
 
 void TestNvldmStore::removedFileIsBegunAnew() {
@@ -328,7 +454,13 @@ int main(int argc, char *argv[]) {
     if (SecondLife::isSecondLife(argc, argv)) {
         const QStringList arguments = SecondLife::arguments(argc, argv);
         const QByteArray file = arguments.value(1).toUtf8();
-        return arguments.value(0) == "write" ? writeAndWait(file) : writeAsStranger(file);
+        const std::map<QString, std::function<int()>> scenes = {
+            {"write", [&] { return writeAndWait(file); }},
+            {"stranger", [&] { return writeAsStranger(file); }},
+            {"fill", [&] { return fillAndEnd(file, true); }},
+            {"fillAndWait", [&] { return fillAndEnd(file, false); }},
+            {"noRoom", [&] { return useWithoutRoom(file); }}};
+        return scenes.at(arguments.value(0))();
     }
     TestNvldmStore test;
     return QTest::qExec(&test, argc, argv);
