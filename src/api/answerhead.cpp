@@ -54,7 +54,8 @@ void AnswerHead::onMessage(int isSent, int, int type, const void *bytes, std::si
                            void *head) {
     auto *self = static_cast<AnswerHead *>(head);
     self->m_session = session;
-    if (isSent || type != SSL3_RT_HEADER || !SSL_is_init_finished(session))
+    self->m_established = self->m_established || SSL_is_init_finished(session);
+    if (isSent || type != SSL3_RT_HEADER || !self->m_established)
         return;
     const auto *recordHead = static_cast<const unsigned char *>(bytes);
     self->addRecord(recordHead[3] * 256u + recordHead[4], session);

@@ -16,6 +16,9 @@ public:
     /// The head is complete; the body has a limit of its own.
     void lift() { m_lifted = true; }
 
+    /// The connection; null before the handshake.
+    SSL *session() const { return m_session; }
+
     /// The status with which the service refuses a request that is not sent yet; 0 while it does not. Nothing
     /// is taken from the connection.
     int earlyRefusal() const;
@@ -27,5 +30,6 @@ private:
 
     SSL *m_session = nullptr;
     std::size_t m_received = 0;
+    bool m_established = false; ///< the first handshake is complete; a later one lifts no limit
     bool m_lifted = false;
 };

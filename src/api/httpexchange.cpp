@@ -5,17 +5,23 @@
 #include "clientidentity.h"
 #include "downloadtarget.h"
 #include "requestdeadline.h"
+#include "responsebody.h"
 #include "transfererror.h"
 
 #include <httplib.h>
 #include <openssl/err.h>
 
+#include <QByteArray>
+
+#include <limits>
 #include <memory>
 #include <optional>
 
 namespace {
 
-constexpr std::size_t bodyLimit = 64u << 20;
+constexpr std::uint64_t bodyLimit = 64u << 20;
+constexpr std::uint64_t fileLimit = 4ull << 30;
+constexpr std::chrono::seconds readWait{5};
 constexpr int tooLarge = 413;
 constexpr std::chrono::seconds transportGrace{5};
 
@@ -46,6 +52,7 @@ void limitUnsent([[maybe_unused]] socket_t socket) {
 void configure(httplib::SSLClient &client, const HttpRequest &request, RequestDeadline &deadline) {
     client.enable_server_certificate_verification(false);
     SSL_CTX_set_min_proto_version(client.ssl_context(), TLS1_2_VERSION);
+    SSL_CTX_set_options(client.ssl_context(), SSL_OP_NO_RENEGOTIATION);
     client.set_decompress(false);
     client.set_tcp_nodelay(true);
     client.set_socket_options([&deadline, isTransfer = request.transfer != nullptr](socket_t socket) {
@@ -66,35 +73,64 @@ void configure(httplib::SSLClient &client, const HttpRequest &request, RequestDe
     }
 }
 
-/// The answer as it comes in.
+std::chrono::milliseconds waitOf(const HttpRequest &request) {
+    if (request.transfer)
+        return request.totalTimeout + transportGrace;
+    return request.waitTimeout.count() > 0 ? request.waitTimeout : readWait;
+}
+
+ResponseBody::Framing framingOf(const httplib::Response &response) {
+    using Length = ResponseBody::Length;
+    constexpr int noContent = 204;
+    constexpr int notModified = 304;
+    if (response.status == noContent || response.status == notModified)
+        return {Length::Known, 0};
+    if (QByteArray::fromStdString(response.get_header_value("Transfer-Encoding")).toLower() == "chunked")
+        return {Length::Chunked, 0};
+    if (!response.has_header("Content-Length"))
+        return {};
+    bool isNumber = false;
+    const QByteArray length = QByteArray::fromStdString(response.get_header_value("Content-Length"));
+    const qulonglong bytes = length.toULongLong(&isNumber);
+    return {Length::Known, isNumber ? bytes : std::numeric_limits<std::uint64_t>::max()};
+}
+
+/// The body of the answer as it comes in.
 class Receiver {
 public:
     Receiver(const HttpRequest &request, HttpAnswer &answer, RequestDeadline &deadline)
         : m_request(request), m_answer(answer), m_deadline(deadline) {}
 
-    void start(const httplib::Response &response) {
+    void receive(const httplib::Response &response, SSL *session) {
+        const ResponseBody::Framing framing = framingOf(response);
         m_answer.isFile = m_request.target && response.status == 200 &&
                           response.get_header_value("Content-Type").starts_with("application/octet-stream");
-        if (!m_answer.isFile)
-            return;
-        // Without either of them a connection that broke would pass for the end of the file.
-        m_isBounded = response.has_header("Content-Length") ||
-                      response.get_header_value("Transfer-Encoding") == "chunked";
-        m_request.transfer->begin(response.get_header_value<std::uint64_t>("Content-Length"));
+        if (m_answer.isFile) {
+            // Without a length a connection that broke would pass for the end of the file.
+            if (framing.kind == ResponseBody::Length::UntilClose)
+                return;
+            m_request.transfer->begin(framing.length);
+        }
+        ResponseBody body(session, waitOf(m_request), m_answer.isFile ? fileLimit : bodyLimit,
+                          [this](const char *bytes, std::size_t length) { return take(bytes, length); });
+        m_end = body.read(framing);
     }
 
+    bool isWhole() const { return m_end == ResponseBody::End::Whole; }
+    /// The transport's name of what went wrong.
+    std::string error() const {
+        return httplib::to_string(m_end == ResponseBody::End::Lost ? httplib::Error::Read
+                                                                   : httplib::Error::Canceled);
+    }
+
+private:
     bool take(const char *bytes, std::size_t length) {
         if (m_answer.isFile)
-            return m_isBounded && takeOfFile(bytes, length);
-        if (m_answer.body.size() + length > bodyLimit)
-            return false;
+            return takeOfFile(bytes, length);
         m_answer.body.append(bytes, length);
         return true;
     }
 
-    bool isWhole() const { return !m_answer.isFile || m_isBounded; }
-
-private:
     bool takeOfFile(const char *bytes, std::size_t length) {
         m_received += length;
         m_deadline.restart();
@@ -106,7 +142,7 @@ private:
     HttpAnswer &m_answer;
     RequestDeadline &m_deadline;
     std::uint64_t m_received = 0;
-    bool m_isBounded = false;
+    ResponseBody::End m_end = ResponseBody::End::Refused;
 };
 
 /// What is to be said of a request without an answer; of a transfer, also to whoever watches it.
@@ -160,14 +196,15 @@ private:
         httplib::Request message = messageOf(m_request);
         if (m_request.form)
             m_sender.emplace(*m_request.form, *m_request.transfer, m_deadline, m_head).attach(message);
+        // The body is read here, within its limits, and not by the transport, which takes this for a refusal.
         message.response_handler = [this](const httplib::Response &response) {
             m_head.lift();
-            m_receiver.start(response);
             m_headStatus = response.status;
-            return !m_request.headOnly;
+            m_answer.authorization = response.get_header_value("Authorization");
+            if (!m_request.headOnly)
+                m_receiver.receive(response, m_head.session());
+            return false;
         };
-        message.content_receiver = [this](const char *data, std::size_t length, std::uint64_t,
-                                          std::uint64_t) { return m_receiver.take(data, length); };
         return message;
     }
 
@@ -176,13 +213,11 @@ private:
             m_sender->rethrow();
         if (m_sender && m_sender->refusal() != 0)
             return arrived(m_sender->refusal());
-        if (m_request.headOnly && m_headStatus != 0)
-            return arrived(m_headStatus);
-        if (!result || !m_receiver.isWhole())
-            return failed(m_request, m_deadline.isOver(),
-                          result ? "No length" : httplib::to_string(result.error()));
-        m_answer.authorization = result->get_header_value("Authorization");
-        return arrived(result->status);
+        if (m_headStatus == 0)
+            return failed(m_request, m_deadline.isOver(), httplib::to_string(result.error()));
+        if (!m_request.headOnly && !m_receiver.isWhole())
+            return failed(m_request, m_deadline.isOver(), m_receiver.error());
+        return arrived(m_headStatus);
     }
 
     HttpAnswer arrived(int status) {

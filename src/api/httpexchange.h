@@ -38,7 +38,7 @@ struct HttpAnswer {
     std::string loggedBody() const { return body.substr(0, 4096); }
 };
 
-/// Opens a connection, sends the request, reads the answer (64 MiB of body at most) and closes. Blocks; any
-/// thread whose stack has 64 MiB, which a hostile status line needs. Throws
-/// what allocation throws, and for a transfer TransferError; how it failed otherwise is told to the transfer.
+/// Opens a connection, sends the request, reads the answer (64 MiB of body at most, 4 GiB of a file) and
+/// closes. Blocks; any thread whose stack has 64 MiB, which a hostile status line needs. Throws what
+/// allocation throws, and for a transfer TransferError; how it failed otherwise is told to the transfer.
 HttpAnswer exchangeHttp(const HttpRequest &request);

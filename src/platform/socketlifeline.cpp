@@ -5,6 +5,8 @@
 #ifdef _WIN32
 #include <winsock2.h>
 #else
+#include <cerrno>
+
 #include <poll.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -31,9 +33,9 @@ void closeHandle(long long socket) {
 
 } // namespace
 
-bool isSocketReadable(long long socket) {
+bool isSocketReadable(long long socket, std::chrono::milliseconds wait) {
     WSAPOLLFD descriptor{static_cast<SOCKET>(socket), POLLIN, 0};
-    return WSAPoll(&descriptor, 1, 0) > 0;
+    return WSAPoll(&descriptor, 1, static_cast<int>(wait.count())) > 0;
 }
 
 #else
@@ -52,9 +54,13 @@ void closeHandle(long long socket) {
 
 } // namespace
 
-bool isSocketReadable(long long socket) {
+bool isSocketReadable(long long socket, std::chrono::milliseconds wait) {
     pollfd descriptor{static_cast<int>(socket), POLLIN, 0};
-    return ::poll(&descriptor, 1, 0) > 0;
+    int ready = 0;
+    do
+        ready = ::poll(&descriptor, 1, static_cast<int>(wait.count()));
+    while (ready < 0 && errno == EINTR);
+    return ready > 0;
 }
 
 #endif

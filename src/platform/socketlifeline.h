@@ -1,7 +1,9 @@
 #pragma once
 
-/// True when a read of the socket would not wait.
-bool isSocketReadable(long long socket);
+#include <chrono>
+
+/// True when a read of the socket would not wait, or will not before the time is over.
+bool isSocketReadable(long long socket, std::chrono::milliseconds wait = {});
 
 /// Ends the traffic of a socket from another thread, whatever its owner waits for at that moment.
 ///

@@ -135,6 +135,17 @@ void TestApiClientJudging::judgesAnswers_data() {
     QTest::newRow("chunks") << ScriptedPeer::Reply{"HTTP/1.1 200 OK\r\nTransfer-Encoding: chunked\r\n\r\n"
                                                    "5\r\n{\"cod\r\n5\r\ne\":7}\r\n0\r\n\r\n"}
                             << 15u << 15u;
+    const std::string chunked = "HTTP/1.1 200 OK\r\nTransfer-Encoding: chunked\r\n\r\n5\r\n{\"cod\r\n";
+    const std::string longLine = ";" + std::string(6000, 'x') + "\r\n";
+    QTest::newRow("long line before a chunk")
+        << ScriptedPeer::Reply{chunked + "5" + longLine + "e\":7}\r\n0\r\n\r\n"} << 12u << 12u;
+    std::string many;
+    while (many.size() < bodyLimit)
+        many += "Trailer: x\r\n";
+    QTest::newRow("64 MiB after the last chunk")
+        << ScriptedPeer::Reply{chunked + "5\r\ne\":7}\r\n0\r\n" + many + "\r\n"} << 12u << 12u;
+    QTest::newRow("chunk that ends wrongly")
+        << ScriptedPeer::Reply{chunked + "5\r\ne\":7}}\r\n0\r\n\r\n"} << 12u << 12u;
     QTest::newRow("said to be compressed")
         << ScriptedPeer::Reply{ScriptedPeer::http(200, list, {"Content-Encoding: gzip"})} << 0u << 0u;
     QTest::newRow("no HTTP") << ScriptedPeer::Reply{"SSH-2.0-Server\r\n"} << 12u << 12u;
@@ -188,10 +199,15 @@ void TestApiClientJudging::longHead() {
     QFETCH(std::string, head);
     QFETCH(unsigned, result);
     const LogCapture log;
-    m_peer.answer({head + "Content-Length: 12\r\n\r\n" + R"({"code":105})"});
+    // It takes what the client sends meanwhile, or its end would destroy what the client has not read yet.
+    m_peer.answer({head + "Content-Length: 12\r\n\r\n" + R"({"code":105})", ScriptedPeer::End::Hold});
     unsigned onRunner = ApiOk;
     NetTask::runAndWait([&] { onRunner = client(m_peer.port())->removeSite("SR1"); });
     QCOMPARE(onRunner, result);
+    m_peer.greet(ScriptedPeer::Greeting::Renegotiate);
+    QCOMPARE(client(m_peer.port())->removeSite("SR1"), result);
+    QCOMPARE(client(m_peer.port())->loginServer("somebody", "secret"), result);
+    m_peer.greet(ScriptedPeer::Greeting::Handshake);
     QCOMPARE(client(m_peer.port())->removeSite("SR1"), result);
 }
 

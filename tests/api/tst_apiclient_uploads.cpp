@@ -218,6 +218,10 @@ void TestApiClientUploads::exportedFile_data() {
     row("chunks", chunk + "0\r\n\r\n", 0);
     row("cut off", ok + "Content-Length: 9999999\r\n\r\n" + bytes, 12);
     row("cut off in chunks", chunk, 12);
+    row("chunk longer than it said",
+        ok + "Transfer-Encoding: chunked\r\n\r\n2fffff\r\n" + bytes + "\r\n0\r\n\r\n", 12);
+    row("5 GiB", ok + "Content-Length: 5368709120\r\n\r\n" + bytes, 12);
+    row("a chunk of 5 GiB", ok + "Transfer-Encoding: chunked\r\n\r\n140000000\r\n" + bytes, 12);
     row("without an end", ok + "Connection: close\r\n\r\n" + bytes, 12);
     row("404", ScriptedPeer::http(404, bytes, {type}), 13);
     row("105", ScriptedPeer::http(200, R"({"code":105})"), 17);

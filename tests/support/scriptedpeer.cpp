@@ -182,8 +182,8 @@ void ScriptedPeer::serve() {
         // Here and not at the start: the test library puts handlers of its own in place when it runs the
         // tests.
         std::signal(SIGPIPE, SIG_IGN);
-        if (greeting == Greeting::Handshake)
-            converse(socket);
+        if (greeting == Greeting::Handshake || greeting == Greeting::Renegotiate)
+            converse(socket, greeting);
         char ignored = 0;
         while (greeting == Greeting::Silence && ::recv(socket, &ignored, 1, 0) > 0) {
         }
@@ -193,9 +193,12 @@ void ScriptedPeer::serve() {
     }
 }
 
-void ScriptedPeer::converse(int socket) {
+void ScriptedPeer::converse(int socket, Greeting greeting) {
     const Session session(SSL_new(m_tls->context.get()), &SSL_free);
     SSL_set_fd(session.get(), socket);
+    const bool renegotiates = greeting == Greeting::Renegotiate;
+    if (renegotiates)
+        SSL_set_max_proto_version(session.get(), TLS1_2_VERSION);
     Request request;
     if (SSL_accept(session.get()) != 1 || !readHead(session.get(), request) ||
         !takeBody(session.get(), request))
@@ -206,6 +209,8 @@ void ScriptedPeer::converse(int socket) {
         m_requests.push_back(request);
         script = m_script;
     }
+    if (renegotiates && (SSL_renegotiate(session.get()) != 1 || SSL_do_handshake(session.get()) != 1))
+        return;
     const Reply reply = script ? script(request) : Reply{};
     const std::size_t piece = reply.piece ? reply.piece : std::max<std::size_t>(reply.bytes.size(), 1);
     for (std::size_t at = 0; at < reply.bytes.size(); at += piece) {

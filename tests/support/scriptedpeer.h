@@ -57,8 +57,9 @@ public:
     void answer(const Reply &reply);
     enum class Greeting {
         Handshake,
-        HangUp, ///< the connection is closed before the handshake
-        Silence ///< the handshake is never answered
+        HangUp,     ///< the connection is closed before the handshake
+        Silence,    ///< the handshake is never answered
+        Renegotiate ///< a handshake of TLS 1.2, and another one is asked for before the answer
     };
     /// How it meets every connection from the next one on.
     void greet(Greeting greeting);
@@ -85,7 +86,7 @@ private:
     struct Tls;
 
     void serve();
-    void converse(int socket);
+    void converse(int socket, Greeting greeting);
     bool takeBody(ssl_st *session, Request &request);
     bool rest(std::chrono::milliseconds time);
 
