@@ -6,6 +6,7 @@
 #include "localstore.h"
 #include "logcapture.h"
 #include "nvldmstore.h"
+#include "serverkeys.h"
 #include "storewriter.h"
 
 #include <QDir>
@@ -35,6 +36,7 @@ private slots:
     void unreadableAccountIsEmpty();
     void serverList();
     void unreadableServerList();
+    void serverKeys();
     void passwordsOutliveABrokenKey();
     void removedFileIsBegunAnew();
     void servicePort_data();
@@ -164,6 +166,34 @@ void TestStores::unreadableServerList() {
     QCOMPARE(nvldmstore::replaceTable(path("ndclisvrs.sdb").constData(), "svrsMainT", "taken"), 0);
     QCOMPARE(store.loadServerList(loaded), 1002u);
     QVERIFY(loaded.is_array() && loaded.empty());
+}
+
+void TestStores::serverKeys() {
+    const QString file = m_root.filePath("keys.sdb");
+    const QString odd = QStringLiteral("it's:8079");
+    const std::string first(64, 'a');
+    const std::string second(64, 'b');
+    const QDateTime before = QDateTime::currentDateTime();
+    {
+        ServerKeys keys(file);
+        QVERIFY(!keys.find(odd) && keys.fingerprint(odd).empty());
+        QVERIFY(keys.keep(odd, first) && keys.keep(ServerKeys::thisComputer, second));
+        QVERIFY(!keys.keep(odd, first));
+        QVERIFY2(!keys.keep(odd, second) && keys.fingerprint(odd) == first, "only trust replaces a key");
+        StoreWriter::flush();
+    }
+    ServerKeys again(file);
+    QCOMPARE(again.fingerprint(odd), first);
+    QCOMPARE(again.fingerprint(ServerKeys::thisComputer), second);
+    const ServerKey kept = again.find(odd).value();
+    QVERIFY(kept.firstSeen.msecsTo(kept.lastSeen) >= 0 && before.msecsTo(kept.firstSeen) >= 0);
+    again.trust(odd, second);
+    again.forget(ServerKeys::thisComputer);
+    StoreWriter::flush();
+    const ServerKeys last(file);
+    QCOMPARE(last.fingerprint(odd), second);
+    QVERIFY(!last.find(ServerKeys::thisComputer));
+    QCOMPARE(ServerKeys::readable("0123abcd4567"), "0123 ABCD 4567");
 }
 
 void TestStores::passwordsOutliveABrokenKey() {
