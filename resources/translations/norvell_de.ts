@@ -600,6 +600,10 @@
         <source>error %1</source>
         <translation>Fehler %1</translation>
     </message>
+    <message>
+        <source>the server&apos;s key has changed</source>
+        <translation>der Schlüssel des Servers hat sich geändert</translation>
+    </message>
 </context>
 <context>
     <name>AssignIpDialogII</name>

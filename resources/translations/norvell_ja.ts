@@ -591,6 +591,10 @@
         <source>error %1</source>
         <translation>エラー %1</translation>
     </message>
+    <message>
+        <source>the server&apos;s key has changed</source>
+        <translation>サーバーの鍵が変わっています</translation>
+    </message>
 </context>
 <context>
     <name>AssignIpDialogII</name>

@@ -151,16 +151,27 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) 
     fill(request);
     qDebug("CApiClient::%s > Set authorization to %s", call.method,
            MessageLog::secret(request.authorization).constData());
-    const HttpAnswer answer = exchangeHttp(request);
+    const HttpAnswer answer = exchange(request);
     if (!answer.arrived) {
         std::cout << call.transportError << answer.error << std::endl;
         if (call.logTransportError)
             call.logTransportError(call, answer.error);
-        return ApiTransportError;
+        return transportResult(answer);
     }
     if (call.logAnswer)
         call.logAnswer(call, answer);
     return judge(call, answer, output);
+}
+
+HttpAnswer CApiClient::exchange(HttpRequest &request) {
+    request.expectedKey = m_strExpectedKey;
+    HttpAnswer answer = exchangeHttp(request);
+    m_strServerKey = answer.serverKey;
+    return answer;
+}
+
+unsigned CApiClient::transportResult(const HttpAnswer &answer) {
+    return answer.keyChanged ? ApiKeyChanged : ApiTransportError;
 }
 
 std::string CApiClient::freshGenericToken() {

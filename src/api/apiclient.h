@@ -38,6 +38,11 @@ public:
     bool setAccessToken(const char *szToken);
     /// False for null.
     bool setAccount(const char *szAccount);
+    /// Sends only to a server whose public key has this fingerprint, as serverKey() gives it; to any for an
+    /// empty one. With another key a call ends with ApiKeyChanged.
+    void expectServerKey(std::string fingerprint) { m_strExpectedKey = std::move(fingerprint); }
+    /// The fingerprint that the server has shown in the last call; empty when it did not come that far.
+    const std::string &serverKey() const { return m_strServerKey; }
     /// The time that a call may take altogether, or a transfer without progress, in place of a minute.
     void setTotalTimeout(std::chrono::milliseconds timeout) { m_totalTimeout = timeout; }
     /// Lets somebody watch and cancel the transfer of files that is called next, and learn why it failed.
@@ -224,6 +229,10 @@ private:
 
     unsigned send(const Call &call, const Fill &fill, JSON *output);
     unsigned exchange(const Call &call, const Fill &fill, JSON *output);
+    /// With the server's key looked at.
+    HttpAnswer exchange(HttpRequest &request);
+    /// Of a request without an answer.
+    static unsigned transportResult(const HttpAnswer &answer);
 
     /// How the uploads differ from the rest of the road.
     static Call uploadCall(const char *method, const char *path, const char *transportError = nullptr);
@@ -245,6 +254,8 @@ private:
     std::string m_strAccess;
     std::string m_strPassCipher;
     std::string m_strAccount;
+    std::string m_strExpectedKey;
+    std::string m_strServerKey;
     std::chrono::milliseconds m_totalTimeout{60000};
     std::shared_ptr<Transfer> m_transfer;
 };

@@ -1,6 +1,7 @@
 #include "apilocalclient.h"
 
 #include "ciphers.h"
+#include "serverkeys.h"
 
 #include <nlohmann/json.hpp>
 
@@ -23,7 +24,9 @@ unsigned judgeCode(int code) {
 
 } // namespace
 
-CApiLocalClient::CApiLocalClient(std::uint32_t uPort) : CApiClient("127.0.0.1", uPort) {}
+CApiLocalClient::CApiLocalClient(std::uint32_t uPort) : CApiClient("127.0.0.1", uPort) {
+    expectServerKey(ServerKeys::instance().fingerprint(ServerKeys::thisComputer));
+}
 
 unsigned CApiLocalClient::memberList(int nStart, int nCount, JSON &members) {
     return post({.method = "memberList",

@@ -3,7 +3,8 @@
 #include "apiclient.h"
 
 /// The client of the service on this computer, with the account calls that only it offers. They carry a fresh
-/// generic token, never a session's, so they work before anybody has logged in.
+/// generic token, never a session's, so they work before anybody has logged in, and go to no other key than
+/// the one that is remembered of this computer's service.
 class CApiLocalClient : public CApiClient {
 public:
     explicit CApiLocalClient(std::uint32_t uPort);

@@ -24,6 +24,8 @@ QString apiResultText(unsigned result) {
         return Texts::tr("a secret could not be ciphered");
     case ApiInvalidArgument:
         return Texts::tr("nobody is logged in");
+    case ApiKeyChanged:
+        return Texts::tr("the server's key has changed");
     case ApiTargetNotWritten:
         return Texts::tr("the file exists already or cannot be written");
     default:

@@ -15,6 +15,7 @@ enum ApiResult : unsigned {
     ApiCode105 = 17,          ///< credentials or token not accepted
     ApiCode108 = 18,          ///< no more sessions
     ApiTargetNotWritten = 19, ///< exportFile: the target exists already or cannot be written
+    ApiKeyChanged = 20,       ///< the server has another key than the expected one; nothing was sent
     ApiEmailTaken = 1003      ///< newMember of the local client: the e-mail has an account already
 };
 

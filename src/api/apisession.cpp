@@ -47,11 +47,11 @@ unsigned CApiClient::isServerOnline(std::uint32_t &uOnline) {
         request.headOnly = true;
         qDebug("CApiClient::isServerOnline > Set authorization to %s",
                MessageLog::secret(request.authorization).constData());
-        const HttpAnswer answer = exchangeHttp(request);
+        const HttpAnswer answer = exchange(request);
         if (!answer.arrived) {
             std::cout << "HTTP error: " << answer.error << std::endl;
             qDebug("CApiClient::isServerOnline > HTTP error %s", answer.error.c_str());
-            return ApiTransportError;
+            return transportResult(answer);
         }
         qDebug("CApiClient::isServerOnline > statsu %d", answer.status);
         if (answer.status != 200)

@@ -6,6 +6,7 @@
 #include "downloadtarget.h"
 #include "requestdeadline.h"
 #include "responsebody.h"
+#include "serverkeycheck.h"
 #include "transfererror.h"
 
 #include <httplib.h>
@@ -173,7 +174,10 @@ httplib::Request messageOf(const HttpRequest &request) {
 class Exchange {
 public:
     explicit Exchange(const HttpRequest &request)
-        : m_request(request), m_deadline(request.totalTimeout), m_receiver(request, m_answer, m_deadline) {
+        : m_request(request),
+          m_deadline(request.totalTimeout),
+          m_key(request.expectedKey),
+          m_receiver(request, m_answer, m_deadline) {
         if (request.transfer)
             m_cutOnCancel.emplace(*request.transfer, [this] { m_deadline.cut(); });
     }
@@ -187,8 +191,11 @@ public:
             return failed(m_request, false, "SSL context");
         configure(*client, m_request, m_deadline);
         m_head.watch(client->ssl_context());
+        m_key.watch(client->ssl_context());
         const httplib::Request message = prepared();
-        return judged(client->send(message));
+        HttpAnswer answer = judged(client->send(message));
+        answer.serverKey = m_key.presented();
+        return answer;
     }
 
 private:
@@ -209,6 +216,11 @@ private:
     }
 
     HttpAnswer judged(const httplib::Result &result) {
+        if (m_key.hasRefused()) {
+            HttpAnswer answer = failed(m_request, false, "Key changed");
+            answer.keyChanged = true;
+            return answer;
+        }
         if (m_sender)
             m_sender->rethrow();
         if (m_sender && m_sender->refusal() != 0)
@@ -233,6 +245,7 @@ private:
     RequestDeadline m_deadline;
     std::optional<Transfer::CutOnCancel> m_cutOnCancel;
     AnswerHead m_head;
+    ServerKeyCheck m_key;
     int m_headStatus = 0; ///< once the head is complete
     Receiver m_receiver;
     std::optional<BodySender> m_sender;

@@ -17,7 +17,8 @@ struct HttpRequest {
     std::string contentType;
     std::string authorization; ///< the bare value, without a scheme word
     std::string body;
-    std::chrono::milliseconds waitTimeout{0};      ///< to connect, and of each read; 0 for the defaults
+    std::string expectedKey;                  ///< fingerprint of the server's public key; empty to take any
+    std::chrono::milliseconds waitTimeout{0}; ///< to connect, and of each read; 0 for the defaults
     std::chrono::milliseconds totalTimeout{60000}; ///< of the whole request; of a transfer without progress
     bool headOnly = false;                         ///< the answer's body is of no interest, nor its fate
     Transfer *transfer = nullptr;                  ///< makes it a transfer, which this one counts and can end
@@ -25,10 +26,13 @@ struct HttpRequest {
     DownloadTarget *target = nullptr;              ///< of a transfer: takes the answer's body if it is a file
 };
 
-/// What came back. Without an answer, error holds the reason's name and nothing else is set.
+/// What came back. Without an answer, error holds the reason's name and nothing else is set
+/// but what is known of the server's key.
 struct HttpAnswer {
     bool arrived = false;
     std::string error;
+    std::string serverKey;   ///< fingerprint of the server's public key, once it was seen
+    bool keyChanged = false; ///< it is not the expected one, so nothing was sent
     int status = 0;
     std::string authorization; ///< the answer's header of that name, or empty
     std::string body;

@@ -7,14 +7,17 @@
 #include "nettask.h"
 #include "requestdeadline.h"
 #include "scriptedpeer.h"
+#include "serverkeycheck.h"
 #include "testsession.h"
 
 #include <QDir>
 #include <QElapsedTimer>
 #include <QTest>
 
+#include <openssl/ssl.h>
 #include <openssl/ui.h>
 
+#include <functional>
 #include <future>
 
 using TestSession::client;
@@ -66,6 +69,8 @@ private slots:
     void clientCertificate_data();
     void clientCertificate();
     void nothingIsSentWithoutAKey();
+    void anotherServerKeyGetsNothing();
+    void keyOfAResumedSessionIsLookedAt();
     void endOfTheProgramCutsRequests();
 
 private:
@@ -436,6 +441,72 @@ void TestApiClientJudging::nothingIsSentWithoutAKey() {
 }
 
 /// The last one: no request gets through afterwards.
+void TestApiClientJudging::anotherServerKeyGetsNothing() {
+    const LogCapture log;
+    m_peer.answer(ScriptedPeer::json({{"code", 0}}));
+    const std::string first = m_peer.keyFingerprint();
+    const auto asked = client(m_peer.port());
+    QCOMPARE(asked->removeSite("SR1"), unsigned(ApiOk));
+    QCOMPARE(asked->serverKey(), first);
+    asked->expectServerKey(first);
+    QCOMPARE(asked->removeSite("SR1"), unsigned(ApiOk));
+    QCOMPARE(m_peer.takeRequests().size(), std::size_t(2));
+
+    m_peer.renewKey();
+    QVERIFY(m_root.write("fw.bin", QByteArray(100000, 'f')));
+    const std::string file = m_root.filePath("fw.bin").toStdString();
+    const std::string target = m_root.filePath("export.zip").toStdString();
+    std::uint32_t online = 7;
+    JSON out;
+    const std::vector<std::function<unsigned()>> calls = {
+        [&] { return asked->removeSite("SR1"); },
+        [&] { return asked->listSites(0, 10, out); },
+        [&] { return asked->isServerOnline(online); },
+
+        [&] { return asked->uploadPackage("T1", file.c_str(), "fw.bin", {"DV1"}, false); },
+        [&] { return asked->exportFile("T1", target.c_str()); },
+        [&] { return asked->loginServer("a", "b"); }};
+    const int before = m_peer.connections();
+    for (const auto &call : calls) {
+        QCOMPARE(call(), unsigned(ApiKeyChanged));
+        QCOMPARE(asked->serverKey(), m_peer.keyFingerprint());
+    }
+    QCOMPARE(online, 0u);
+    QCOMPARE(m_peer.connections() - before, int(calls.size()));
+    QVERIFY(m_peer.takeRequests().empty());
+    QCOMPARE(m_peer.brokenOffBytes(), 0);
+    QVERIFY(!QFile::exists(QString::fromStdString(target)));
+}
+
+/// Such a handshake brings no certificate.
+void TestApiClientJudging::keyOfAResumedSessionIsLookedAt() {
+    m_peer.answer({ScriptedPeer::http(200, "x")});
+    const std::unique_ptr<SSL_CTX, decltype(&SSL_CTX_free)> context(SSL_CTX_new(TLS_client_method()),
+                                                                    &SSL_CTX_free);
+    std::unique_ptr<SSL_SESSION, decltype(&SSL_SESSION_free)> kept(nullptr, &SSL_SESSION_free);
+    for (const std::string &expected : {m_peer.keyFingerprint(), std::string(64, '0')}) {
+        const bool isFirst = !kept;
+        ServerKeyCheck check(expected);
+        check.watch(context.get());
+        const std::unique_ptr<SSL, decltype(&SSL_free)> session(SSL_new(context.get()), &SSL_free);
+        BIO *line = BIO_new_connect(("127.0.0.1:" + std::to_string(m_peer.port())).c_str());
+        QCOMPARE(BIO_do_connect(line), 1);
+        SSL_set_bio(session.get(), line, line);
+        if (!isFirst)
+            SSL_set_session(session.get(), kept.get());
+        QCOMPARE(SSL_connect(session.get()), 1);
+        QCOMPARE(SSL_session_reused(session.get()), isFirst ? 0 : 1);
+        QCOMPARE(check.hasRefused(), !isFirst);
+        QCOMPARE(SSL_write(session.get(), "GET / HTTP/1.1\r\n\r\n", 18) > 0, isFirst);
+        char byte = 0;
+        if (isFirst)
+            QCOMPARE(SSL_read(session.get(), &byte, 1), 1);
+        kept.reset(SSL_get1_session(session.get()));
+        SSL_shutdown(session.get());
+    }
+    QCOMPARE(m_peer.takeRequests().size(), std::size_t(1));
+}
+
 void TestApiClientJudging::endOfTheProgramCutsRequests() {
     const LogCapture log;
     m_peer.answer({{}, ScriptedPeer::End::Hold});

@@ -2,6 +2,9 @@
 
 #include "nvlcrypto.h"
 
+#include <QByteArray>
+#include <QCryptographicHash>
+
 #include <netinet/in.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -73,8 +76,10 @@ bool readHead(SSL *session, ScriptedPeer::Request &request) {
     std::string text;
     std::size_t headEnd = std::string::npos;
     while ((headEnd = text.find("\r\n\r\n")) == std::string::npos) {
-        if (!readSome(session, text))
+        if (!readSome(session, text)) {
+            request.body = text;
             return false;
+        }
     }
     request = parsedHead(text.substr(0, headEnd + 4));
     request.body = text.substr(headEnd + 4);
@@ -90,6 +95,21 @@ struct ScriptedPeer::Tls {
 
 std::string ScriptedPeer::Request::header(const std::string &name) const {
     return headers.count(name) == 1 ? headers.find(name)->second : std::string();
+}
+
+std::string ScriptedPeer::keyFingerprint() {
+    const std::lock_guard lock(m_mutex);
+    unsigned char *bytes = nullptr;
+    const int length = i2d_PUBKEY(SSL_CTX_get0_privatekey(m_tls->context.get()), &bytes);
+    const auto key = QByteArray::fromRawData(reinterpret_cast<char *>(bytes), length);
+    const QByteArray digest = QCryptographicHash::hash(key, QCryptographicHash::Sha256).toHex();
+    OPENSSL_free(bytes);
+    return digest.toStdString();
+}
+
+void ScriptedPeer::renewKey() {
+    const std::lock_guard lock(m_mutex);
+    useOwnCertificate(m_tls->context.get());
 }
 
 ScriptedPeer::ScriptedPeer() : m_tls(std::make_unique<Tls>()) {
@@ -194,14 +214,23 @@ void ScriptedPeer::serve() {
 }
 
 void ScriptedPeer::converse(int socket, Greeting greeting) {
-    const Session session(SSL_new(m_tls->context.get()), &SSL_free);
+    Session session(nullptr, &SSL_free);
+    {
+        const std::lock_guard lock(m_mutex);
+        session.reset(SSL_new(m_tls->context.get()));
+    }
     SSL_set_fd(session.get(), socket);
     const bool renegotiates = greeting == Greeting::Renegotiate;
     if (renegotiates)
         SSL_set_max_proto_version(session.get(), TLS1_2_VERSION);
     Request request;
-    if (SSL_accept(session.get()) != 1 || !readHead(session.get(), request) ||
-        !takeBody(session.get(), request))
+    if (SSL_accept(session.get()) != 1)
+        return;
+    if (!readHead(session.get(), request)) {
+        m_brokenOffBytes += static_cast<int>(request.body.size());
+        return;
+    }
+    if (!takeBody(session.get(), request))
         return;
     Script script;
     {

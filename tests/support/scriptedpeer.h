@@ -52,6 +52,11 @@ public:
 
     std::uint32_t port() const { return m_port; }
 
+    /// SHA-256 of the public key that it shows, in lower case hex.
+    std::string keyFingerprint();
+    /// Shows another key from the next connection on.
+    void renewKey();
+
     /// What it does from the next request on. The script runs in the peer's thread.
     void follow(Script script);
     void answer(const Reply &reply);
@@ -73,6 +78,8 @@ public:
     std::vector<Request> takeRequests();
     /// Connections since the start, also those without a request.
     int connections() const { return m_connections; }
+    /// Bytes of requests whose head did not come whole.
+    int brokenOffBytes() const { return m_brokenOffBytes; }
 
     /// A whole HTTP answer with its length; headers are whole lines without their ends.
     static std::string http(int status, const std::string &body,
@@ -94,6 +101,7 @@ private:
     int m_listener = -1;
     std::uint32_t m_port = 0;
     std::atomic<int> m_connections = 0;
+    std::atomic<int> m_brokenOffBytes = 0;
     std::mutex m_mutex;
     std::condition_variable m_stopped;
     bool m_stop = false;
