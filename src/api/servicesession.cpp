@@ -1,6 +1,7 @@
 #include "servicesession.h"
 
 #include "messagelog.h"
+#include "sessionevents.h"
 
 #include <QDebug>
 
@@ -47,8 +48,11 @@ unsigned ServiceSession::send(const std::function<unsigned(CApiClient &)> &endpo
     CApiClient client(present.address.toUtf8().constData(), present.port);
     client.setAccount(present.account.toUtf8().constData());
     client.setAccessToken(present.token.constData());
+    client.expectServerKey(present.serverKey);
     const std::string before = client.accessToken();
     const unsigned result = endpoint(client);
+    if (result == ApiKeyChanged)
+        SessionEvents::instance().reportKeyChanged(m_login.generation, client.serverKey());
     if (client.accessToken() != before)
         CLocalStore::instance().renewAccess(QByteArray::fromStdString(client.accessToken()), m_carried,
                                             m_login.generation);

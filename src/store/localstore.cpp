@@ -3,6 +3,7 @@
 #include "apppaths.h"
 #include "ciphers.h"
 #include "messagelog.h"
+#include "serverkeys.h"
 
 #include <QDebug>
 
@@ -49,9 +50,24 @@ void CLocalStore::setLoginInfo(const QString &address, quint32 port, const QStri
                                const QByteArray &token) {
     qDebug("CLocalStore::setLoginInfo > strToken: %s", MessageLog::secret(token).constData());
     const std::lock_guard lock(m_mutex);
-    m_login = {address, port, account, token, m_login.generation + 1};
+    m_login = {address, port, account, token, m_login.generation + 1, {}, {}};
     m_access = token;
     m_spares.clear();
+}
+
+void CLocalStore::setServerKey(const QString &server, const std::string &fingerprint) {
+    const std::lock_guard lock(m_mutex);
+    m_login.server = server;
+    m_login.serverKey = fingerprint;
+}
+
+void CLocalStore::trustServerKey(const std::string &fingerprint, quint64 generation) {
+    const std::lock_guard lock(m_mutex);
+    if (m_login.generation != generation)
+        return;
+    m_login.serverKey = fingerprint;
+    if (!m_login.server.isEmpty())
+        ServerKeys::instance().trust(m_login.server, fingerprint);
 }
 
 LoginInfo CLocalStore::loginInfo() const {
@@ -61,7 +77,7 @@ LoginInfo CLocalStore::loginInfo() const {
 
 void CLocalStore::clearLoginInfo() {
     const std::lock_guard lock(m_mutex);
-    m_login = {{}, 0, {}, {}, m_login.generation + 1};
+    m_login = {{}, 0, {}, {}, m_login.generation + 1, {}, {}};
     m_access.clear();
     m_spares.clear();
 }

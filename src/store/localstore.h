@@ -6,6 +6,7 @@
 #include <QByteArrayList>
 
 #include <mutex>
+#include <string>
 
 /// A session with a service as every request needs it.
 struct LoginInfo {
@@ -14,6 +15,8 @@ struct LoginInfo {
     QString account;
     QByteArray token;       ///< the access token in cipher form
     quint64 generation = 0; ///< raised by every log-in and log-off; tells an old session from the present one
+    QString server;         ///< under which ServerKeys remembers the server
+    std::string serverKey;  ///< fingerprint of the only key that the session's requests go to; empty for any
 
     /// True when there is all that a request needs.
     bool isComplete() const { return !address.isEmpty() && !account.isEmpty() && !token.isEmpty(); }
@@ -29,6 +32,10 @@ public:
 
     /// Begins a session; the token is in cipher form, as access() gives it.
     void setLoginInfo(const QString &address, quint32 port, const QString &account, const QByteArray &token);
+    /// Names the server of the session and the key that it has shown at the log-in.
+    void setServerKey(const QString &server, const std::string &fingerprint);
+    /// Lets the session go on with another key, in the client store too, unless it was ended meanwhile.
+    void trustServerKey(const std::string &fingerprint, quint64 generation);
     LoginInfo loginInfo() const;
     /// Ends the session; answers that are still on their way belong to nobody from now on.
     void clearLoginInfo();

@@ -1,6 +1,7 @@
 #include "isolatedroot.h"
 #include "logcapture.h"
 #include "scriptedpeer.h"
+#include "serverkeys.h"
 #include "servicerequest.h"
 #include "testsession.h"
 
@@ -36,6 +37,8 @@ private slots:
     void answerAfterTheLogOff();
     void nothingIsSentAfterTheLogOff();
     void lostSessionIsReportedOnce();
+    void changedServerKeyIsAskedAboutOnce_data();
+    void changedServerKeyIsAskedAboutOnce();
     void renewalsThatCrossed_data();
     void renewalsThatCrossed();
     void failureIsAResult();
@@ -150,6 +153,46 @@ void TestServiceRequest::lostSessionIsReportedOnce() {
     QVERIFY(post());
     QTRY_COMPARE(m_ends.size(), 4);
     QCOMPARE(lost.size(), 2);
+}
+
+void TestServiceRequest::changedServerKeyIsAskedAboutOnce_data() {
+    QTest::addColumn<bool>("trusted");
+    QTest::newRow("trusted") << true;
+    QTest::newRow("refused") << false;
+}
+
+void TestServiceRequest::changedServerKeyIsAskedAboutOnce() {
+    QFETCH(bool, trusted);
+    SessionEvents &events = SessionEvents::instance();
+    const QSignalSpy asked(&events, &SessionEvents::keyChanged);
+    const QSignalSpy lost(&events, &SessionEvents::sessionLost);
+    const std::string first = m_peer.keyFingerprint();
+    CLocalStore::instance().setServerKey("here:1", first);
+    ServerKeys::instance().trust("here:1", first);
+    m_peer.answer(ScriptedPeer::json({{"code", 0}}));
+    m_peer.renewKey();
+    QVERIFY(post() && post() && post());
+    QTRY_COMPARE(m_results, QList<unsigned>(3, ApiKeyChanged));
+    QTRY_COMPARE(asked.size(), 1);
+    QCOMPARE(asked[0][0].toString().toStdString(), m_peer.keyFingerprint());
+    QVERIFY(events.isKeyInQuestion() && lost.isEmpty());
+    QVERIFY(m_peer.takeRequests().empty());
+
+    events.answerKeyQuestion(trusted);
+    QVERIFY(!events.isKeyInQuestion());
+    QVERIFY(post());
+    QTRY_COMPARE(m_results.size(), 4);
+    QCOMPARE(m_results[3], unsigned(trusted ? ApiOk : ApiKeyChanged));
+    QCOMPARE(ServerKeys::instance().fingerprint("here:1"), trusted ? m_peer.keyFingerprint() : first);
+    QCOMPARE(m_peer.takeRequests().size(), std::size_t(trusted ? 1 : 0));
+    m_peer.renewKey();
+    QVERIFY(post());
+    QTRY_COMPARE(m_results.value(4), unsigned(ApiKeyChanged));
+    QCoreApplication::processEvents();
+    QCOMPARE(asked.size(), trusted ? 2 : 1);
+    QCOMPARE(events.isKeyInQuestion(), trusted);
+    CLocalStore::instance().clearLoginInfo();
+    QVERIFY2(!events.isKeyInQuestion(), "the question was about a session that is over");
 }
 
 void TestServiceRequest::renewalsThatCrossed_data() {
