@@ -12,6 +12,9 @@ QComboBox *makeName(QWidget *parent) {
     name->setObjectName(QStringLiteral("nameComboBox"));
     name->setEditable(true);
     name->setInsertPolicy(QComboBox::NoInsert);
+    // Names are sent as typed: a completer would put "root" in place of "ro", and "admin" in place of
+    // "Admin".
+    name->setCompleter(nullptr);
     name->addItems({QStringLiteral("root"), QStringLiteral("admin")});
     return name;
 }

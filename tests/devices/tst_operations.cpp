@@ -20,6 +20,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QSignalSpy>
 #include <QSpinBox>
 #include <QTableView>
 #include <QTest>
@@ -131,6 +132,25 @@ private slots:
         authorize->findChild<QPushButton *>("applyButton")->click();
         QTRY_VERIFY(messageHas(QStringLiteral("%1 of %1 devices are authorized.").arg(devices)));
         QTRY_COMPARE_WITH_TIMEOUT(countWith("Authorized"), devices, patienceMs);
+    }
+
+    void namesAreSentAsTyped() {
+        for (const char *name : {"Admin", "ro", "ROOT", "root"}) {
+            click("authorizeButton");
+            auto *dialog = visible<AuthorizeDeviceDialog>();
+            QVERIFY(dialog);
+            QSignalSpy sent(dialog, &AuthorizeDeviceDialog::authDevices);
+            auto *field = dialog->findChild<QComboBox *>("nameComboBox");
+            field->setFocus();
+            field->lineEdit()->selectAll();
+            QTest::keyClicks(field->focusWidget() ? field->focusWidget() : field, name);
+            QTest::keyClick(field, Qt::Key_Tab);
+            QTest::keyClicks(dialog->findChild<QLineEdit *>("passEdit"), "Passw0rd");
+            dialog->findChild<QPushButton *>("applyButton")->click();
+            QCOMPARE(sent.size(), 1);
+            QCOMPARE(sent[0][0].toString(), QString(name));
+            QTRY_VERIFY(!visible<AuthorizeDeviceDialog>());
+        }
     }
 
     void policyIsSetForTheTickedDevices() {
