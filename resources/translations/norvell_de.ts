@@ -1612,12 +1612,9 @@
             <numerusform>%n Geräte waren schon am Standort.</numerusform>
         </translation>
     </message>
-    <message numerus="yes">
-        <source>%n device record(s) could not be read.</source>
-        <translation>
-            <numerusform>%n Gerätedatensatz konnte nicht gelesen werden.</numerusform>
-            <numerusform>%n Gerätedatensätze konnten nicht gelesen werden.</numerusform>
-        </translation>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
     </message>
     <message>
         <source>Putting devices into the site</source>
@@ -1742,13 +1739,6 @@
     <message>
         <source>Copy rows</source>
         <translation>Zeilen kopieren</translation>
-    </message>
-</context>
-<context>
-    <name>DevicePlacement</name>
-    <message>
-        <source>The devices are not managed any more.</source>
-        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
     </message>
 </context>
 <context>

@@ -1585,11 +1585,9 @@
             <numerusform>%n 台のデバイスは既にサイトにあります。</numerusform>
         </translation>
     </message>
-    <message numerus="yes">
-        <source>%n device record(s) could not be read.</source>
-        <translation>
-            <numerusform>%n 件のデバイスレコードを読み取れませんでした。</numerusform>
-        </translation>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>デバイスは管理されなくなっています。</translation>
     </message>
     <message>
         <source>Putting devices into the site</source>
@@ -1709,13 +1707,6 @@
     <message>
         <source>Copy rows</source>
         <translation>行をコピー</translation>
-    </message>
-</context>
-<context>
-    <name>DevicePlacement</name>
-    <message>
-        <source>The devices are not managed any more.</source>
-        <translation>デバイスは管理されなくなっています。</translation>
     </message>
 </context>
 <context>

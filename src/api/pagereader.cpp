@@ -13,6 +13,14 @@ constexpr int pageLimit = 400;
 
 unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
                  const std::function<void(JSON &)> &take) {
+    return readUntil(session, list, pageSize, [&take](JSON &page) {
+        take(page);
+        return false;
+    });
+}
+
+unsigned readUntil(ServiceSession &session, ListCall list, int pageSize,
+                   const std::function<bool(JSON &)> &hasEnough) {
     for (int page = 0; page < pageLimit; ++page) {
         JSON records;
         const unsigned result = session.call(
@@ -22,8 +30,7 @@ unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
         if (!records.is_array())
             return ApiMissingData;
         const std::size_t count = records.size();
-        take(records);
-        if (count < static_cast<std::size_t>(pageSize))
+        if (hasEnough(records) || count < static_cast<std::size_t>(pageSize))
             break;
     }
     return ApiOk;

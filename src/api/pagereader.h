@@ -16,4 +16,8 @@ using ListCall = unsigned (CApiClient::*)(int, int, JSON &);
 unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
                  const std::function<void(JSON &page)> &take);
 
+/// The same, and no further than to the page with which the taker has enough.
+unsigned readUntil(ServiceSession &session, ListCall list, int pageSize,
+                   const std::function<bool(JSON &page)> &hasEnough);
+
 } // namespace PageReader

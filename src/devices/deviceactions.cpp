@@ -19,16 +19,15 @@ struct DeviceActions::Change {
     QString message;
 };
 
+struct DeviceActions::CommitResult {
+    unsigned code = ApiOk;
+    bool isSent = false;
+    QString message; ///< what was done
+};
+
 namespace {
 
 using SiteMembership::Outcome;
-
-std::vector<std::string> recordTexts(const std::vector<DeviceRecordPtr> &devices) {
-    std::vector<std::string> texts;
-    for (const DeviceRecordPtr &device : devices)
-        texts.push_back(device->json);
-    return texts;
-}
 
 int countOf(const std::vector<SiteMembership::DeviceOutcome> &outcomes, Outcome outcome) {
     return static_cast<int>(
@@ -161,79 +160,88 @@ void DeviceActions::tellAuthorized(const QStringList &deviceIds, const QString &
         {}, [] { std::this_thread::sleep_for(authorizationTime); });
 }
 
-void DeviceActions::deleteDevices(const PresentDevices &devices) {
-    const auto change = [devices] {
-        const auto count = static_cast<int>(devices.records.size());
-        Change made{JSON::array(),
-                    joined({tr("%n device(s) deleted.", nullptr, count), leftOutText(devices.vanished)})};
-        for (const DeviceRecordPtr &device : devices.records) {
-            qDebug("At device overview, remove device id directly: %s", qUtf8Printable(device->id));
-            JSON record = parseJson(device->json);
+void DeviceActions::deleteDevices(const QStringList &deviceIds) {
+    const auto change = [](const JSON &present) {
+        Change made{present, tr("%n device(s) deleted.", nullptr, static_cast<int>(present.size()))};
+        for (JSON &record : made.records) {
+            qDebug("At device overview, remove device id directly: %s",
+                   qUtf8Printable(DeviceRecords::identityOf(record)));
             // A record without sites is how the service is told to forget a device.
             record["siteid"] = JSON::array();
-            made.records.push_back(std::move(record));
         }
         return made;
     };
-    commit(tr("Deleting devices"), change, [this] { emit devicesDeleted(); });
+    commit(tr("Deleting devices"), deviceIds, change, [this] { emit devicesDeleted(); });
 }
 
-void DeviceActions::removeFromSite(const PresentDevices &devices, const QString &siteId) {
-    const auto change = [records = recordTexts(devices.records), vanished = devices.vanished, siteId] {
+void DeviceActions::removeFromSite(const QStringList &deviceIds, const QString &siteId) {
+    const auto change = [siteId](const JSON &present) {
         Change made;
-        const auto outcomes = SiteMembership::removeFromSite(records, siteId, made.records);
-        const int removed = countOf(outcomes, Outcome::Removed);
+        const auto outcomes = SiteMembership::removeFromSite(present, siteId, made.records);
         made.message =
-            joined({tr("%n device(s) removed from the site.", nullptr, removed), leftOutText(vanished)});
+            tr("%n device(s) removed from the site.", nullptr, countOf(outcomes, Outcome::Removed));
         return made;
     };
-    commit(tr("Removing devices from the site"), change, [this] { emit devicesDeleted(); });
+    commit(tr("Removing devices from the site"), deviceIds, change, [this] { emit devicesDeleted(); });
 }
 
-void DeviceActions::putIntoSite(const PresentDevices &devices, const SiteMembership::Drop &drop) {
-    const auto change = [records = recordTexts(devices.records), vanished = devices.vanished, drop] {
+void DeviceActions::putIntoSite(const QStringList &deviceIds, const SiteMembership::Drop &drop) {
+    const auto change = [drop](const JSON &present) {
         Change made;
-        const auto outcomes = SiteMembership::assign(records, drop, made.records);
+        const auto outcomes = SiteMembership::assign(present, drop, made.records);
         const int moved = countOf(outcomes, Outcome::Moved);
         const int added = countOf(outcomes, Outcome::Added);
-        const int unreadable = countOf(outcomes, Outcome::Unreadable);
         QStringList parts;
         if (moved > 0)
             parts += tr("%n device(s) moved.", nullptr, moved);
         if (added > 0)
             parts += tr("%n device(s) added to the site.", nullptr, added);
-        if (const int present = countOf(outcomes, Outcome::Unchanged); present > 0)
-            parts += tr("%n device(s) in the site already.", nullptr, present);
-        if (unreadable > 0)
-            parts += tr("%n device record(s) could not be read.", nullptr, unreadable);
-        parts += leftOutText(vanished);
+        if (const int unchanged = countOf(outcomes, Outcome::Unchanged); unchanged > 0)
+            parts += tr("%n device(s) in the site already.", nullptr, unchanged);
         made.message = joined(parts);
         return made;
     };
-    commit(tr("Putting devices into the site"), change, {});
+    commit(tr("Putting devices into the site"), deviceIds, change, {});
 }
 
-void DeviceActions::commit(const QString &name, std::function<Change()> change,
-                           std::function<void()> succeeded) {
-    struct Result {
-        unsigned code;
-        QString message;
-    };
+/// On the runner. What is sent are the records as the service has them at that moment: those that the console
+/// shows may be older than what another client has done.
+DeviceActions::CommitResult DeviceActions::rebaseAndSend(ServiceSession &session,
+                                                         const QStringList &deviceIds,
+                                                         const std::function<Change(const JSON &)> &change) {
+    CommitResult result;
+    JSON present;
+    result.code = DeviceCommit::readPresent(session, deviceIds, present);
+    if (result.code != ApiOk) {
+        qWarning("HTTP API(commitDevices) failed!");
+        return result;
+    }
+    if (present.empty())
+        return result;
+    const Change made = change(present);
+    result.isSent = true;
+    result.code = DeviceCommit::send(session, made.records);
+    result.message =
+        joined({made.message, leftOutText(deviceIds.size() - static_cast<qsizetype>(present.size()))});
+    return result;
+}
+
+void DeviceActions::commit(const QString &name, const QStringList &deviceIds,
+                           std::function<Change(const JSON &)> change, std::function<void()> succeeded) {
     const bool started = ServiceRequest::post(
         NetJob::createRunner(qUtf8Printable(name)), this,
-        [change](ServiceSession &session) {
-            const Change made = change();
-            return Result{DeviceCommit::send(session, made.records), made.message};
-        },
-        [this, name, succeeded](const Result &result) {
+        [deviceIds, change](ServiceSession &session) { return rebaseAndSend(session, deviceIds, change); },
+        [this, name, succeeded](const CommitResult &result) {
             emit devicesChanged();
             // Only a refusal says for sure that nothing was done; an answer that is lost says nothing.
-            if (result.code == ApiServerError)
+            if (result.code == ApiServerError || (result.code != ApiOk && !result.isSent))
                 return emit failed(
                     tr("%1 failed: %2. Nothing was changed.").arg(name, apiResultText(result.code)));
             if (result.code != ApiOk)
                 return emit failed(tr("%1 may have failed: %2. Look at the list before you try again.")
                                        .arg(name, apiResultText(result.code)));
+            if (!result.isSent)
+                return emit failed(tr("The devices are not managed any more."));
             emit done(result.message);
             if (succeeded)
                 succeeded();

@@ -27,13 +27,13 @@ public:
     void setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy, NetTask *runner,
                            const std::function<void()> &begun);
 
-    /// Deletes devices from the service for good. Here and below, what is done is told with how many devices
-    /// were not there any more.
-    void deleteDevices(const PresentDevices &devices);
+    /// Deletes devices from the service for good. Here and below, what changes are the records that the
+    /// service has at that moment, and what is done is told with how many devices were not there any more.
+    void deleteDevices(const QStringList &deviceIds);
     /// Takes devices out of a site.
-    void removeFromSite(const PresentDevices &devices, const QString &siteId);
+    void removeFromSite(const QStringList &deviceIds, const QString &siteId);
     /// Puts devices into a site; a move takes them out of the source site.
-    void putIntoSite(const PresentDevices &devices, const SiteMembership::Drop &drop);
+    void putIntoSite(const QStringList &deviceIds, const SiteMembership::Drop &drop);
 
     /// Writes the devices at the places to a file, in that order.
     void exportList(const QString &path, const DeviceSnapshotPtr &devices, const std::vector<int> &places);
@@ -64,9 +64,13 @@ private:
         std::function<void(const QStringList &deviceIds)> again;
     };
 
-    /// The records to commit, made on the runner, and what to say when they are.
+    /// The records to commit, made on the runner from the present ones, and what to say when they are.
     struct Change;
-    void commit(const QString &name, std::function<Change()> change, std::function<void()> succeeded);
+    struct CommitResult;
+    void commit(const QString &name, const QStringList &deviceIds, std::function<Change(const JSON &)> change,
+                std::function<void()> succeeded);
+    static CommitResult rebaseAndSend(ServiceSession &session, const QStringList &deviceIds,
+                                      const std::function<Change(const JSON &)> &change);
 
     void start(const Errand &errand);
     void start(const Errand &errand, NetTask *runner, const std::function<void()> &begun);

@@ -1,8 +1,12 @@
 #include "devicecommit.h"
 
+#include "devicerecord.h"
+#include "pagereader.h"
 #include "servicesession.h"
 
 #include <QDebug>
+#include <QHash>
+#include <QSet>
 
 #include <nlohmann/json.hpp>
 
@@ -11,6 +15,7 @@ namespace DeviceCommit {
 namespace {
 
 constexpr std::size_t batchSize = 500;
+constexpr int pageSize = 500;
 
 unsigned sendStage(ServiceSession &session, const JSON &records, const char *stage) {
     return session.call([&](CApiClient &client) { return client.commitDevices(records, stage); });
@@ -32,6 +37,28 @@ unsigned sendBatches(ServiceSession &session, const JSON &records) {
 }
 
 } // namespace
+
+unsigned readPresent(ServiceSession &session, const QStringList &deviceIds, JSON &records) {
+    const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
+    QHash<QString, JSON> found;
+    const unsigned result =
+        PageReader::readUntil(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
+            for (JSON &record : page) {
+                const QString id = DeviceRecords::identityOf(record);
+                if (wanted.contains(id))
+                    found[id] = std::move(record);
+            }
+            return found.size() == wanted.size();
+        });
+    records = JSON::array();
+    for (const QString &id : deviceIds) {
+        if (found.contains(id))
+            records.push_back(found.take(id));
+    }
+    if (result != ApiOk)
+        qWarning("HTTP API(listDevices) failed!");
+    return result;
+}
 
 unsigned send(ServiceSession &session, const JSON &records) {
     if (records.empty())

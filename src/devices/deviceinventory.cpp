@@ -27,13 +27,11 @@ int DeviceSnapshot::indexOf(const std::string &id) const {
     return found == m_byId.end() ? -1 : found->second;
 }
 
-PresentDevices DeviceSnapshot::presentOf(const QStringList &ids) const {
-    PresentDevices present;
+std::vector<DeviceRecordPtr> DeviceSnapshot::presentOf(const QStringList &ids) const {
+    std::vector<DeviceRecordPtr> present;
     for (const QString &id : ids) {
         if (const int place = indexOf(id); place >= 0)
-            present.records.push_back(at(place));
-        else
-            ++present.vanished;
+            present.push_back(at(place));
     }
     return present;
 }

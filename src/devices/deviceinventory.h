@@ -12,12 +12,6 @@
 #include <utility>
 #include <vector>
 
-/// Those of some devices that are still managed.
-struct PresentDevices {
-    std::vector<DeviceRecordPtr> records;
-    int vanished = 0; ///< how many of them are not
-};
-
 /// The devices of one reading, with their indexes. Built once on any thread, never changed after that.
 class DeviceSnapshot {
 public:
@@ -32,8 +26,8 @@ public:
     int indexOf(const QString &id) const;
     int indexOf(const std::string &id) const;
 
-    /// The present records of devices that somebody has chosen earlier.
-    PresentDevices presentOf(const QStringList &ids) const;
+    /// The present records of those devices that are still managed.
+    std::vector<DeviceRecordPtr> presentOf(const QStringList &ids) const;
 
     /// How many devices are in a site; all of them for the overview.
     int siteCount(const QString &siteId) const;

@@ -78,7 +78,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_updater(new InventoryUpdater(
           m_inventory, [this] { return m_siteTree->edits().commitCount(); }, this)),
       m_actions(new DeviceActions(this)),
-      m_placement(new DevicePlacement(m_inventory, m_actions, this)),
+      m_placement(new DevicePlacement(m_actions, this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_noticeBar(new NoticeBar(m_console)),
       m_tabs(new DeviceTabs(m_inventory, m_console)),
@@ -149,7 +149,6 @@ void DeviceWindow::connectParts() {
     connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteTree, &SiteTree::devicesDropped, m_placement, &DevicePlacement::drop);
-    connect(m_placement, &DevicePlacement::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_noticeBar, &NoticeBar::msgButtonClicked, this, &DeviceWindow::commitSites);
     connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
     connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
@@ -276,7 +275,7 @@ OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr
 }
 
 OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
-    return targetsOf(m_inventory.snapshot()->presentOf(ids).records);
+    return targetsOf(m_inventory.snapshot()->presentOf(ids));
 }
 
 void DeviceWindow::on_authorizeButton_clicked() {
@@ -415,8 +414,10 @@ void DeviceWindow::onReading(const InventoryReader::Reading &reading) {
     }
     if (reading.devices) {
         const DeviceSnapshotPtr previous = m_inventory.snapshot();
+        const bool isSame = reading.devices == previous && reading.codes == m_inventory.statuses();
         m_inventory.replace(reading.devices, reading.codes);
-        m_tabs->refill();
+        if (!isSame)
+            m_tabs->refill();
         DeviceLog::tablesFilled(reading.devices, previous);
         m_footer->markUpdated();
     }
@@ -448,7 +449,7 @@ void DeviceWindow::onServerAnswered() {
     if (!m_online && !m_refreshing)
         openRefreshDialog();
     else
-        m_updater->countAnswer();
+        m_updater->reloadAfterRest();
 }
 
 void DeviceWindow::onServerLost() {

@@ -12,9 +12,11 @@
 namespace {
 
 constexpr std::chrono::milliseconds settlingTime{2000};
-constexpr int answersBetweenReadings = 10;
-/// While tasks run, readings take one part in so many of the time at most.
-constexpr int readingShare = 4;
+/// A reading waits so many times as long as the last one took, so that readings are a small share of the
+/// service's and the client's work whatever the size of the fleet.
+constexpr int restAfterReading = 10;
+/// While tasks move, devices change more than else.
+constexpr int restWhileTasksMove = 3;
 
 } // namespace
 
@@ -39,15 +41,17 @@ void InventoryUpdater::reload() {
     }
     const auto work = [snapshot = m_inventory.snapshot(),
                        codes = m_inventory.statuses()](ServiceSession &session) {
-        return InventoryReader::readAll(session, snapshot, codes);
+        QElapsedTimer timer;
+        timer.start();
+        InventoryReader::Reading reading = InventoryReader::readAll(session, snapshot, codes);
+        return std::pair(std::move(reading), timer.elapsed());
     };
     m_reloadWanted = false;
-    m_answersSinceReading = 0;
-    m_sinceReading.start();
     m_reloading = ServiceRequest::post(
         m_netTask.get(), this, work,
-        [this, commits = m_siteCommits()](const InventoryReader::Reading &reading) {
-            take(reading, commits);
+        [this, commits = m_siteCommits()](const std::pair<InventoryReader::Reading, qint64> &timed) {
+            m_readingMs = timed.second;
+            take(timed.first, commits);
         },
         [this](JobEnd end) { onEnded(end); });
     // The runner may still be busy with the last answer of a session that has ended.
@@ -77,7 +81,7 @@ void InventoryUpdater::take(InventoryReader::Reading reading, int siteCommits) {
 
 void InventoryUpdater::onEnded(JobEnd end) {
     m_reloading = false;
-    m_readingMs = m_sinceReading.restart();
+    m_sinceReading.start();
     if (end != JobEnd::Delivered && end != JobEnd::SessionGone) {
         if (m_knowledge == Knowledge::None)
             m_knowledge = Knowledge::Failed;
@@ -89,16 +93,20 @@ void InventoryUpdater::onEnded(JobEnd end) {
 
 void InventoryUpdater::reloadForTasks() {
     CTaskInfoPool &pool = CTaskInfoPool::instance();
-    if (m_reloading || m_reloadWanted || !pool.isTasksChanged() ||
-        m_sinceReading.elapsed() < m_readingMs * (readingShare - 1))
+    if (!pool.isTasksChanged() || !hasRested(restWhileTasksMove))
         return;
     reload();
     pool.clearTasksChanged();
 }
 
-void InventoryUpdater::countAnswer() {
-    if (++m_answersSinceReading >= answersBetweenReadings)
+void InventoryUpdater::reloadAfterRest() {
+    if (hasRested(restAfterReading))
         reload();
+}
+
+/// Whether the last reading has ended so many times as long ago as it took.
+bool InventoryUpdater::hasRested(int times) const {
+    return !m_reloading && (!m_sinceReading.isValid() || m_sinceReading.elapsed() >= m_readingMs * times);
 }
 
 void InventoryUpdater::readStatesSoon() {
@@ -117,6 +125,7 @@ void InventoryUpdater::readStatesSoon() {
 
 void InventoryUpdater::stop() {
     m_reloadWanted = false;
+    m_readingMs = 0;
     m_knowledge = Knowledge::None;
     m_difference = {};
     m_settled = {};

@@ -31,9 +31,9 @@ public:
     /// Reads again when a task has moved since, which mostly changes devices. How soon depends on what a
     /// reading costs.
     void reloadForTasks();
-    /// The server has answered a check: polls tell of devices that come and go, and what else others change
-    /// shows with a reading once in so many answers.
-    void countAnswer();
+    /// The server has answered a check: reads what others may have changed, unless the last reading was so
+    /// long that it is too early for another one.
+    void reloadAfterRest();
     /// Reads the states alone, as soon as the service had time to act on what it was told.
     void readStatesSoon();
     /// The session has ended.
@@ -49,15 +49,15 @@ signals:
     void statesSettled();
 
 private:
+    bool hasRested(int times) const;
     void take(InventoryReader::Reading reading, int siteCommits);
     void onEnded(JobEnd end);
 
     const DeviceInventory &m_inventory;
     std::function<int()> m_siteCommits;
     NetTask::Owner m_netTask;
-    QElapsedTimer m_sinceReading; ///< since the last reading began, then since it ended
-    qint64 m_readingMs = 0;       ///< how long it took
-    int m_answersSinceReading = 0;
+    QElapsedTimer m_sinceReading;  ///< since the last reading ended; invalid before the first one
+    qint64 m_readingMs = 0;        ///< how long it took, without the wait for its turn
     DeviceDifference m_difference; ///< of the last poll
     DeviceDifference m_settled;    ///< the one that there was when a reading has succeeded
     bool m_reloading = false;

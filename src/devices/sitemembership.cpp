@@ -52,23 +52,18 @@ void keepManaged(JSON &ids) {
 
 /// Makes a change in the sites of every record and collects the records that it changes.
 template <typename Change>
-std::vector<DeviceOutcome> changeSites(const std::vector<std::string> &records, JSON &changed,
-                                       const Change &change) {
+std::vector<DeviceOutcome> changeSites(const JSON &records, JSON &changed, const Change &change) {
     std::vector<DeviceOutcome> outcomes;
     outcomes.reserve(records.size());
     changed = JSON::array();
-    for (const std::string &text : records) {
-        JSON record = parsed(text);
-        const QString deviceId = record.is_object() ? DeviceRecords::identityOf(record) : QString();
-        if (deviceId.isEmpty()) {
-            outcomes.push_back({{}, Outcome::Unreadable});
-            continue;
-        }
-        JSON ids = siteIdsOf(record);
+    for (const JSON &each : records) {
+        const QString deviceId = DeviceRecords::identityOf(each);
+        JSON ids = siteIdsOf(each);
         const Outcome outcome = change(deviceId, ids);
         outcomes.push_back({deviceId, outcome});
         if (outcome == Outcome::Unchanged)
             continue;
+        JSON record = each;
         record[siteMember] = std::move(ids);
         changed.push_back(std::move(record));
     }
@@ -98,7 +93,7 @@ std::optional<DraggedDevices> decode(const QByteArray &data) {
     return devices.deviceIds.isEmpty() ? std::nullopt : std::optional(std::move(devices));
 }
 
-std::vector<DeviceOutcome> assign(const std::vector<std::string> &records, const Drop &drop, JSON &changed) {
+std::vector<DeviceOutcome> assign(const JSON &records, const Drop &drop, JSON &changed) {
     qDebug("onDeviceDrop! site id: %s", qUtf8Printable(drop.targetSiteId));
     qDebug("device selected: %d", static_cast<int>(records.size()));
     const std::string target = drop.targetSiteId.toStdString();
@@ -121,8 +116,7 @@ std::vector<DeviceOutcome> assign(const std::vector<std::string> &records, const
     });
 }
 
-std::vector<DeviceOutcome> removeFromSite(const std::vector<std::string> &records, const QString &siteId,
-                                          JSON &changed) {
+std::vector<DeviceOutcome> removeFromSite(const JSON &records, const QString &siteId, JSON &changed) {
     const std::string site = siteId.toStdString();
     return changeSites(records, changed, [&](const QString &deviceId, JSON &ids) {
         if (siteId == Sites::overviewId || !holds(ids, site))

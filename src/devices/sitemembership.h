@@ -29,12 +29,11 @@ enum class Outcome {
     Added,
     Moved,
     Removed,
-    Unchanged, ///< in the target already, or not in the site that it was to leave
-    Unreadable ///< no device record
+    Unchanged ///< in the target already, or not in the site that it was to leave
 };
 
 struct DeviceOutcome {
-    QString deviceId; ///< empty for an unreadable record
+    QString deviceId;
     Outcome outcome;
 
     bool operator==(const DeviceOutcome &) const = default;
@@ -46,14 +45,13 @@ struct Drop {
     bool isMove = false; ///< leave the source site; nothing ever leaves the overview
 };
 
-/// Puts devices into a site. The records are JSON texts as DeviceRecord holds them; those that have to be
-/// committed come back in the array, with all their other members as they were. One outcome a record, in
-/// their order.
-std::vector<DeviceOutcome> assign(const std::vector<std::string> &records, const Drop &drop, JSON &changed);
+/// Puts devices into a site. The records are an array of the service's own; those that have to be committed
+/// come back in the other array, with all their other members as they were. One outcome a record, in their
+/// order.
+std::vector<DeviceOutcome> assign(const JSON &records, const Drop &drop, JSON &changed);
 
 /// Takes devices out of a site; they stay in the overview. The overview itself is not left this way: the
 /// service would forget the devices.
-std::vector<DeviceOutcome> removeFromSite(const std::vector<std::string> &records, const QString &siteId,
-                                          JSON &changed);
+std::vector<DeviceOutcome> removeFromSite(const JSON &records, const QString &siteId, JSON &changed);
 
 } // namespace SiteMembership

@@ -2,6 +2,7 @@
 #include "confirmdialog.h"
 #include "consolefixture.h"
 #include "countedtabwidget.h"
+#include "deviceplacement.h"
 #include "mainconsolemenu.h"
 #include "noticebar.h"
 #include "storewriter.h"
@@ -284,6 +285,55 @@ private slots:
         QCOMPARE(message[0][0].toString(),
                  QStringLiteral("1 device(s) deleted. 1 device(s) were left out: the server does not manage "
                                 "them any more."));
+    }
+
+    void whatOthersChangedIsKept() {
+        workOn(20);
+        QStringList sites;
+        for (QTreeWidgetItemIterator it(m_window->findChild<SiteTree *>()); *it; ++it)
+            sites += (*it)->data(0, SiteTree::siteIdRole).toString();
+        sites = sites.filter("SR");
+        QVERIFY(sites.size() > 2);
+        const QString id = m_window->devices()->at(0)->id;
+        const auto siteIds = [&] {
+            JSON devices;
+            onService([&](CApiClient &client) { return client.listDevices(0, 500, devices); });
+            for (const JSON &each : devices) {
+                if (stringMember(each, "id") == id)
+                    return DeviceRecords::parse(each)->siteIds;
+            }
+            return QStringList();
+        };
+        const auto putByAnother = [&](const QStringList &into) {
+            JSON ids = JSON::array({Sites::overviewId.toStdString()});
+            for (const QString &site : into)
+                ids.push_back(site.toStdString());
+            onService([&](CApiClient &client) {
+                return client.commitDevices(JSON::array({{{"id", id.toStdString()}, {"siteid", ids}}}),
+                                            "all");
+            });
+        };
+        QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
+        auto *placement = m_window->findChild<DevicePlacement *>();
+        // Right before each, so that no reading of the console has seen it.
+        putByAnother({sites[0]});
+        placement->drop(sites[1], {id}, Qt::CopyAction, Sites::overviewId);
+        QTRY_COMPARE(message.size(), 1);
+        QCOMPARE(siteIds(), (QStringList{Sites::overviewId, sites[0], sites[1]}));
+        putByAnother({sites[1], sites[2]});
+        placement->askToRemove({id}, sites[1]);
+        QTRY_VERIFY(visible<ConfirmDialog>());
+        visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
+        QTRY_COMPARE(message.size(), 2);
+        QCOMPARE(siteIds(), (QStringList{Sites::overviewId, sites[2]}));
+        // Nothing is sent on old records.
+        tell("fault code=5@/v1/dev/list,times=1");
+        placement->drop(sites[0], {id}, Qt::CopyAction, Sites::overviewId);
+        QTRY_COMPARE(message.size(), 3);
+        QCOMPARE(message[2][0].toString(),
+                 QStringLiteral(
+                     "Putting devices into the site failed: the server refused it. Nothing was changed."));
+        QCOMPARE(siteIds(), (QStringList{Sites::overviewId, sites[2]}));
     }
 
     void exportWritesTheShownRows() {

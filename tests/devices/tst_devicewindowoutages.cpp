@@ -5,8 +5,11 @@
 #include "refreshdevicedialog.h"
 #include "sessionevents.h"
 
+#include <QElapsedTimer>
 #include <QSignalSpy>
 #include <QToolButton>
+
+#include <nlohmann/json.hpp>
 
 class TestDeviceWindowOutages : public QObject, private ConsoleFixture {
     Q_OBJECT
@@ -76,6 +79,38 @@ private slots:
         QCoreApplication::processEvents();
         updater.reloadFor(stateless);
         QTRY_COMPARE(readings.size(), 5);
+    }
+
+    void readsAgainAsSoonAsTheLastReadingAllows() {
+        m_service.start({"--devices", "5"});
+        DeviceInventory inventory;
+        InventoryUpdater updater(inventory, [] { return 0; });
+        QSignalSpy readings(&updater, &InventoryUpdater::read);
+        tell("fault late=300@/v1/dev/list,times=1");
+        updater.reload();
+        QTRY_COMPARE(readings.size(), 1);
+        QElapsedTimer rest;
+        rest.start();
+        QVERIFY(QTest::qWaitFor(
+            [&] {
+                updater.reloadAfterRest();
+                return readings.size() == 2;
+            },
+            patienceMs));
+        QVERIFY2(rest.elapsed() >= 3000, qPrintable(QString::number(rest.elapsed())));
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        // What another client changes shows with the next check.
+        QCoreApplication::processEvents();
+        m_window->startWork();
+        QTRY_COMPARE_WITH_TIMEOUT(rowsOfAllTables(), 5, patienceMs);
+        const JSON renamed{{"id", m_window->devices()->at(0)->id.toStdString()}, {"d_model", "Zebra"}};
+        QTRY_VERIFY_WITH_TIMEOUT(visible<RefreshDeviceDialog>(), patienceMs);
+        QTRY_VERIFY_WITH_TIMEOUT(!visible<RefreshDeviceDialog>(), patienceMs);
+        QVERIFY(NetTask::waitForAll(patienceMs));
+        QCoreApplication::processEvents();
+        onService([&](CApiClient &client) { return client.commitDevices(JSON::array({renamed}), "all"); });
+        QTRY_COMPARE_WITH_TIMEOUT(m_window->devices()->at(0)->text(DeviceColumn::Model),
+                                  QStringLiteral("Zebra"), patienceMs);
     }
 
     void failedReadingRecovers() {
