@@ -55,6 +55,9 @@ int serve(const emulator::Options &options) {
     if (options.fresh) {
         files.discardStore();
     }
+    if (options.newKey) {
+        files.discardIdentity();
+    }
     useKeyOf(options.root);
     emulator::Faults faults(options.seed);
     for (const std::string &fault : options.faults) {

@@ -21,7 +21,8 @@ Place and store
   --host ADDRESS        address to listen on (127.0.0.1)
   --port N              port to listen on; 0: that of the last run, or a free one (0)
   --fresh               throw an existing store away; without it the store's fleet is kept
-The server's key and certificate are kept as nvldm-emulator.pem in DIR; it makes others when that is missing.
+  --new-key             make another key and certificate for the server, in place of those kept in DIR as
+                        nvldm-emulator.pem, as a service does that was installed anew
 Fleet
   --devices N           devices of a new fleet (500)
   --sites N             sites of a new fleet (12)
@@ -198,6 +199,7 @@ Setters valueSetters(Options &options) {
 
 std::map<std::string, bool *> switches(Options &options) {
     return {{"--fresh", &options.fresh},
+            {"--new-key", &options.newKey},
             {"--odd-records", &options.oddRecords},
             {"--help", &options.help},
             {"--version", &options.version}};

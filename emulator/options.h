@@ -49,6 +49,7 @@ struct Options {
     std::vector<OrbUser> orbUsers;
     std::int64_t orbSignInMs = 600000;
     bool fresh = false;
+    bool newKey = false;
     bool oddRecords = false;
     bool help = false;
     bool version = false;

@@ -15,6 +15,7 @@ public:
 
     std::filesystem::path storePath() const { return m_folder / "nvldm-emulator.sdb"; }
     void discardStore() const;
+    void discardIdentity() const { std::filesystem::remove(identityPath()); }
     /// The server's key and certificate; without the file the next run makes others.
     std::filesystem::path identityPath() const { return m_folder / "nvldm-emulator.pem"; }
 
