@@ -31,6 +31,22 @@
         <source>Licence</source>
         <translation>Lizenz</translation>
     </message>
+    <message>
+        <source>Key fingerprint</source>
+        <translation>Fingerabdruck des Schlüssels</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Kopieren</translation>
+    </message>
+    <message>
+        <source>Key of the service on this computer (SHA-256)</source>
+        <translation>Schlüssel des Dienstes auf diesem Computer (SHA-256)</translation>
+    </message>
+    <message>
+        <source>Key of the server %1 (SHA-256)</source>
+        <translation>Schlüssel des Servers %1 (SHA-256)</translation>
+    </message>
 </context>
 <context>
     <name>AccountManagementDialog</name>
@@ -2249,6 +2265,18 @@
         <source>The user guide cannot be opened. It is installed with the program.</source>
         <translation>Das Benutzerhandbuch kann nicht geöffnet werden. Es wird mit dem Programm installiert.</translation>
     </message>
+    <message>
+        <source>The key of the service on this computer is remembered from now on: %1</source>
+        <translation>Der Schlüssel des Dienstes auf diesem Computer ist von nun an gemerkt: %1</translation>
+    </message>
+    <message>
+        <source>The key of the server %1 is remembered from now on: %2</source>
+        <translation>Der Schlüssel des Servers %1 ist von nun an gemerkt: %2</translation>
+    </message>
+    <message>
+        <source>The new key is not trusted. Nothing is sent to the server.</source>
+        <translation>Dem neuen Schlüssel wird nicht vertraut. Es wird nichts an den Server gesendet.</translation>
+    </message>
 </context>
 <context>
     <name>InvalidDeviceDialog</name>
@@ -2675,6 +2703,10 @@
     <message>
         <source>The key file %1 cannot be used. Correct or remove it, then try again.</source>
         <translation>Die Schlüsseldatei %1 kann nicht verwendet werden. Berichtigen oder entfernen Sie sie und versuchen Sie es erneut.</translation>
+    </message>
+    <message>
+        <source>The server shows another key than before. Nothing was sent to it.</source>
+        <translation>Der Server zeigt einen anderen Schlüssel als bisher. Es wurde nichts an ihn gesendet.</translation>
     </message>
 </context>
 <context>
@@ -3137,6 +3169,22 @@
         <source>The list could not be saved; the saved one is as it was.</source>
         <translation>Die Liste konnte nicht gespeichert werden; die gespeicherte ist unverändert.</translation>
     </message>
+    <message>
+        <source>Key of the selected server</source>
+        <translation>Schlüssel des ausgewählten Servers</translation>
+    </message>
+    <message>
+        <source>Key Fingerprint</source>
+        <translation>Fingerabdruck</translation>
+    </message>
+    <message>
+        <source>First seen %1, last seen %2</source>
+        <translation>Zuerst gesehen: %1, zuletzt gesehen: %2</translation>
+    </message>
+    <message>
+        <source>The key of this server is remembered with the first login.</source>
+        <translation>Der Schlüssel dieses Servers wird bei der ersten Anmeldung gemerkt.</translation>
+    </message>
 </context>
 <context>
     <name>RestoreDeviceDialog</name>
@@ -3477,6 +3525,61 @@
     <message>
         <source>Enter an address or a name, with a port from 1 to 65535 behind a colon if need be.</source>
         <translation>Eine Adresse oder einen Namen eingeben, bei Bedarf mit einem Port von 1 bis 65535 hinter einem Doppelpunkt.</translation>
+    </message>
+</context>
+<context>
+    <name>ServerKeyDialog</name>
+    <message>
+        <source>Remembered key (SHA-256)</source>
+        <translation>Gemerkter Schlüssel (SHA-256)</translation>
+    </message>
+    <message>
+        <source>Remembered key</source>
+        <translation>Gemerkter Schlüssel</translation>
+    </message>
+    <message>
+        <source>New key (SHA-256)</source>
+        <translation>Neuer Schlüssel (SHA-256)</translation>
+    </message>
+    <message>
+        <source>New key</source>
+        <translation>Neuer Schlüssel</translation>
+    </message>
+    <message>
+        <source>This is normal after the service was installed anew; otherwise somebody may be listening in between. Ask whoever looks after the server for its key, and trust the new one only if it matches.</source>
+        <translation>Das ist normal, wenn der Dienst neu installiert wurde; sonst hört womöglich jemand dazwischen mit. Fragen Sie nach dem Schlüssel, wer den Server betreut, und vertrauen Sie dem neuen nur, wenn er übereinstimmt.</translation>
+    </message>
+    <message>
+        <source>Trust the new key</source>
+        <translation>Dem neuen Schlüssel vertrauen</translation>
+    </message>
+    <message>
+        <source>Do not trust</source>
+        <translation>Nicht vertrauen</translation>
+    </message>
+    <message>
+        <source>The service on this computer shows another key than before, so nothing was sent to it.</source>
+        <translation>Der Dienst auf diesem Computer zeigt einen anderen Schlüssel als bisher; deshalb wurde nichts an ihn gesendet.</translation>
+    </message>
+    <message>
+        <source>Server Key Changed</source>
+        <translation>Serverschlüssel geändert</translation>
+    </message>
+    <message>
+        <source>The service on this computer shows another key than before. Nothing is sent to it.</source>
+        <translation>Der Dienst auf diesem Computer zeigt einen anderen Schlüssel als bisher. Es wird nichts an ihn gesendet.</translation>
+    </message>
+    <message>
+        <source>The server %1 shows another key than before. Nothing is sent to it.</source>
+        <translation>Der Server %1 zeigt einen anderen Schlüssel als bisher. Es wird nichts an ihn gesendet.</translation>
+    </message>
+    <message>
+        <source>First seen %1, last seen %2</source>
+        <translation>Zuerst gesehen: %1, zuletzt gesehen: %2</translation>
+    </message>
+    <message>
+        <source>First seen %1</source>
+        <translation>Zuerst gesehen: %1</translation>
     </message>
 </context>
 <context>

@@ -31,6 +31,22 @@
         <source>Licence</source>
         <translation>ライセンス</translation>
     </message>
+    <message>
+        <source>Key fingerprint</source>
+        <translation>鍵のフィンガープリント</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>コピー</translation>
+    </message>
+    <message>
+        <source>Key of the service on this computer (SHA-256)</source>
+        <translation>このコンピューターのサービスの鍵 (SHA-256)</translation>
+    </message>
+    <message>
+        <source>Key of the server %1 (SHA-256)</source>
+        <translation>サーバー %1 の鍵 (SHA-256)</translation>
+    </message>
 </context>
 <context>
     <name>AccountManagementDialog</name>
@@ -2216,6 +2232,18 @@
         <source>The user guide cannot be opened. It is installed with the program.</source>
         <translation>ユーザーガイドを開けません。ユーザーガイドはプログラムと一緒にインストールされます。</translation>
     </message>
+    <message>
+        <source>The key of the service on this computer is remembered from now on: %1</source>
+        <translation>このコンピューターのサービスの鍵を記憶しました: %1</translation>
+    </message>
+    <message>
+        <source>The key of the server %1 is remembered from now on: %2</source>
+        <translation>サーバー %1 の鍵を記憶しました: %2</translation>
+    </message>
+    <message>
+        <source>The new key is not trusted. Nothing is sent to the server.</source>
+        <translation>新しい鍵は信頼されていません。サーバーには何も送信されません。</translation>
+    </message>
 </context>
 <context>
     <name>InvalidDeviceDialog</name>
@@ -2638,6 +2666,10 @@
     <message>
         <source>The key file %1 cannot be used. Correct or remove it, then try again.</source>
         <translation>キーファイル %1 を使用できません。修正または削除してから、もう一度お試しください。</translation>
+    </message>
+    <message>
+        <source>The server shows another key than before. Nothing was sent to it.</source>
+        <translation>サーバーの鍵が以前と異なります。サーバーには何も送信されていません。</translation>
     </message>
 </context>
 <context>
@@ -3095,6 +3127,22 @@
         <source>The list could not be saved; the saved one is as it was.</source>
         <translation>一覧を保存できませんでした。保存済みの一覧は元のままです。</translation>
     </message>
+    <message>
+        <source>Key of the selected server</source>
+        <translation>選択したサーバーの鍵</translation>
+    </message>
+    <message>
+        <source>Key Fingerprint</source>
+        <translation>鍵のフィンガープリント</translation>
+    </message>
+    <message>
+        <source>First seen %1, last seen %2</source>
+        <translation>初回: %1、最終: %2</translation>
+    </message>
+    <message>
+        <source>The key of this server is remembered with the first login.</source>
+        <translation>このサーバーの鍵は最初のログイン時に記憶されます。</translation>
+    </message>
 </context>
 <context>
     <name>RestoreDeviceDialog</name>
@@ -3429,6 +3477,61 @@
     <message>
         <source>Enter an address or a name, with a port from 1 to 65535 behind a colon if need be.</source>
         <translation>アドレスまたは名前を入力してください。必要に応じてコロンの後に 1～65535 のポートを付けてください。</translation>
+    </message>
+</context>
+<context>
+    <name>ServerKeyDialog</name>
+    <message>
+        <source>Remembered key (SHA-256)</source>
+        <translation>記憶している鍵 (SHA-256)</translation>
+    </message>
+    <message>
+        <source>Remembered key</source>
+        <translation>記憶している鍵</translation>
+    </message>
+    <message>
+        <source>New key (SHA-256)</source>
+        <translation>新しい鍵 (SHA-256)</translation>
+    </message>
+    <message>
+        <source>New key</source>
+        <translation>新しい鍵</translation>
+    </message>
+    <message>
+        <source>This is normal after the service was installed anew; otherwise somebody may be listening in between. Ask whoever looks after the server for its key, and trust the new one only if it matches.</source>
+        <translation>サービスを新しくインストールした後であれば正常ですが、そうでない場合は通信が傍受されている可能性があります。サーバーの管理者に鍵を確認し、一致する場合にのみ新しい鍵を信頼してください。</translation>
+    </message>
+    <message>
+        <source>Trust the new key</source>
+        <translation>新しい鍵を信頼する</translation>
+    </message>
+    <message>
+        <source>Do not trust</source>
+        <translation>信頼しない</translation>
+    </message>
+    <message>
+        <source>The service on this computer shows another key than before, so nothing was sent to it.</source>
+        <translation>このコンピューターのサービスの鍵が以前と異なるため、何も送信されていません。</translation>
+    </message>
+    <message>
+        <source>Server Key Changed</source>
+        <translation>サーバーの鍵の変更</translation>
+    </message>
+    <message>
+        <source>The service on this computer shows another key than before. Nothing is sent to it.</source>
+        <translation>このコンピューターのサービスの鍵が以前と異なります。何も送信されません。</translation>
+    </message>
+    <message>
+        <source>The server %1 shows another key than before. Nothing is sent to it.</source>
+        <translation>サーバー %1 の鍵が以前と異なります。何も送信されません。</translation>
+    </message>
+    <message>
+        <source>First seen %1, last seen %2</source>
+        <translation>初回: %1、最終: %2</translation>
+    </message>
+    <message>
+        <source>First seen %1</source>
+        <translation>初回: %1</translation>
     </message>
 </context>
 <context>

@@ -1,9 +1,13 @@
 #include "aboutdialog.h"
 
 #include "icons.h"
+#include "localstore.h"
+#include "serverkeys.h"
 #include "shippedparts.h"
 #include "ui_aboutdialog.h"
 
+#include <QClipboard>
+#include <QGuiApplication>
 #include <QHeaderView>
 
 #include <algorithm>
@@ -46,11 +50,23 @@ AboutDialog::AboutDialog(QWidget *parent)
     m_ui->logoLabel->setPixmap(Icons::pixmap(QStringLiteral(":/images/logo_mark.svg"), {48, 48}, 2.0));
     m_ui->nameLabel->setText(QCoreApplication::applicationName());
     m_ui->versionLabel->setText(QCoreApplication::applicationVersion());
+    showServerKey();
     fillParts();
     connect(m_ui->okButton, &QPushButton::clicked, this, &QDialog::accept);
 }
 
 AboutDialog::~AboutDialog() = default;
+
+void AboutDialog::showServerKey() {
+    const LoginInfo login = CLocalStore::instance().loginInfo();
+    m_ui->keyWidget->setVisible(!login.serverKey.empty());
+    m_ui->keyCaption->setText(login.server == ServerKeys::thisComputer
+                                  ? tr("Key of the service on this computer (SHA-256)")
+                                  : tr("Key of the server %1 (SHA-256)").arg(login.server));
+    m_ui->keyLabel->setText(ServerKeys::readable(login.serverKey));
+    connect(m_ui->copyKeyButton, &QPushButton::clicked, this,
+            [this] { QGuiApplication::clipboard()->setText(m_ui->keyLabel->text()); });
+}
 
 void AboutDialog::fillParts() {
     QTableWidget *table = m_ui->partsTable;

@@ -8,7 +8,8 @@ namespace Ui {
 class AboutDialog;
 }
 
-/// Name and version of the program, and whose work it is built on.
+/// Name and version of the program, the key of the server that it is connected to, and whose work it is built
+/// on.
 class AboutDialog : public FramelessDialog {
     Q_OBJECT
 
@@ -18,6 +19,7 @@ public:
 
 private:
     void fillParts();
+    void showServerKey();
 
     std::unique_ptr<Ui::AboutDialog> m_ui;
 };

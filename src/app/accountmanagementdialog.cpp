@@ -6,6 +6,7 @@
 #include "messagelog.h"
 #include "netjob.h"
 #include "passwordrule.h"
+#include "serverkeydialog.h"
 #include "ui_accountmanagementdialog.h"
 
 #include <QDebug>
@@ -68,6 +69,8 @@ void AccountManagementDialog::startChange(const Change &change) {
         [this](unsigned result) {
             if (result == ApiOk)
                 accept();
+            else if (result == ApiKeyChanged)
+                m_warning.setText(ServerKeyDialog::localKeyChangedText());
             else
                 m_warning.setText(tr("Change password failed."));
         },

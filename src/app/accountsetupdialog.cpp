@@ -6,6 +6,7 @@
 #include "messagelog.h"
 #include "netjob.h"
 #include "passwordrule.h"
+#include "serverkeydialog.h"
 #include "ui_accountsetupdialog.h"
 
 #include <QDebug>
@@ -67,6 +68,8 @@ void AccountSetupDialog::createAccount(const QString &email, const QString &pass
                 emit accountCreated();
             else if (result == ApiEmailTaken)
                 m_warning.setText(tr("This email is already taken."));
+            else if (result == ApiKeyChanged)
+                m_warning.setText(ServerKeyDialog::localKeyChangedText());
             else
                 m_warning.setText(tr("Create account failed."));
         },

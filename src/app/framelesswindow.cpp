@@ -16,6 +16,8 @@
 #include "popupmenu.h"
 #include "resizeedges.h"
 #include "rolloutmgr.h"
+#include "serverkeydialog.h"
+#include "serverkeys.h"
 #include "servicecontrol.h"
 #include "servicemanagement.h"
 #include "servicerequest.h"
@@ -155,11 +157,14 @@ void FramelessWindow::connectParts() {
     connect(m_titleBar->logOffAction(), &QAction::triggered, this, &FramelessWindow::onLogOff);
     connect(m_startCheck, &StartCheck::accountSetupNeeded, this, &FramelessWindow::openAccountSetupDialog);
     connect(m_startCheck, &StartCheck::loginNeeded, this, &FramelessWindow::openLoginDialog);
+    connect(m_startCheck, &StartCheck::keyChanged, this, &FramelessWindow::onLocalKeyChanged);
     connect(m_welcome, &WelcomePage::loginRequested, this, &FramelessWindow::checkLoginDialog);
     connect(m_idle, &IdleWatch::idle, this, &FramelessWindow::logoutIfIdle);
     connect(&Notifier::instance(), &Notifier::notificationClicked, this,
             &FramelessWindow::onNotificationClicked);
     connect(&SessionEvents::instance(), &SessionEvents::sessionLost, this, &FramelessWindow::onSessionLost);
+    connect(&SessionEvents::instance(), &SessionEvents::keyChanged, this,
+            &FramelessWindow::onServerKeyChanged);
     connectServiceManagement();
 }
 
@@ -214,6 +219,7 @@ void FramelessWindow::openLoginDialog(const QString &loginTip) {
         return;
     auto *dialog = new LoginDialog(loginTip, this);
     connect(dialog, &LoginDialog::loginSuccess, this, &FramelessWindow::onLoginSuccess);
+    connect(dialog, &LoginDialog::serverKeyKept, this, &FramelessWindow::onServerKeyKept);
     showDialog(dialog);
 }
 
@@ -356,6 +362,49 @@ void FramelessWindow::onSessionLost() {
     openLoginDialog(tr("Session Timeout"));
 }
 
+void FramelessWindow::onServerKeyKept(const QString &server) {
+    const QString key = ServerKeys::readable(ServerKeys::instance().fingerprint(server));
+    TransientMessage::show(
+        this, server == ServerKeys::thisComputer
+                  ? tr("The key of the service on this computer is remembered from now on: %1").arg(key)
+                  : tr("The key of the server %1 is remembered from now on: %2").arg(server, key));
+}
+
+void FramelessWindow::onLocalKeyChanged(const QString &fingerprint) {
+    if (m_loggedIn || m_dialog)
+        return;
+    const ServerKey remembered = ServerKeys::instance().find(ServerKeys::thisComputer).value_or(ServerKey());
+    auto *dialog = new ServerKeyDialog(ServerKeys::thisComputer, remembered, fingerprint, this);
+    connect(dialog, &QDialog::finished, this, [this, fingerprint](int result) {
+        m_dialog = nullptr;
+        if (result != QDialog::Accepted)
+            return openLoginDialog(ServerKeyDialog::localKeyChangedText());
+        ServerKeys::instance().trust(ServerKeys::thisComputer, fingerprint.toStdString());
+        checkLoginDialog();
+    });
+    showDialog(dialog);
+}
+
+/// Whatever else is open waits: the session can do nothing until the question is answered.
+void FramelessWindow::onServerKeyChanged(const QString &fingerprint) {
+    const LoginInfo login = CLocalStore::instance().loginInfo();
+    if (!m_loggedIn)
+        return;
+    ServerKey remembered = ServerKeys::instance().find(login.server).value_or(ServerKey());
+    if (remembered.fingerprint != login.serverKey)
+        remembered = {login.serverKey, {}, {}};
+    auto *dialog = new ServerKeyDialog(login.server, remembered, fingerprint, this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    dialog->setWindowModality(Qt::ApplicationModal);
+    connect(dialog, &QDialog::finished, this, [this](int result) {
+        SessionEvents::instance().answerKeyQuestion(result == QDialog::Accepted);
+        if (result != QDialog::Accepted && m_loggedIn)
+            TransientMessage::show(this, tr("The new key is not trusted. Nothing is sent to the server."),
+                                   TransientMessage::Kind::Error);
+    });
+    dialog->show();
+}
+
 void FramelessWindow::onRemoteServerChosen(const QString &serverId) {
     const auto change = [this, serverId] {
         endSession(Notice::TellService);
@@ -401,6 +450,7 @@ void FramelessWindow::tellLogOff() {
             CApiClient client(login.address.toUtf8().constData(), login.port);
             client.setAccount(login.account.toUtf8().constData());
             client.setAccessToken(login.token.constData());
+            client.expectServerKey(login.serverKey);
             return logOut(client, login);
         },
         [](unsigned result) {

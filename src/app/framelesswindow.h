@@ -92,6 +92,9 @@ private:
     void tellLogOff();
     void openAccountSetupDialog();
     void onSessionLost();
+    void onServerKeyKept(const QString &server);
+    void onLocalKeyChanged(const QString &fingerprint);
+    void onServerKeyChanged(const QString &fingerprint);
     void onNotificationClicked(int type);
     void onRemoteServerChosen(const QString &serverId);
     void showDialog(FramelessDialog *dialog);

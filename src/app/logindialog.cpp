@@ -9,6 +9,8 @@
 #include "messagelog.h"
 #include "netjob.h"
 #include "remoteconnectiondialog.h"
+#include "serverkeydialog.h"
+#include "serverkeys.h"
 #include "ui_logindialog.h"
 
 #include <QDebug>
@@ -23,6 +25,9 @@ struct LoginDialog::Credentials {
     ServerAddress server;
     QString account;
     QString password;
+
+    /// Under which the server's key is remembered.
+    QString keyName() const { return thisComputer ? ServerKeys::thisComputer : server.keyName(); }
 };
 
 struct LoginDialog::Outcome {
@@ -30,7 +35,9 @@ struct LoginDialog::Outcome {
     QString address;
     quint32 port = 0;
     QString account;
-    QByteArray token; ///< in cipher form
+    QByteArray token;      ///< in cipher form
+    std::string serverKey; ///< fingerprint that the server has shown
+    bool isKeyNew = false; ///< it was not remembered before
 };
 
 QString LoginDialog::unusableKeyText() {
@@ -143,7 +150,7 @@ void LoginDialog::startLogin(const Credentials &credentials) {
     const bool started = NetJob::post(
         m_runner.get(), this,
         [credentials, address, closed = m_closed] { return logIn(credentials, *address, *closed); },
-        [this](const Outcome &outcome) { onOutcome(outcome); },
+        [this, credentials](const Outcome &outcome) { onOutcome(credentials, outcome); },
         [this](JobEnd end) {
             setBusy(false);
             if (end != JobEnd::Delivered)
@@ -158,7 +165,7 @@ void LoginDialog::startLogin(const Credentials &credentials) {
 
 LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QString &address,
                                         const std::atomic_bool &closed) {
-    Outcome outcome{ApiException, address, credentials.server.port, credentials.account, {}};
+    Outcome outcome{ApiException, address, credentials.server.port, credentials.account, {}, {}};
     if (credentials.thisComputer) {
         outcome.port = CConfigStore().serverPort();
         qDebug("get local server port: %d", static_cast<int>(outcome.port));
@@ -170,16 +177,20 @@ LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QS
                MessageLog::secret(credentials.password).constData());
     }
     CApiClient client(address.toUtf8().constData(), outcome.port);
+    client.expectServerKey(ServerKeys::instance().fingerprint(credentials.keyName()));
     outcome.result = client.loginServer(credentials.account.toUtf8().constData(),
                                         credentials.password.toUtf8().constData());
+    outcome.serverKey = client.serverKey();
     if (outcome.result != ApiOk || client.accessToken().empty())
         return outcome;
+    client.expectServerKey(outcome.serverKey);
     if (closed) {
         // Nobody waits for this session any more, and the service counts it.
         client.logoutServer(client.accessToken().c_str());
         return outcome;
     }
     outcome.token = CLocalStore::instance().access();
+    outcome.isKeyNew = ServerKeys::instance().keep(credentials.keyName(), outcome.serverKey);
     CClientStore &store = CClientStore::instance();
     store.setThisComputer(credentials.thisComputer);
     const AccountInfo account{credentials.serverText, credentials.account,
@@ -191,7 +202,9 @@ LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QS
     return outcome;
 }
 
-void LoginDialog::onOutcome(const Outcome &outcome) {
+void LoginDialog::onOutcome(const Credentials &credentials, const Outcome &outcome) {
+    if (outcome.result == ApiKeyChanged)
+        askAboutKey(credentials, outcome);
     if (outcome.result == ApiOk && outcome.token.isEmpty()) {
         emit loginFail(tr("The server did not open a session. Try again."));
         return;
@@ -200,14 +213,31 @@ void LoginDialog::onOutcome(const Outcome &outcome) {
         qDebug("login failed! res: %d", static_cast<int>(outcome.result));
         emit loginFail(outcome.result == ApiCode108         ? tr("Server full.")
                        : outcome.result == ApiCipherFailure ? unusableKeyText()
-                                                            : tr("Incorrect email or password. Try again."));
+                       : outcome.result == ApiKeyChanged
+                           ? tr("The server shows another key than before. Nothing was sent to it.")
+                           : tr("Incorrect email or password. Try again."));
         return;
     }
     CLocalStore::instance().setLoginInfo(outcome.address, outcome.port, outcome.account, outcome.token);
     qDebug("login successfully! ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(outcome.address),
            static_cast<int>(outcome.port), qUtf8Printable(outcome.account),
            MessageLog::secret(outcome.token).constData());
+    CLocalStore::instance().setServerKey(credentials.keyName(), outcome.serverKey);
     emit loginSuccess();
+    if (outcome.isKeyNew)
+        emit serverKeyKept(credentials.keyName());
+}
+
+void LoginDialog::askAboutKey(const Credentials &credentials, const Outcome &outcome) {
+    const QString server = credentials.keyName();
+    const ServerKey remembered = ServerKeys::instance().find(server).value_or(ServerKey());
+    auto *dialog = new ServerKeyDialog(server, remembered, QString::fromStdString(outcome.serverKey), this);
+    dialog->setAttribute(Qt::WA_DeleteOnClose);
+    connect(dialog, &QDialog::accepted, this, [this, credentials, server, key = outcome.serverKey] {
+        ServerKeys::instance().trust(server, key);
+        startLogin(credentials);
+    });
+    dialog->open();
 }
 
 void LoginDialog::setBusy(bool busy) {

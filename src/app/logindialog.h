@@ -29,6 +29,8 @@ signals:
     /// The session is in the local store.
     void loginSuccess();
     void loginFail(const QString &reason);
+    /// After the first login to a server, as ServerKeys names it: its key is remembered from now on.
+    void serverKeyKept(const QString &server);
 
 public slots:
     void on_loginButton_clicked();
@@ -44,7 +46,8 @@ private:
     void showServer(const QString &text);
     void showChosenFields();
     void startLogin(const Credentials &credentials);
-    void onOutcome(const Outcome &outcome);
+    void onOutcome(const Credentials &credentials, const Outcome &outcome);
+    void askAboutKey(const Credentials &credentials, const Outcome &outcome);
     void setBusy(bool busy);
     void manageServers();
 

@@ -11,6 +11,7 @@
 #include "nettask.h"
 #include "processsetup.h"
 #include "requestdeadline.h"
+#include "serverkeys.h"
 #include "singleinstance.h"
 #include "storewriter.h"
 #include "theme.h"
@@ -84,6 +85,8 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         QApplication::setWindowIcon(applicationIcon());
         Theme::installFonts();
         LastFolder::load();
+        // Read here, so that no window waits for it.
+        StoreWriter::post([] { ServerKeys::instance(); });
         InterfaceLanguage language;
         language.use(CLocalStore::instance().uiLanguage());
         application.setStyleSheet(Theme::styleSheet());

@@ -3,14 +3,19 @@
 #include "clientstore.h"
 #include "messagelog.h"
 #include "plaintext.h"
+#include "serveraddress.h"
 #include "serverdialog.h"
+#include "serverkeys.h"
 #include "ui_remoteconnectiondialog.h"
 
 #include <QDateTime>
 #include <QDebug>
 #include <QHeaderView>
+#include <QLocale>
 
 #include <nlohmann/json.hpp>
+
+#include <optional>
 
 namespace {
 
@@ -30,6 +35,19 @@ JSON record(const QString &id, const QString &remember, const QString &name, con
             {"pass", password.toStdString()}, {"remember", remember.toStdString()}};
 }
 
+/// As ServerKeys names it; empty for an address that cannot be read.
+QString keyNameOf(const JSON &server) {
+    const std::optional<ServerAddress> address = ServerAddress::parse(stringMember(server, "info"));
+    return address ? address->keyName() : QString();
+}
+
+QStringList keyNamesOf(const JSON &servers) {
+    QStringList names;
+    for (const JSON &server : servers)
+        names.append(keyNameOf(server));
+    return names;
+}
+
 QTableWidgetItem *cell(const QString &value) {
     auto *item = new QTableWidgetItem(value);
     item->setToolTip(PlainText::toolTip(value));
@@ -45,10 +63,12 @@ RemoteConnectionDialog::RemoteConnectionDialog(QWidget *parent)
       m_servers(std::make_unique<JSON>(JSON::array())) {
     setObjectName(QStringLiteral("RemoteConnectionDialog"));
     setWindowTitle(tr("Remote Connection"));
-    m_ui->tableWidget->setColumnCount(2);
-    m_ui->tableWidget->setHorizontalHeaderLabels({tr("Server Name"), tr("Server Information")});
+    m_ui->tableWidget->setColumnCount(3);
+    m_ui->tableWidget->setHorizontalHeaderLabels(
+        {tr("Server Name"), tr("Server Information"), tr("Key Fingerprint")});
     m_ui->tableWidget->setSelectionMode(QAbstractItemView::SingleSelection);
-    m_ui->tableWidget->setColumnWidth(0, 240);
+    m_ui->tableWidget->setColumnWidth(0, 190);
+    m_ui->tableWidget->setColumnWidth(1, 190);
     connect(m_ui->remoteSearchEdit, &QLineEdit::textChanged, this, &RemoteConnectionDialog::filterRows);
     connect(m_ui->tableWidget, &QTableWidget::itemSelectionChanged, this,
             &RemoteConnectionDialog::updateButtons);
@@ -71,6 +91,7 @@ void RemoteConnectionDialog::load() {
     // A list that was begun anew would take the place of the one that could not be read.
     m_ui->addButton->setEnabled(loaded);
     m_ui->saveButton->setEnabled(loaded);
+    m_loadedServers = keyNamesOf(*m_servers);
     qDebug("list server: %s, size: %d", logText(*m_servers).constData(), static_cast<int>(m_servers->size()));
     fillTable();
 }
@@ -83,6 +104,8 @@ void RemoteConnectionDialog::fillTable() {
                qUtf8Printable(stringMember(server, "info")));
         m_ui->tableWidget->setItem(row, 0, cell(stringMember(server, "svrname")));
         m_ui->tableWidget->setItem(row, 1, cell(stringMember(server, "info")));
+        m_ui->tableWidget->setItem(
+            row, 2, cell(ServerKeys::readable(ServerKeys::instance().fingerprint(keyNameOf(server)))));
         ++row;
     }
     filterRows();
@@ -109,6 +132,23 @@ void RemoteConnectionDialog::updateButtons() {
     const bool selected = selectedRow() >= 0;
     m_ui->editButton->setEnabled(selected);
     m_ui->deleteButton->setEnabled(selected);
+    showKeyOfSelected();
+}
+
+/// The column has no room for the whole of it.
+void RemoteConnectionDialog::showKeyOfSelected() {
+    const int row = selectedRow();
+    const std::optional<ServerKey> key =
+        row < 0 ? std::nullopt
+                : ServerKeys::instance().find(keyNameOf((*m_servers)[static_cast<std::size_t>(row)]));
+    const auto timeText = [](const QDateTime &time) {
+        return QLocale().toString(time.toLocalTime(), QLocale::ShortFormat);
+    };
+    m_ui->keyLabel->setText(key ? ServerKeys::readable(key->fingerprint) : QString());
+    m_ui->keyTimeLabel->setText(
+        key       ? tr("First seen %1, last seen %2").arg(timeText(key->firstSeen), timeText(key->lastSeen))
+        : row < 0 ? QString()
+                  : tr("The key of this server is remembered with the first login."));
 }
 
 void RemoteConnectionDialog::openAddDialog() {
@@ -171,7 +211,15 @@ void RemoteConnectionDialog::save() {
         m_warning.setText(tr("The list could not be saved; the saved one is as it was."));
         return;
     }
+    forgetKeysBut(keyNamesOf(*m_servers));
     qDebug("save server list [%s] to database!", logText(*m_servers).constData());
     emit updateSvr();
     accept();
+}
+
+void RemoteConnectionDialog::forgetKeysBut(const QStringList &servers) const {
+    for (const QString &server : m_loadedServers) {
+        if (!servers.contains(server))
+            ServerKeys::instance().forget(server);
+    }
 }

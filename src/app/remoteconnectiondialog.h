@@ -38,8 +38,11 @@ private:
     void deleteSelected();
     void save();
     int selectedRow() const;
+    void showKeyOfSelected();
+    void forgetKeysBut(const QStringList &servers) const;
 
     std::unique_ptr<Ui::RemoteConnectionDialog> m_ui;
     WarningLine m_warning;
     std::unique_ptr<JSON> m_servers;
+    QStringList m_loadedServers; ///< as ServerKeys names them
 };

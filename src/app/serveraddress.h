@@ -15,6 +15,9 @@ struct ServerAddress {
     /// behind the port.
     static std::optional<ServerAddress> parse(const QString &text);
 
+    /// Under which its key is remembered: host and port in lower case, however they were typed.
+    QString keyName() const { return host.toLower() + QLatin1Char(':') + QString::number(port); }
+
     /// True for a dotted IPv4 address, which needs no look-up.
     bool isIpAddress() const;
 

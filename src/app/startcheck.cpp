@@ -12,7 +12,11 @@
 
 namespace {
 
-enum class LocalService { Silent, Fresh, HasAccounts };
+struct LocalService {
+    enum class State { Silent, Fresh, HasAccounts, OtherKey };
+    State state = State::Silent;
+    std::string key; ///< fingerprint, where it is another one
+};
 
 /// True for the one account that a service comes with.
 bool isFactoryAccount(const JSON &members) {
@@ -31,19 +35,24 @@ LocalService askLocalService() {
     const quint32 port = CConfigStore().serverPort();
     qDebug("get local server port: %d", static_cast<int>(port));
     std::uint32_t online = 0;
-    CApiLocalClient(port).isServerOnline(online);
+    CApiLocalClient client(port);
+    if (client.isServerOnline(online) == ApiKeyChanged)
+        return {LocalService::State::OtherKey, client.serverKey()};
     if (!online) {
         qDebug("HTTP API(isServerOnline) failed!");
-        return LocalService::Silent;
+        return {};
     }
     qDebug("Local server online!");
     JSON members;
-    if (CApiLocalClient(port).memberList(0, 10, members) != ApiOk)
+    const unsigned result = client.memberList(0, 10, members);
+    if (result == ApiKeyChanged)
+        return {LocalService::State::OtherKey, client.serverKey()};
+    if (result != ApiOk)
         qDebug("HTTP API(memberList) failed!");
     const auto list = members.is_object() ? members.find("data") : members.end();
     const std::size_t size = list != members.end() && list->is_array() ? list->size() : 0;
     qDebug("member list: %s, size: %d", dumpJson(members).c_str(), static_cast<int>(size));
-    return isFactoryAccount(members) ? LocalService::Fresh : LocalService::HasAccounts;
+    return {isFactoryAccount(members) ? LocalService::State::Fresh : LocalService::State::HasAccounts, {}};
 }
 
 } // namespace
@@ -62,11 +71,13 @@ void StartCheck::start() {
            "check the status of local server or connect to a remote server.");
     NetJob::post(
         m_runner.get(), this, askLocalService,
-        [this, silent](LocalService service) {
-            if (service == LocalService::Fresh)
+        [this, silent](const LocalService &service) {
+            if (service.state == LocalService::State::Fresh)
                 emit accountSetupNeeded();
+            else if (service.state == LocalService::State::OtherKey)
+                emit keyChanged(QString::fromStdString(service.key));
             else
-                emit loginNeeded(service == LocalService::Silent ? silent : QString());
+                emit loginNeeded(service.state == LocalService::State::Silent ? silent : QString());
         },
         [this, silent](JobEnd end) {
             if (end != JobEnd::Delivered)

@@ -20,6 +20,8 @@ signals:
     void accountSetupNeeded();
     /// Somebody has to log in; the tip says why this computer's service is not to be had, or is empty.
     void loginNeeded(const QString &tip);
+    /// The local service shows another key than the remembered one; nothing was sent to it.
+    void keyChanged(const QString &fingerprint);
 
 private:
     NetTask::Owner m_runner;

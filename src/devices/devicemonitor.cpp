@@ -74,11 +74,13 @@ void DeviceMonitor::checkConnection() {
     // In the user-interface thread on purpose: nothing else should be begun on a server that is gone. The
     // probe's own time-outs bound the wait.
     std::uint32_t online = 0;
+    unsigned result = ApiException;
     NetTask::runAndWait([&] {
-        ServiceSession(login).call([&](CApiClient &client) { return client.isServerOnline(online); });
+        result =
+            ServiceSession(login).call([&](CApiClient &client) { return client.isServerOnline(online); });
     });
     if (online)
         emit serverAnswered();
-    else
+    else if (result != ApiKeyChanged || !SessionEvents::instance().isKeyInQuestion())
         emit serverLost();
 }

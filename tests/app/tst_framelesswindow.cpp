@@ -16,6 +16,8 @@
 #include "mainconsoletable.h"
 #include "mainwindow.h"
 #include "notifier.h"
+#include "reconnectingdialog.h"
+#include "serverkeydialog.h"
 #include "servicemanagementaddservicedialog.h"
 #include "servicesession.h"
 #include "sidepanel.h"
@@ -23,6 +25,7 @@
 #include "titlebar.h"
 #include "welcomepage.h"
 
+#include <QClipboard>
 #include <QComboBox>
 #include <QDesktopServices>
 #include <QDir>
@@ -321,6 +324,53 @@ private slots:
         QVERIFY(!m_window->isLoggedIn());
         QVERIFY(showsWelcome());
         QCOMPARE(shownRows(), 0);
+    }
+
+    void changedServerKeyStopsTheSession_data() {
+        QTest::addColumn<bool>("trusted");
+        QTest::newRow("trusted") << true;
+        QTest::newRow("refused") << false;
+    }
+    void changedServerKeyStopsTheSession() {
+        QFETCH(bool, trusted);
+        logIn();
+        const std::string first = CLocalStore::instance().loginInfo().serverKey;
+        QCOMPARE(ServerKeys::instance().fingerprint(ServerKeys::thisComputer), first);
+        titleBar()->aboutAction()->trigger();
+        QTRY_VERIFY(Form::visible<AboutDialog>());
+        Form::click(Form::visible<AboutDialog>(), "copyKeyButton");
+        QCOMPARE(QGuiApplication::clipboard()->text(), ServerKeys::readable(first));
+
+        m_service.kill();
+        QVERIFY(m_service.start({"--new-key"}));
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<ServerKeyDialog>(), patienceMs);
+        QVERIFY(Form::visible<AboutDialog>());
+        QTest::qWait(4000);
+        QCOMPARE(m_window->findChildren<ServerKeyDialog *>().size(), 1);
+        QCOMPARE(QApplication::activeModalWidget(), Form::visible<ServerKeyDialog>());
+        QCOMPARE(CLocalStore::instance().loginInfo().serverKey, first);
+        Form::click(Form::visible<ServerKeyDialog>(), trusted ? "trustButton" : "cancelButton");
+        QTRY_VERIFY(!Form::visible<ServerKeyDialog>());
+        Form::click(Form::visible<AboutDialog>(), "okButton");
+        if (trusted) {
+            QVERIFY(CLocalStore::instance().loginInfo().serverKey != first);
+            unsigned result = ApiException;
+            NetTask::runAndWait([&] {
+                ServiceSession session(CLocalStore::instance().loginInfo());
+                result = session.call([](CApiClient &client) { return client.removeSite("none"); });
+            });
+            QVERIFY2(result != ApiKeyChanged, "requests reach the service again");
+            return;
+        }
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<ReconnectingDialog>(), patienceMs);
+        Form::click(Form::visible<ReconnectingDialog>(), "disconnectButton");
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<ServerKeyDialog>(), patienceMs);
+        QVERIFY2(!m_window->isLoggedIn(), "it is the check before the login that asks now");
+        QTest::keyClick(Form::visible<ServerKeyDialog>(), Qt::Key_Escape);
+        QTRY_VERIFY(Form::visible<LoginDialog>());
+        QVERIFY(Form::text(Form::visible<LoginDialog>(), "tipLabel").contains("another key than before"));
+        QCOMPARE(ServerKeys::instance().fingerprint(ServerKeys::thisComputer), first);
+        ServerKeys::instance().forget(ServerKeys::thisComputer);
     }
 
     void closedLoginDialogIsComeBackTo() {

@@ -8,6 +8,7 @@
 #include "nettask.h"
 #include "remoteconnectiondialog.h"
 #include "scriptedpeer.h"
+#include "serverkeydialog.h"
 
 #include <QComboBox>
 #include <QFile>
@@ -242,6 +243,63 @@ private slots:
         m_dialog.reset();
         QCOMPARE(log.count("LoginDialog constructor"), 1);
         QCOMPARE(log.count("LoginDialog destructor"), 2);
+    }
+
+    void changedKeyIsAskedAbout_data() {
+        QTest::addColumn<bool>("here");
+        QTest::addColumn<bool>("trusted");
+        QTest::newRow("this computer, trusted") << true << true;
+        QTest::newRow("this computer, refused") << true << false;
+        QTest::newRow("remote, trusted") << false << true;
+        QTest::newRow("remote, refused") << false << false;
+    }
+    void changedKeyIsAskedAbout() {
+        QFETCH(bool, here);
+        QFETCH(bool, trusted);
+        const QString address = "127.0.0.1:" + QString::number(m_service.port());
+        const QString server = here ? ServerKeys::thisComputer : address;
+        ServerKeys &keys = ServerKeys::instance();
+        keys.forget(server);
+        const auto logIn = [&] {
+            open();
+            here ? fillLocal(email, password) : fillRemote(address);
+            QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+        };
+        for (const int kept : {1, 0}) {
+            logIn();
+            const QSignalSpy told(m_dialog.get(), &LoginDialog::serverKeyKept);
+            QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), 1, patienceMs);
+            QCOMPARE(told.size(), kept);
+        }
+        const std::string first = keys.fingerprint(server);
+        QCOMPARE(CLocalStore::instance().loginInfo().serverKey, first);
+        QCOMPARE(CLocalStore::instance().loginInfo().server, server);
+
+        QVERIFY(m_service.stop());
+        QVERIFY(m_service.start({"--devices", "0", "--new-key", "--account", email + u':' + password}));
+        QCOMPARE(m_service.command("expire-sessions"), QStringLiteral("ok"));
+        logIn();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<ServerKeyDialog>(), patienceMs);
+        const auto *question = Form::visible<ServerKeyDialog>();
+        QVERIFY(tip().startsWith("The server shows another key than before.") && !isBusy());
+        QCOMPARE(Form::text(question, "rememberedKeyLabel").replace(u'\n', u' '),
+                 ServerKeys::readable(first));
+        QVERIFY(Form::text(question, "rememberedTimeLabel")
+                    .contains(QString::number(QDate::currentDate().day())));
+        const QString shown = Form::text(question, "newKeyLabel").replace(u'\n', u' ');
+        QVERIFY(shown != ServerKeys::readable(first));
+        QCOMPARE(sessions(), 0);
+        QVERIFY(QTest::qWaitForWindowActive(Form::visible<ServerKeyDialog>()));
+        // The Enter key does not trust by accident.
+        if (trusted)
+            QTest::keyClick(QApplication::focusWidget(), Qt::Key_Backtab);
+        QTest::keyClick(QApplication::focusWidget(), trusted ? Qt::Key_Space : Qt::Key_Return);
+        QTRY_VERIFY(!Form::visible<ServerKeyDialog>());
+        QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), trusted ? 1 : 0, patienceMs);
+        QCOMPARE(sessions(), trusted ? 1 : 0);
+        QCOMPARE(ServerKeys::readable(keys.fingerprint(server)),
+                 trusted ? shown : ServerKeys::readable(first));
+        keys.forget(server);
     }
 
     void mayBeClosedWhileTheLoginRuns() {

@@ -6,6 +6,7 @@
 #include "nvldmstore.h"
 #include "remoteconnectiondialog.h"
 #include "serverdialog.h"
+#include "serverkeys.h"
 
 #include <QCheckBox>
 #include <QRegularExpression>
@@ -122,6 +123,27 @@ private slots:
         Form::click(m_dialog.get(), "deleteButton");
         Form::click(m_dialog.get(), "saveButton");
         QCOMPARE(saved("svrname"), QStringLiteral("Alpha|<b>Mike</b>"));
+    }
+
+    void keyIsShownAndForgotten() {
+        ServerKeys &keys = ServerKeys::instance();
+        const std::string key(64, 'a');
+        keys.trust("10.0.0.1:8079", key);
+        keys.trust("10.0.0.2:8079", std::string(64, 'b'));
+        init();
+        QCOMPARE(m_table->item(0, 2)->text(), ServerKeys::readable(key));
+        QCOMPARE(m_table->item(2, 2)->text(), QString());
+        choose(0);
+        QCOMPARE(Form::text(m_dialog.get(), "keyLabel"), ServerKeys::readable(key));
+        QVERIFY(Form::text(m_dialog.get(), "keyTimeLabel").startsWith("First seen"));
+        for (const char *button : {"cancelButton", "saveButton"}) {
+            init();
+            choose(0);
+            Form::click(m_dialog.get(), "deleteButton");
+            Form::click(m_dialog.get(), button);
+            QCOMPARE(keys.find("10.0.0.1:8079").has_value(), button == QByteArray("cancelButton"));
+        }
+        QVERIFY(keys.find("10.0.0.2:8079"));
     }
 
     /// What is stored is not replaced by a list that never showed it.

@@ -33,6 +33,11 @@ private slots:
         QTEST(server ? server->host + u'|' + QString::number(server->port) : QString(), "expected");
     }
 
+    void keyName() {
+        for (const char *text : {"Cameras.Example", "cameras.example:8079"})
+            QCOMPARE(ServerAddress::parse(text).value().keyName(), QStringLiteral("cameras.example:8079"));
+    }
+
     void isIpAddress() {
         for (const char *host : {"0.0.0.0", "10.0.0.1", "255.255.255.255", "192.168.001.01"})
             QVERIFY2(ServerAddress{host}.isIpAddress(), host);
