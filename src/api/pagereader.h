@@ -8,6 +8,9 @@ class ServiceSession;
 
 namespace PageReader {
 
+/// How many devices, states or sites are asked for at a time.
+inline constexpr int recordsOfPage = 2000;
+
 /// A method of the client that lists a page: first record, number of records, the page.
 using ListCall = unsigned (CApiClient::*)(int, int, JSON &);
 

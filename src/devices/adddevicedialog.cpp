@@ -31,14 +31,12 @@ struct AddDeviceDialog::Addition {
 
 namespace {
 
-constexpr int pageSize = 500;
-
 std::string macOf(const JSON &record) {
     return DeviceRecords::identityOf({{"d_mac", std::string(textMember(record, "d_mac"))}}).toStdString();
 }
 
 unsigned readMacs(ServiceSession &session, std::unordered_set<std::string> &macs) {
-    return PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
+    return PageReader::readAll(session, &CApiClient::listDevices, PageReader::recordsOfPage, [&](JSON &page) {
         for (const JSON &record : page)
             macs.insert(macOf(record));
     });

@@ -20,7 +20,6 @@ namespace DeviceOperations {
 
 namespace {
 
-constexpr int pageSize = 500;
 /// Devices take commands in a buffer of this size, with the zero at the end.
 constexpr std::size_t commandSize = 256;
 
@@ -172,8 +171,8 @@ Outcome authorize(ServiceSession &session, const QStringList &deviceIds, const Q
 std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStringList &deviceIds) {
     const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
     std::map<DeviceStatusCode, int> states;
-    const unsigned result =
-        PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](const JSON &page) {
+    const unsigned result = PageReader::readAll(
+        session, &CApiClient::listDeviceStatus, PageReader::recordsOfPage, [&](const JSON &page) {
             for (const JSON &status : page) {
                 if (wanted.contains(stringMember(status, "id")))
                     ++states[DeviceStatus::codeOf(textMember(status, "connect_status"),

@@ -13,7 +13,6 @@ namespace InventoryReader {
 
 namespace {
 
-constexpr int pageSize = 500;
 /// The record as it was, when it says the same: then nothing has to be read, kept or painted anew.
 DeviceRecordPtr recordOf(const JSON &value, const DeviceSnapshot &previous) {
     const int index = previous.indexOf(DeviceRecords::identityOf(value));
@@ -35,14 +34,15 @@ bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
 DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous) {
     std::vector<DeviceRecordPtr> records;
     int unreadable = 0;
-    const unsigned result = PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
-        for (const JSON &value : page) {
-            if (DeviceRecordPtr record = recordOf(value, *previous))
-                records.push_back(std::move(record));
-            else
-                ++unreadable;
-        }
-    });
+    const unsigned result =
+        PageReader::readAll(session, &CApiClient::listDevices, PageReader::recordsOfPage, [&](JSON &page) {
+            for (const JSON &value : page) {
+                if (DeviceRecordPtr record = recordOf(value, *previous))
+                    records.push_back(std::move(record));
+                else
+                    ++unreadable;
+            }
+        });
     if (result != ApiOk) {
         qDebug("HTTP API(listDevices) failed!");
         return nullptr;
@@ -68,8 +68,8 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
     std::vector<bool> seen(size, false);
     int unreadable = 0;
     int readable = 0;
-    const unsigned result =
-        PageReader::readAll(session, &CApiClient::listDeviceStatus, pageSize, [&](JSON &page) {
+    const unsigned result = PageReader::readAll(
+        session, &CApiClient::listDeviceStatus, PageReader::recordsOfPage, [&](JSON &page) {
             for (const JSON &record : page) {
                 std::string id(textMember(record, "id"));
                 ++(id.empty() ? unreadable : readable);
@@ -120,10 +120,11 @@ std::vector<DeviceStatusCode> carriedOver(const DeviceSnapshot &snapshot, const 
 
 std::optional<Sites::List> readSites(ServiceSession &session) {
     JSON all = JSON::array();
-    const unsigned result = PageReader::readAll(session, &CApiClient::listSites, pageSize, [&](JSON &page) {
-        for (JSON &site : page)
-            all.push_back(std::move(site));
-    });
+    const unsigned result =
+        PageReader::readAll(session, &CApiClient::listSites, PageReader::recordsOfPage, [&](JSON &page) {
+            for (JSON &site : page)
+                all.push_back(std::move(site));
+        });
     if (result != ApiOk) {
         qDebug("HTTP API(listSites) failed!");
         return std::nullopt;

@@ -9,16 +9,10 @@
 
 #include <nlohmann/json.hpp>
 
-namespace {
-
-constexpr int pageSize = 500;
-
-} // namespace
-
 DevicesLeft DevicesLeft::among(const QStringList &deviceIds, ServiceSession &session) {
     QHash<QString, QString> macs;
-    const unsigned result =
-        PageReader::readAll(session, &CApiClient::listDevices, pageSize, [&](const JSON &page) {
+    const unsigned result = PageReader::readAll(
+        session, &CApiClient::listDevices, PageReader::recordsOfPage, [&](const JSON &page) {
             for (const JSON &device : page)
                 macs.insert(stringMember(device, "id"), TaskTargets::plainMac(stringMember(device, "d_mac")));
         });
