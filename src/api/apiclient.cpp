@@ -2,6 +2,7 @@
 
 #include "apppaths.h"
 #include "ciphers.h"
+#include "envelope.h"
 #include "httpexchange.h"
 #include "messagelog.h"
 #include "transfererror.h"
@@ -60,11 +61,12 @@ int codeOf(const JSON &body) {
     return static_cast<int>(std::clamp(code.get<std::int64_t>(), -limit, limit));
 }
 
-JSON decipher(const JSON &data) {
-    const std::optional<std::string> plain = Ciphers::openData(data.get_ref<const std::string &>());
+std::string decipher(const Envelope &answer) {
+    std::optional<std::string> plain = Ciphers::openData(
+        answer.data ? *answer.data : answer.members.at("data").get_ref<const std::string &>());
     if (!plain)
         throw std::runtime_error("data cannot be deciphered");
-    return parseJson(*plain);
+    return *std::move(plain);
 }
 
 } // namespace
@@ -105,14 +107,14 @@ bool CApiClient::hasSession() const {
     return !m_strAccess.empty() && !m_strAccount.empty();
 }
 
-unsigned CApiClient::postAsAccount(const Call &call, JSON body, JSON *output) {
+unsigned CApiClient::postAsAccount(const Call &call, JSON body, const Output &output) {
     if (!hasSession())
         return ApiInvalidArgument;
     body["id"] = m_strAccount;
     return post(call, body, output);
 }
 
-unsigned CApiClient::post(const Call &call, const JSON &body, JSON *output) {
+unsigned CApiClient::post(const Call &call, const JSON &body, const Output &output) {
     return send(
         call,
         [&body](HttpRequest &request) {
@@ -123,7 +125,7 @@ unsigned CApiClient::post(const Call &call, const JSON &body, JSON *output) {
         output);
 }
 
-unsigned CApiClient::send(const Call &call, const Fill &fill, JSON *output) {
+unsigned CApiClient::send(const Call &call, const Fill &fill, const Output &output) {
     try {
         return exchange(call, fill, output);
     } catch (const TransferError &error) {
@@ -140,7 +142,7 @@ unsigned CApiClient::send(const Call &call, const Fill &fill, JSON *output) {
     return ApiException;
 }
 
-unsigned CApiClient::exchange(const Call &call, const Fill &fill, JSON *output) {
+unsigned CApiClient::exchange(const Call &call, const Fill &fill, const Output &output) {
     HttpRequest request;
     request.host = m_strHost;
     request.port = m_uPort;
@@ -190,26 +192,30 @@ void CApiClient::logException(const Call &call, const std::string &error) {
         call.logException(call, error);
 }
 
-unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, JSON *output) {
+unsigned CApiClient::judge(const Call &call, const HttpAnswer &answer, const Output &output) {
     if (answer.status != 200)
         return ApiHttpStatusError;
     if (answer.isFile) {
         renewToken(call, answer.authorization);
         return ApiOk;
     }
-    const JSON body = parseJson(answer.body);
-    const unsigned result = (call.judgeCode ? call.judgeCode : judgeUsualCode)(codeOf(body));
+    const Envelope body = call.payload == Payload::Ciphered ? Envelope::open(answer.body)
+                                                            : Envelope{parseJson(answer.body), {}};
+    const unsigned result = (call.judgeCode ? call.judgeCode : judgeUsualCode)(codeOf(body.members));
     if (result != ApiOk)
         return result;
     renewToken(call, answer.authorization);
     if (call.payload == Payload::File)
         return ApiMissingData;
-    if (call.payload == Payload::None || !output)
+    if (call.payload == Payload::None || output.isEmpty())
         return ApiOk;
-    const auto data = body.find("data");
-    if (data == body.end())
+    const auto data = body.members.find("data");
+    if (data == body.members.end())
         return ApiMissingData;
-    *output = call.payload == Payload::Ciphered ? decipher(*data) : *data;
+    if (output.text)
+        *output.text = decipher(body);
+    else
+        *output.value = call.payload == Payload::Ciphered ? parseJson(decipher(body)) : *data;
     return ApiOk;
 }
 

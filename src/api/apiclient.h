@@ -89,6 +89,10 @@ public:
     /// A page of status records; nStart counts from 0.
     virtual unsigned listDeviceStatus(int nStart, int nCount, JSON &statuses);
 
+    /// The same pages as the text of an array: who reads them again and again looks at what is new alone.
+    unsigned listDevicesText(int nStart, int nCount, std::string &text);
+    unsigned listDeviceStatusText(int nStart, int nCount, std::string &text);
+
     // Commands on devices
 
     /// A page of the stored custom commands; nStart counts from 0.
@@ -210,10 +214,20 @@ protected:
         const char *renewal = nullptr; ///< begins the log line of a renewed token, in place of the usual
     };
 
+    /// Where the data of an answer go: as a value, as the text of ciphered ones, or nowhere.
+    struct Output {
+        Output(JSON *wanted = nullptr) : value(wanted) {}
+        Output(std::string *wanted) : text(wanted) {}
+        bool isEmpty() const { return !value && !text; }
+
+        JSON *value = nullptr;
+        std::string *text = nullptr;
+    };
+
     /// Sends body to the call's path by POST and judges the answer. output: set where the call has a payload.
-    unsigned post(const Call &call, const JSON &body, JSON *output = nullptr);
+    unsigned post(const Call &call, const JSON &body, const Output &output = {});
     /// The same for an authenticated method: checks the preconditions and adds "id" to the body.
-    unsigned postAsAccount(const Call &call, JSON body, JSON *output = nullptr);
+    unsigned postAsAccount(const Call &call, JSON body, const Output &output = {});
 
     /// True when there is what every authenticated method needs.
     bool hasSession() const;
@@ -227,13 +241,14 @@ private:
     /// Gives a request, which has what all of them have, what it has of its own.
     using Fill = std::function<void(HttpRequest &)>;
 
-    unsigned send(const Call &call, const Fill &fill, JSON *output);
-    unsigned exchange(const Call &call, const Fill &fill, JSON *output);
+    unsigned send(const Call &call, const Fill &fill, const Output &output = {});
+    unsigned exchange(const Call &call, const Fill &fill, const Output &output);
     /// With the server's key looked at.
     HttpAnswer exchange(HttpRequest &request);
     /// Of a request without an answer.
     static unsigned transportResult(const HttpAnswer &answer);
 
+    unsigned postPage(const char *method, const char *path, int nStart, int nCount, const Output &output);
     /// How the uploads differ from the rest of the road.
     static Call uploadCall(const char *method, const char *path, const char *transportError = nullptr);
     static Call certificateCall(const char *method, const char *path);
@@ -243,7 +258,7 @@ private:
     std::shared_ptr<Transfer> transferOrOwn() const;
 
     unsigned postAboutOrb(const char *method, const char *path, JSON body, JSON *cipheredData = nullptr);
-    unsigned judge(const Call &call, const HttpAnswer &answer, JSON *output);
+    unsigned judge(const Call &call, const HttpAnswer &answer, const Output &output);
     /// What a request without a session is authorized with; throws when none can be made.
     static std::string freshGenericToken();
     static void logException(const Call &call, const std::string &error);

@@ -10,15 +10,16 @@ namespace {
 
 constexpr const char *siteRoot = "SR000000000000";
 
-JSON page(int nStart, int nCount) {
-    return {{"start", nStart}, {"count", nCount}};
-}
-
 const char *orRoot(const char *szParent) {
     return szParent && *szParent ? szParent : siteRoot;
 }
 
 } // namespace
+
+unsigned CApiClient::postPage(const char *method, const char *path, int nStart, int nCount,
+                              const Output &output) {
+    return postAsAccount({method, path, Payload::Ciphered}, {{"start", nStart}, {"count", nCount}}, output);
+}
 
 unsigned CApiClient::addSite(const char *szName, const char *szParent, std::string &strSiteId) {
     if (isEmpty(szName))
@@ -49,7 +50,7 @@ unsigned CApiClient::removeSite(const char *szSiteId) {
 }
 
 unsigned CApiClient::listSites(int nStart, int nCount, JSON &sites) {
-    return postAsAccount({"listSites", "/v1/site/list", Payload::Ciphered}, page(nStart, nCount), &sites);
+    return postPage("listSites", "/v1/site/list", nStart, nCount, &sites);
 }
 
 unsigned CApiClient::commitSites(const JSON &sites, const char *szStage) {
@@ -59,7 +60,11 @@ unsigned CApiClient::commitSites(const JSON &sites, const char *szStage) {
 }
 
 unsigned CApiClient::listDevices(int nStart, int nCount, JSON &devices) {
-    return postAsAccount({"listDevices", "/v1/dev/list", Payload::Ciphered}, page(nStart, nCount), &devices);
+    return postPage("listDevices", "/v1/dev/list", nStart, nCount, &devices);
+}
+
+unsigned CApiClient::listDevicesText(int nStart, int nCount, std::string &text) {
+    return postPage("listDevices", "/v1/dev/list", nStart, nCount, &text);
 }
 
 unsigned CApiClient::commitDevices(const JSON &devices, const char *szStage) {
@@ -109,6 +114,9 @@ unsigned CApiClient::authDevices(const JSON &devices, const char *szAccount, con
 }
 
 unsigned CApiClient::listDeviceStatus(int nStart, int nCount, JSON &statuses) {
-    return postAsAccount({"listDeviceStatus", "/v1/dstatus/list", Payload::Ciphered}, page(nStart, nCount),
-                         &statuses);
+    return postPage("listDeviceStatus", "/v1/dstatus/list", nStart, nCount, &statuses);
+}
+
+unsigned CApiClient::listDeviceStatusText(int nStart, int nCount, std::string &text) {
+    return postPage("listDeviceStatus", "/v1/dstatus/list", nStart, nCount, &text);
 }

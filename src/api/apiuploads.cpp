@@ -107,19 +107,16 @@ unsigned CApiClient::upload(const Call &call, const char *szTaskId, JSON paramet
     const std::shared_ptr<Transfer> transfer = transferOrOwn();
     transfer->begin(0);
     MultipartBody form;
-    return send(
-        call,
-        [&](HttpRequest &request) {
-            form.addText("text", "data", dumpJson(parameters));
-            for (const UploadPart &file : files)
-                form.addFile(file);
-            form.close();
-            transfer->begin(form.length());
-            request.transfer = transfer.get();
-            request.form = &form;
-            request.contentType = form.contentType();
-        },
-        nullptr);
+    return send(call, [&](HttpRequest &request) {
+        form.addText("text", "data", dumpJson(parameters));
+        for (const UploadPart &file : files)
+            form.addFile(file);
+        form.close();
+        transfer->begin(form.length());
+        request.transfer = transfer.get();
+        request.form = &form;
+        request.contentType = form.contentType();
+    });
 }
 
 unsigned CApiClient::uploadConfigFile(const char *szTaskId, const char *szPath, const char *szFileName,
@@ -214,7 +211,7 @@ unsigned CApiClient::exportFile(const char *szTaskId, const char *szTarget) {
         request.transfer = transfer.get();
         request.target = &target;
     };
-    const unsigned result = send({"exportFile", "/v1/export/file", Payload::File}, fill, nullptr);
+    const unsigned result = send({"exportFile", "/v1/export/file", Payload::File}, fill);
     if (result != ApiOk || target.finish())
         return result;
     transfer->fail(TransferFailure::TargetNotWritten, target.name());

@@ -123,6 +123,20 @@ void TestApiClientJudging::judgesAnswers_data() {
     QTest::newRow("code 2^32") << json(R"({"code":4294967296})") << 15u << 15u;
     QTest::newRow("code 2^64-1") << json(R"({"code":18446744073709551615})") << 15u << 15u;
 
+    const std::string two = sealed("[1,2]");
+    QTest::newRow("data before the code") << json(R"({ "data" : ")" + two + R"(" , "code":0})") << 0u << 0u;
+    QTest::newRow("other letters around data")
+        << json(R"({"msg":"\"data\": \u00e4 ä","data":")" + two + R"(","code":0})") << 0u << 0u;
+    QTest::newRow("data with an escaped letter")
+        << json(R"({"code":0,"data":"\u0044)" + two.substr(1) + "\"}") << 0u << 0u;
+    QTest::newRow("an inner data is none")
+        << json(R"({"code":0,"more":{"data":")" + two + "\"}}") << 14u << 0u;
+    QTest::newRow("data as a text") << json(R"({"code":0,"more":["data"]})") << 14u << 0u;
+    QTest::newRow("data twice: the last counts")
+        << json(R"({"code":0,"data":"D1:AAAA","data":")" + two + "\"}") << 0u << 0u;
+    QTest::newRow("data does not end") << json(R"({"code":0,"data":")" + two + "}") << 1u << 1u;
+    QTest::newRow("broken behind data") << json(list + "}") << 1u << 1u;
+
     QTest::newRow("data not ciphered") << json(R"({"code":0,"data":[1,2]})") << 1u << 0u;
     QTest::newRow("data null") << json(R"({"code":0,"data":null})") << 1u << 0u;
     QTest::newRow("data does not decipher") << json(R"({"code":0,"data":"D1:AAAA"})") << 1u << 0u;
