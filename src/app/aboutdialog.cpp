@@ -53,6 +53,7 @@ AboutDialog::AboutDialog(QWidget *parent)
     showServerKey();
     fillParts();
     connect(m_ui->okButton, &QPushButton::clicked, this, &QDialog::accept);
+    m_ui->okButton->setFocus();
 }
 
 AboutDialog::~AboutDialog() = default;
