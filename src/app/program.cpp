@@ -63,7 +63,8 @@ int runWindows(QApplication &application, const std::function<void(QWidget &)> &
 namespace Program {
 
 int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown) {
-    SingleInstance instance(AppPaths::instanceKey());
+    ProcessSetup::dropRelativeFolders();
+    SingleInstance instance(AppPaths::instanceKey(), AppPaths::clientStoreFolder());
     if (!instance.acquire()) {
         qDebug("An instance of this application is running!");
         return 0;

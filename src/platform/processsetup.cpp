@@ -1,6 +1,7 @@
 #include "processsetup.h"
 
 #include <csignal>
+#include <cstdlib>
 
 #ifdef __unix__
 #include <sys/resource.h>
@@ -15,6 +16,16 @@
 #endif
 
 namespace ProcessSetup {
+
+void dropRelativeFolders() {
+#ifdef __unix__
+    for (const char *name : {"XDG_DATA_HOME", "XDG_CONFIG_HOME", "XDG_CACHE_HOME"}) {
+        const char *folder = std::getenv(name);
+        if (folder && *folder != '/')
+            ::unsetenv(name);
+    }
+#endif
+}
 
 void ignoreBrokenPipes() {
 #ifdef SIGPIPE

@@ -3,6 +3,10 @@
 /// What the process as a whole needs from the operating system.
 namespace ProcessSetup {
 
+/// Forgets the user's folders of the environment that are no absolute paths: they would be others wherever
+/// the program is started. Before anything asks for a folder.
+void dropRelativeFolders();
+
 /// A write to a connection that the peer has closed fails instead of ending the process.
 void ignoreBrokenPipes();
 
