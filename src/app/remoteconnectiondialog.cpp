@@ -6,12 +6,14 @@
 #include "serveraddress.h"
 #include "serverdialog.h"
 #include "serverkeys.h"
+#include "storewriter.h"
 #include "ui_remoteconnectiondialog.h"
 
 #include <QDateTime>
 #include <QDebug>
 #include <QHeaderView>
 #include <QLocale>
+#include <QPointer>
 
 #include <nlohmann/json.hpp>
 
@@ -112,14 +114,22 @@ void RemoteConnectionDialog::fillTable() {
 }
 
 void RemoteConnectionDialog::filterRows() {
-    const QString wanted = m_ui->remoteSearchEdit->text().trimmed();
-    for (int row = 0; row < m_ui->tableWidget->rowCount(); ++row) {
-        const JSON &server = (*m_servers)[static_cast<std::size_t>(row)];
-        const bool matches = stringMember(server, "svrname").contains(wanted, Qt::CaseInsensitive) ||
-                             stringMember(server, "info").contains(wanted, Qt::CaseInsensitive);
-        m_ui->tableWidget->setRowHidden(row, !matches);
-    }
+    for (int row = 0; row < m_ui->tableWidget->rowCount(); ++row)
+        m_ui->tableWidget->setRowHidden(row, !matchesSearch((*m_servers)[static_cast<std::size_t>(row)]));
     updateButtons();
+}
+
+bool RemoteConnectionDialog::matchesSearch(const JSON &server) const {
+    const QString wanted = m_ui->remoteSearchEdit->text().trimmed();
+    return stringMember(server, "svrname").contains(wanted, Qt::CaseInsensitive) ||
+           stringMember(server, "info").contains(wanted, Qt::CaseInsensitive);
+}
+
+/// What was just entered is to be seen, also where the search speaks of others.
+void RemoteConnectionDialog::select(int row) {
+    if (!matchesSearch((*m_servers)[static_cast<std::size_t>(row)]))
+        m_ui->remoteSearchEdit->clear();
+    m_ui->tableWidget->selectRow(row);
 }
 
 int RemoteConnectionDialog::selectedRow() const {
@@ -129,7 +139,7 @@ int RemoteConnectionDialog::selectedRow() const {
 }
 
 void RemoteConnectionDialog::updateButtons() {
-    const bool selected = selectedRow() >= 0;
+    const bool selected = selectedRow() >= 0 && !m_saving;
     m_ui->editButton->setEnabled(selected);
     m_ui->deleteButton->setEnabled(selected);
     showKeyOfSelected();
@@ -179,7 +189,7 @@ void RemoteConnectionDialog::onAddServer(const QString &remember, const QString 
     const QString id = QStringLiteral("SVR%1").arg(QDateTime::currentMSecsSinceEpoch());
     m_servers->push_back(record(id, remember, name, info, email, password));
     fillTable();
-    m_ui->tableWidget->selectRow(m_ui->tableWidget->rowCount() - 1);
+    select(m_ui->tableWidget->rowCount() - 1);
 }
 
 void RemoteConnectionDialog::onEditServer(const QString &remember, const QString &name, const QString &info,
@@ -194,7 +204,7 @@ void RemoteConnectionDialog::onEditServer(const QString &remember, const QString
     // A password that could not be opened is kept while nobody enters another.
     server.update(record(stringMember(server, "id"), remember, name, info, email, password));
     fillTable();
-    m_ui->tableWidget->selectRow(row);
+    select(row);
 }
 
 void RemoteConnectionDialog::deleteSelected() {
@@ -207,7 +217,22 @@ void RemoteConnectionDialog::deleteSelected() {
 }
 
 void RemoteConnectionDialog::save() {
-    if (!CClientStore::instance().saveServerList(*m_servers)) {
+    setSaving(true);
+    StoreWriter::post([servers = *m_servers, dialog = QPointer(this)] {
+        const bool saved = CClientStore::instance().saveServerList(servers);
+        QMetaObject::invokeMethod(
+            qApp,
+            [dialog, saved] {
+                if (dialog)
+                    dialog->onSaved(saved);
+            },
+            Qt::QueuedConnection);
+    });
+}
+
+void RemoteConnectionDialog::onSaved(bool saved) {
+    setSaving(false);
+    if (!saved) {
         m_warning.setText(tr("The list could not be saved; the saved one is as it was."));
         return;
     }
@@ -222,4 +247,13 @@ void RemoteConnectionDialog::forgetKeysBut(const QStringList &servers) const {
         if (!servers.contains(server))
             ServerKeys::instance().forget(server);
     }
+}
+
+/// What is being written is not changed meanwhile.
+void RemoteConnectionDialog::setSaving(bool saving) {
+    m_saving = saving;
+    setClosable(!saving);
+    for (QPushButton *button : {m_ui->addButton, m_ui->saveButton, m_ui->cancelButton})
+        button->setEnabled(!saving);
+    updateButtons();
 }

@@ -36,7 +36,11 @@ private:
     void openAddDialog();
     void openEditDialog();
     void deleteSelected();
+    bool matchesSearch(const JSON &server) const;
+    void select(int row);
     void save();
+    void onSaved(bool saved);
+    void setSaving(bool saving);
     int selectedRow() const;
     void showKeyOfSelected();
     void forgetKeysBut(const QStringList &servers) const;
@@ -45,4 +49,5 @@ private:
     WarningLine m_warning;
     std::unique_ptr<JSON> m_servers;
     QStringList m_loadedServers; ///< as ServerKeys names them
+    bool m_saving = false;
 };

@@ -10,6 +10,8 @@ ServerDialog::ServerDialog(const QString &title, const QString &applyText, QWidg
     setWindowTitle(title);
     m_ui->applyButton->setText(applyText);
     connect(m_ui->applyButton, &QPushButton::clicked, this, &ServerDialog::onApply);
+    connect(m_ui->passEdit, &QLineEdit::textChanged, this, &ServerDialog::tellOfPassword);
+    connect(m_ui->rememberCheckBox, &QCheckBox::toggled, this, &ServerDialog::tellOfPassword);
     connect(m_ui->cancelButton, &QPushButton::clicked, this, &QDialog::reject);
     m_ui->nameEdit->setFocus();
 }
@@ -23,6 +25,11 @@ void ServerDialog::fill(const QString &remember, const QString &name, const QStr
     m_ui->infoEdit->setText(info);
     m_ui->emailEdit->setText(email);
     m_ui->passEdit->setText(password);
+}
+
+void ServerDialog::tellOfPassword() {
+    const bool isDropped = !m_ui->passEdit->text().isEmpty() && !m_ui->rememberCheckBox->isChecked();
+    m_warning.setText(isDropped ? tr("The password is kept only with “Remember Me”.") : QString());
 }
 
 void ServerDialog::onApply() {

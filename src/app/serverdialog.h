@@ -29,6 +29,7 @@ protected:
 
 private:
     void onApply();
+    void tellOfPassword();
 
     std::unique_ptr<Ui::ServerDialog> m_ui;
     WarningLine m_warning;

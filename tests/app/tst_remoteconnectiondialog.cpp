@@ -46,19 +46,23 @@ private slots:
     }
 
     void addedServerIsSaved() {
+        Form::type(m_dialog.get(), "remoteSearchEdit", "alpha");
         Form::click(m_dialog.get(), "addButton");
         QTRY_VERIFY(Form::visible<AddServerDialog>());
         const auto *add = Form::visible<AddServerDialog>();
         Form::type(add, "nameEdit", " Tango ");
         Form::type(add, "infoEdit", "tango.example:8443");
         Form::type(add, "emailEdit", "tango@norvell.example");
+        QCOMPARE(Form::text(add, "msgWarningLabel"), QString());
         Form::type(add, "passEdit", "TangoPass1!");
+        QCOMPARE(Form::text(add, "msgWarningLabel"),
+                 QStringLiteral("The password is kept only with “Remember Me”."));
         Form::click(add, "applyButton");
         QTRY_VERIFY(!Form::visible<AddServerDialog>());
         QCOMPARE(visibleNames().last(), QStringLiteral("Tango"));
         QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Alpha|<b>Mike</b>"));
         Form::click(m_dialog.get(), "saveButton");
-        QCOMPARE(m_updated->size(), 1);
+        QTRY_COMPARE(m_updated->size(), 1);
         QVERIFY(!m_dialog->isVisible());
         QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Alpha|<b>Mike</b>|Tango"));
         QCOMPARE(saved("info").section(u'|', 3), QStringLiteral("tango.example:8443"));
@@ -103,6 +107,7 @@ private slots:
         QTRY_VERIFY(!Form::visible<EditServerDialog>());
         QCOMPARE(visibleNames(), (QStringList{"Zulu", "Bravo", "<b>Mike</b>"}));
         Form::click(m_dialog.get(), "saveButton");
+        QTRY_VERIFY(!m_dialog->isVisible());
         QCOMPARE(saved("svrname"), QStringLiteral("Zulu|Bravo|<b>Mike</b>"));
         QCOMPARE(saved("id"), QStringLiteral("SVRZulu|SVRAlpha|SVR<b>Mike</b>"));
         QCOMPARE(saved("pass"), QStringLiteral("MyPass12!|MyPass12!|MyPass12!"));
@@ -122,6 +127,7 @@ private slots:
         choose(0);
         Form::click(m_dialog.get(), "deleteButton");
         Form::click(m_dialog.get(), "saveButton");
+        QTRY_VERIFY(!m_dialog->isVisible());
         QCOMPARE(saved("svrname"), QStringLiteral("Alpha|<b>Mike</b>"));
     }
 
