@@ -81,7 +81,17 @@ bool CClientStore::isLoginRememberMe() const {
 }
 
 bool CClientStore::setLoginRememberMe(bool on) {
-    return m_store.replaceFlag(kIsLoginRememberMe, on);
+    const bool forgotten =
+        on || (forgetPassword(kThisComputerAccountInfo) && forgetPassword(kRemoteComputerAccountInfo));
+    return m_store.replaceFlag(kIsLoginRememberMe, on) && forgotten;
+}
+
+bool CClientStore::forgetPassword(const QString &key) {
+    if (m_store.query(key).isEmpty())
+        return true;
+    AccountInfo info = account(key);
+    info.password.clear();
+    return setAccount(key, info);
 }
 
 AccountInfo CClientStore::thisComputerAccount() const {

@@ -22,6 +22,7 @@ public:
     bool setThisComputer(bool on);
 
     bool isLoginRememberMe() const;
+    /// Switched off, it forgets the passwords of both accounts as well.
     bool setLoginRememberMe(bool on);
 
     AccountInfo thisComputerAccount() const;
@@ -47,6 +48,7 @@ private:
     CClientStore();
 
     AccountInfo account(const QString &key) const;
+    bool forgetPassword(const QString &key);
     bool setAccount(const QString &key, const AccountInfo &account);
 
     CBaseStore m_store;

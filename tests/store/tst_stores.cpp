@@ -101,6 +101,12 @@ void TestStores::storedAccount() {
     QCOMPARE(store.remoteComputerAccount().server, there.server);
     QCOMPARE(store.remoteComputerAccount().email, there.email);
     QCOMPARE(store.remoteComputerAccount().password, there.password);
+    QVERIFY(store.setLoginRememberMe(true));
+    QCOMPARE(store.remoteComputerAccount().password, there.password);
+    QVERIFY(store.setLoginRememberMe(false));
+    QCOMPARE(store.thisComputerAccount().password + store.remoteComputerAccount().password, QString());
+    QCOMPARE(store.thisComputerAccount().email, here.email);
+    QCOMPARE(store.remoteComputerAccount().server, there.server);
 }
 
 void TestStores::unreadableAccountIsEmpty_data() {
