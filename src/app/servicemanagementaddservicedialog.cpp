@@ -35,7 +35,7 @@ void mark(QWidget *widget, const char *property, bool on) {
 } // namespace
 
 ServiceManagementAddServiceDialog::ServiceManagementAddServiceDialog(QWidget *parent)
-    : FramelessDialog(parent),
+    : ServiceDialog(parent),
       m_ui(formIn<Ui::ServiceManagementAddServiceDialog>(content())),
       m_error(m_ui->errMsgIcon, m_ui->errMsg) {
     setObjectName(QStringLiteral("ServiceManagementAddServiceDialog"));
@@ -186,7 +186,7 @@ void ServiceManagementAddServiceDialog::onApply() {
     const QString site = organization.sites[static_cast<std::size_t>(m_ui->siteComboBox->currentIndex())].id;
     m_error.setText({});
     setBusy(true);
-    TransientMessage::show(this, tr("Applying..."), TransientMessage::Kind::Loading);
+    beginChange(tr("Applying..."));
     const bool started = ServiceRequest::post(
         NetJob::createRunner("addService in ServiceManagementAddServiceDialog"), this,
         [organizationId = organization.id, site](ServiceSession &session) {
@@ -199,10 +199,11 @@ void ServiceManagementAddServiceDialog::onApply() {
             onApplied(result);
         },
         [this](JobEnd end) {
-            if (end != JobEnd::Delivered) {
-                setBusy(false);
-                onApplied(ApiException);
-            }
+            // With its session the dialog goes as well, and nobody is to be told.
+            if (end == JobEnd::Delivered || end == JobEnd::SessionGone)
+                return;
+            setBusy(false);
+            onApplied(ApiException);
         });
     if (!started) {
         setBusy(false);
@@ -211,19 +212,26 @@ void ServiceManagementAddServiceDialog::onApply() {
 }
 
 void ServiceManagementAddServiceDialog::onApplied(unsigned result) {
-    TransientMessage::clear(this);
+    endChange();
     switch (result) {
     case ApiOk:
         TransientMessage::show(parentWidget() ? parentWidget() : this, tr("Applied successfully"),
                                TransientMessage::Kind::Success);
-        return accept();
+        emit statusChanged(true);
+        if (!isClosed())
+            accept();
+        return;
     case ApiCode105:
-        return m_error.setText(tr("Session expired. Click 'Back' to go to the previous step and try again."));
+        return failToApply(tr("Session expired. Click 'Back' to go to the previous step and try again."));
     case ApiTransportError:
-        return m_error.setText(OrbTexts::unableToConnect());
+        return failToApply(OrbTexts::unableToConnect());
     default:
-        TransientMessage::show(this, OrbTexts::unknownError(), TransientMessage::Kind::Error);
+        tell(OrbTexts::unknownError(), TransientMessage::Kind::Error);
     }
+}
+
+void ServiceManagementAddServiceDialog::failToApply(const QString &text) {
+    isClosed() ? tell(text, TransientMessage::Kind::Error) : m_error.setText(text);
 }
 
 void ServiceManagementAddServiceDialog::setBusy(bool busy) {

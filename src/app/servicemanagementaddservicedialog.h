@@ -1,7 +1,7 @@
 #pragma once
 
-#include "framelessdialog.h"
 #include "orborganization.h"
+#include "servicedialog.h"
 #include "warningline.h"
 
 #include <memory>
@@ -11,7 +11,8 @@ class ServiceManagementAddServiceDialog;
 }
 
 /// Links the service with a site of the remote-access service: the user signs in there, then chooses where.
-class ServiceManagementAddServiceDialog : public FramelessDialog {
+/// Accepted when the service was linked.
+class ServiceManagementAddServiceDialog : public ServiceDialog {
     Q_OBJECT
 
 public:
@@ -32,6 +33,7 @@ private:
     void updateApply();
     void onApply();
     void onApplied(unsigned result);
+    void failToApply(const QString &text);
     void setBusy(bool busy);
 
     std::unique_ptr<Ui::ServiceManagementAddServiceDialog> m_ui;

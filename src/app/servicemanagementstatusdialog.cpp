@@ -14,7 +14,7 @@ struct ServiceManagementStatusDialog::Answer {
 };
 
 ServiceManagementStatusDialog::ServiceManagementStatusDialog(AccountPermission permission, QWidget *parent)
-    : FramelessDialog(parent),
+    : ServiceDialog(parent),
       m_ui(formIn<Ui::ServiceManagementStatusDialog>(content())),
       m_error(m_ui->errorMessageIcon, m_ui->errorMessage),
       m_mayChange(mayManageService(permission)) {
@@ -36,7 +36,7 @@ void ServiceManagementStatusDialog::run(const char *purpose, Request request,
     setBusy(true);
     m_error.setText({});
     const auto finish = [this, handle](const Answer &answer) {
-        TransientMessage::clear(this);
+        endChange();
         setBusy(false);
         (this->*handle)(answer);
     };
@@ -44,7 +44,8 @@ void ServiceManagementStatusDialog::run(const char *purpose, Request request,
         NetJob::createRunner(purpose), this, std::move(request),
         [finish](const Answer &answer) { finish(answer); },
         [finish](JobEnd end) {
-            if (end != JobEnd::Delivered)
+            // With its session the dialog goes as well, and nobody is to be told.
+            if (end != JobEnd::Delivered && end != JobEnd::SessionGone)
                 finish({});
         });
     if (!started)
@@ -84,7 +85,7 @@ void ServiceManagementStatusDialog::showStatus(const Answer &answer) {
 void ServiceManagementStatusDialog::enableRemoteAccess(bool on) {
     if (m_busy)
         return;
-    TransientMessage::show(this, tr("Set Remote Access..."), TransientMessage::Kind::Loading);
+    beginChange(tr("Set Remote Access..."));
     run(
         "toggleRemoteAcess in ServiceManagementStatusDialog",
         [on](ServiceSession &session) {
@@ -103,8 +104,7 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
     case ApiOk:
         m_allowed = answer.status.remoteAccess;
         if (m_allowed == answer.wanted)
-            TransientMessage::show(this, tr("Set remote access successfully!"),
-                                   TransientMessage::Kind::Success);
+            tell(tr("Set remote access successfully!"), TransientMessage::Kind::Success);
         else
             showNotSet();
         break;
@@ -113,7 +113,7 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
         showNotSet();
         break;
     default:
-        m_error.setText(OrbTexts::failure(answer.result));
+        fail(OrbTexts::failure(answer.result));
     }
     // The switch shows what holds, also after an attempt that did not succeed.
     m_ui->remoteAccessSwitch->setChecked(m_allowed);
@@ -121,7 +121,11 @@ void ServiceManagementStatusDialog::onToggled(const Answer &answer) {
 }
 
 void ServiceManagementStatusDialog::showNotSet() {
-    TransientMessage::show(this, tr("Failed to set remote access."), TransientMessage::Kind::Error);
+    tell(tr("Failed to set remote access."), TransientMessage::Kind::Error);
+}
+
+void ServiceManagementStatusDialog::fail(const QString &text) {
+    isClosed() ? tell(text, TransientMessage::Kind::Error) : m_error.setText(text);
 }
 
 void ServiceManagementStatusDialog::displayServiceDisconnectDialog(bool) {
@@ -136,7 +140,7 @@ void ServiceManagementStatusDialog::displayServiceDisconnectDialog(bool) {
 void ServiceManagementStatusDialog::disconnectService() {
     if (m_busy)
         return;
-    TransientMessage::show(this, tr("Disconnecting..."), TransientMessage::Kind::Loading);
+    beginChange(tr("Disconnecting..."));
     run(
         "disconnectService in ServiceManagementStatusDialog",
         [](ServiceSession &session) {
@@ -151,11 +155,12 @@ void ServiceManagementStatusDialog::disconnectService() {
 
 void ServiceManagementStatusDialog::onDisconnected(const Answer &answer) {
     if (answer.result != ApiOk)
-        return m_error.setText(OrbTexts::failure(answer.result));
+        return fail(OrbTexts::failure(answer.result));
     TransientMessage::show(parentWidget() ? parentWidget() : this, tr("Disconnected successfully!"),
                            TransientMessage::Kind::Success);
     emit statusChanged(false);
-    accept();
+    if (!isClosed())
+        accept();
 }
 
 void ServiceManagementStatusDialog::setBusy(bool busy) {

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "accountpermission.h"
-#include "framelessdialog.h"
+#include "servicedialog.h"
 #include "warningline.h"
 
 #include <functional>
@@ -16,16 +16,12 @@ class ServiceManagementStatusDialog;
 
 /// Shows the service's link with the remote-access service, lets support in or shuts it out, and ends the
 /// link. Accepted when the link was ended.
-class ServiceManagementStatusDialog : public FramelessDialog {
+class ServiceManagementStatusDialog : public ServiceDialog {
     Q_OBJECT
 
 public:
     explicit ServiceManagementStatusDialog(AccountPermission permission, QWidget *parent = nullptr);
     ~ServiceManagementStatusDialog() override;
-
-signals:
-    /// Whether the service is linked.
-    void statusChanged(bool connected);
 
 public slots:
     void enableRemoteAccess(bool on);
@@ -39,6 +35,7 @@ private:
     void showStatus(const Answer &answer);
     void onToggled(const Answer &answer);
     void showNotSet();
+    void fail(const QString &text);
     void disconnectService();
     void onDisconnected(const Answer &answer);
     void run(const char *purpose, Request request,
