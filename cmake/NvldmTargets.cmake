@@ -65,10 +65,11 @@ function(nvldm_qt_options target)
 endfunction()
 
 # A Qt Test program, registered with ctest under its own name, off screen. One whose other side is written for POSIX
-# systems, as the scripted peers are, is left out on others.
-#   nvldm_test(tst_name [POSIX] [PRECOMPILED kind] LIBS … [SOURCES …] [TIMEOUT s])
+# systems, as the scripted peers are, is left out on others. One that is about windows runs on a virtual display under a
+# window manager.
+#   nvldm_test(tst_name [POSIX] [ON_DISPLAY] [PRECOMPILED kind] LIBS … [SOURCES …] [TIMEOUT s])
 function(nvldm_test name)
-    cmake_parse_arguments(ARG "POSIX" "PRECOMPILED;TIMEOUT" "LIBS;SOURCES" ${ARGN})
+    cmake_parse_arguments(ARG "POSIX;ON_DISPLAY" "PRECOMPILED;TIMEOUT" "LIBS;SOURCES" ${ARGN})
     if(ARG_POSIX AND NOT UNIX)
         return()
     endif()
@@ -79,7 +80,11 @@ function(nvldm_test name)
     if(ARG_PRECOMPILED)
         nvldm_precompile(${name} ${ARG_PRECOMPILED})
     endif()
-    add_test(NAME ${name} COMMAND ${name})
+    if(ARG_ON_DISPLAY)
+        add_test(NAME ${name} COMMAND "${PROJECT_SOURCE_DIR}/scripts/on-display" $<TARGET_FILE:${name}>)
+    else()
+        add_test(NAME ${name} COMMAND ${name})
+    endif()
     if(NOT ARG_TIMEOUT)
         set(ARG_TIMEOUT 120)
     endif()
@@ -89,5 +94,6 @@ function(nvldm_test name)
     endif()
     set_tests_properties(${name} PROPERTIES
         TIMEOUT ${ARG_TIMEOUT}
+        SKIP_RETURN_CODE 77
         ENVIRONMENT "QT_QPA_PLATFORM=offscreen;LC_ALL=C.UTF-8;NVLDM_EMULATOR=$<TARGET_FILE:nvldm-emulator>")
 endfunction()

@@ -39,6 +39,7 @@ FramelessDialog::FramelessDialog(QWidget *parent)
     // Escape closes as well, so the keyboard's way leads past the cross.
     m_close->setFocusPolicy(Qt::NoFocus);
     connect(m_close, &QToolButton::clicked, this, &QDialog::reject);
+    connect(dragger, &WindowDragger::dragged, this, [this] { m_dragged = true; });
 
     auto *titleLayout = new QHBoxLayout(dragger);
     titleLayout->setContentsMargins(16, 0, 8, 0);
@@ -73,19 +74,32 @@ void FramelessDialog::setClosable(bool closable) {
     m_close->setVisible(closable);
 }
 
-void FramelessDialog::centreOverParent() {
-    const QWidget *over = parentWidget() ? parentWidget()->window() : nullptr;
-    if (!over)
-        return;
-    QRect place({}, size().expandedTo(minimumSizeHint()));
-    place.moveCenter(over->geometry().center());
-    move(place.topLeft());
+QRect FramelessDialog::preferredPlace(const QSize &size) const {
+    QRect place(pos(), size);
+    if (parentWidget())
+        place.moveCenter(parentWidget()->window()->geometry().center());
+    return place;
 }
 
-void FramelessDialog::showEvent(QShowEvent *event) {
-    QDialog::showEvent(event);
-    if (!event->spontaneous())
-        centreOverParent();
+void FramelessDialog::centreOverParent() {
+    if (!m_dragged)
+        move(preferredPlace(size().expandedTo(minimumSizeHint())).topLeft());
+}
+
+/// On X11 a window that is moved between its making and its mapping often does not learn where the window
+/// manager has put it: its lists then open elsewhere. So its place is set before there is a native window.
+void FramelessDialog::prepareToShow() {
+    ensurePolished();
+    layout()->activate();
+    if (!testAttribute(Qt::WA_Resized))
+        resize(sizeHint().expandedTo(minimumSizeHint()));
+    centreOverParent();
+}
+
+void FramelessDialog::setVisible(bool visible) {
+    if (visible && isHidden())
+        prepareToShow();
+    QDialog::setVisible(visible);
 }
 
 void FramelessDialog::keyPressEvent(QKeyEvent *event) {
@@ -104,11 +118,12 @@ bool FramelessDialog::event(QEvent *event) {
     return handled;
 }
 
-/// Resizes about the middle of the upper edge: the window system may otherwise choose another place.
+/// Keeps its place, or where the user has dragged it the middle of its upper edge.
 void FramelessDialog::fitContent() {
     const QRect before = geometry();
     const QSize wanted = sizeHint().expandedTo(minimumSizeHint());
-    if (wanted == before.size())
-        return;
-    setGeometry(QRect(QPoint(before.center().x() - wanted.width() / 2, before.top()), wanted));
+    const QRect grown(QPoint(before.center().x() - wanted.width() / 2, before.top()), wanted);
+    const QRect place = m_dragged ? grown : preferredPlace(wanted);
+    if (place != before)
+        setGeometry(place);
 }

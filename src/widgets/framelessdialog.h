@@ -26,13 +26,20 @@ public:
     /// Takes the close cross away where the dialog must be answered.
     void setClosable(bool closable);
 
-    /// Puts the dialog over the middle of its parent's window.
+    /// Puts the dialog over the middle of its parent's window, unless the user has dragged it elsewhere.
     void centreOverParent();
 
+    void setVisible(bool visible) override;
+
 protected:
-    void showEvent(QShowEvent *event) override;
     void keyPressEvent(QKeyEvent *event) override;
     bool event(QEvent *event) override;
+
+    /// Right before it is shown: sets its size and its place.
+    virtual void prepareToShow();
+    /// Where the dialog stands with a size as long as the user has not dragged it: over the middle of its
+    /// parent's window.
+    virtual QRect preferredPlace(const QSize &size) const;
 
 private:
     void fitContent();
@@ -41,6 +48,7 @@ private:
     QToolButton *m_close;
     QWidget *m_content;
     bool m_closable = true;
+    bool m_dragged = false;
 };
 
 /// The parts of a form, set up in a widget: for members that need them before the constructor's body.

@@ -20,6 +20,7 @@ void WindowDragger::mouseMoveEvent(QMouseEvent *event) {
         return;
     // The window system takes the pointer from here on; no release will come.
     m_pressed = false;
+    emit dragged();
     if (QWindow *handle = window()->windowHandle())
         handle->startSystemMove();
 }

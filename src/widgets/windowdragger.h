@@ -11,6 +11,8 @@ public:
 
 signals:
     void doubleClicked();
+    /// The user begins to move the window.
+    void dragged();
 
 protected:
     void mousePressEvent(QMouseEvent *event) override;
