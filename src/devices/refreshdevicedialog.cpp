@@ -2,6 +2,8 @@
 
 #include "ui_refreshdevicedialog.h"
 
+#include <QApplication>
+
 RefreshDeviceDialog::RefreshDeviceDialog(QWidget *parent)
     : FramelessDialog(parent), m_ui(formIn<Ui::RefreshDeviceDialog>(content())) {
     setObjectName(QStringLiteral("RefreshDeviceDialog"));
@@ -14,6 +16,21 @@ RefreshDeviceDialog::~RefreshDeviceDialog() = default;
 void RefreshDeviceDialog::finish() {
     emit refreshDone();
     accept();
+}
+
+void RefreshDeviceDialog::setVisible(bool visible) {
+    if (visible && isHidden())
+        m_activeBefore = QApplication::activeWindow();
+    const bool hadKeyboard = !visible && isActiveWindow();
+    FramelessDialog::setVisible(visible);
+    if (!hadKeyboard)
+        return;
+    // Window managers like to hand it to the main window, also where a dialog blocks that one.
+    QWidget *next = QApplication::activeModalWidget();
+    if (!next)
+        next = m_activeBefore;
+    if (next && next->isVisible())
+        next->activateWindow();
 }
 
 void RefreshDeviceDialog::showEvent(QShowEvent *event) {

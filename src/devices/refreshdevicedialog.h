@@ -2,6 +2,8 @@
 
 #include "framelessdialog.h"
 
+#include <QPointer>
+
 #include <memory>
 
 namespace Ui {
@@ -9,13 +11,15 @@ class RefreshDeviceDialog;
 }
 
 /// Keeps the window while the states of the devices are read anew. It asks for that when it opens and closes
-/// when it is told the end.
+/// when it is told the end. The keyboard, which it takes meanwhile, goes back to the window that had it.
 class RefreshDeviceDialog : public FramelessDialog {
     Q_OBJECT
 
 public:
     explicit RefreshDeviceDialog(QWidget *parent = nullptr);
     ~RefreshDeviceDialog() override;
+
+    void setVisible(bool visible) override;
 
 public slots:
     /// The refresh has ended, well or not.
@@ -31,5 +35,6 @@ protected:
 
 private:
     std::unique_ptr<Ui::RefreshDeviceDialog> m_ui;
+    QPointer<QWidget> m_activeBefore;
     bool m_asked = false;
 };

@@ -3,6 +3,7 @@
 #include "sitetree.h"
 #include "theme.h"
 
+#include <QFocusEvent>
 #include <QLineEdit>
 #include <QPainter>
 
@@ -49,6 +50,14 @@ void SiteDelegate::updateEditorGeometry(QWidget *editor, const QStyleOptionViewI
 
 void SiteDelegate::setModelData(QWidget *editor, QAbstractItemModel *, const QModelIndex &index) const {
     m_edited(index.data(SiteTree::siteIdRole).toString(), static_cast<QLineEdit *>(editor)->text());
+}
+
+bool SiteDelegate::eventFilter(QObject *editor, QEvent *event) {
+    // Another window has come up, maybe unasked: the focus comes back to what is being typed.
+    if (event->type() == QEvent::FocusOut &&
+        static_cast<QFocusEvent *>(event)->reason() == Qt::ActiveWindowFocusReason)
+        return false;
+    return QStyledItemDelegate::eventFilter(editor, event);
 }
 
 void SiteDelegate::paint(QPainter *painter, const QStyleOptionViewItem &option,

@@ -24,6 +24,7 @@ public:
     void setModelData(QWidget *editor, QAbstractItemModel *model, const QModelIndex &index) const override;
     void paint(QPainter *painter, const QStyleOptionViewItem &option,
                const QModelIndex &index) const override;
+    bool eventFilter(QObject *editor, QEvent *event) override;
 
 private:
     void paintSite(QPainter *painter, const QStyleOptionViewItem &option, const QModelIndex &index) const;

@@ -46,6 +46,8 @@ public:
     /// Selects a site, or the overview where there is no such site.
     void select(const QString &siteId);
 
+    /// True while a name is being typed.
+    bool isTyping() const { return state() == EditingState; }
     const SiteEdits &edits() const { return m_edits; }
     /// The records to commit; exactly one endCommit follows. Edits may go on meanwhile.
     JSON beginCommit();
