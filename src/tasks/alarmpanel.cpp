@@ -98,15 +98,15 @@ void AlarmPanel::connectParts() {
     connect(pool, &CTaskInfoPool::alarmListUpdated, this, &AlarmPanel::onAlarmListUpdated);
     connect(pool, &CTaskInfoPool::alarmListFailed, this, &AlarmPanel::onAlarmListFailed);
     connect(pool, &CTaskInfoPool::cleared, this, &AlarmPanel::onCleared);
-    connect(m_list, &QListView::clicked, this, &AlarmPanel::onChosen);
     connect(m_list, &QListView::activated, this, &AlarmPanel::onChosen);
     connect(m_list->selectionModel(), &QItemSelectionModel::selectionChanged, this, &AlarmPanel::showActions);
     connect(m_copy, &QAction::triggered, this, &AlarmPanel::copySelected);
     connect(m_delete, &QAction::triggered, this, &AlarmPanel::deleteSelected);
     connect(m_deleteAll, &QToolButton::clicked, this, &AlarmPanel::deleteAll);
     connect(m_actions, &ListActions::busyChanged, this, &AlarmPanel::showActions);
-    connect(m_actions, &ListActions::failed, this,
-            [this](const QString &message) { TransientMessage::show(this, message); });
+    connect(m_actions, &ListActions::failed, this, [this](const QString &message) {
+        TransientMessage::show(this, message, TransientMessage::Kind::Error);
+    });
 }
 
 void AlarmPanel::onAlarmListUpdated() {

@@ -234,8 +234,9 @@ void TaskPanel::connectParts() {
     connect(m_tree->selectionModel(), &QItemSelectionModel::selectionChanged, this, &TaskPanel::showActions);
     connect(m_removeFinished, &QToolButton::clicked, this, &TaskPanel::removeFinished);
     connect(m_actions, &ListActions::busyChanged, this, &TaskPanel::showActions);
-    connect(m_actions, &ListActions::failed, this,
-            [this](const QString &message) { TransientMessage::show(this, message); });
+    connect(m_actions, &ListActions::failed, this, [this](const QString &message) {
+        TransientMessage::show(this, message, TransientMessage::Kind::Error);
+    });
 }
 
 void TaskPanel::onTaskListUpdated() {

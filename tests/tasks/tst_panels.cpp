@@ -316,7 +316,7 @@ private slots:
         QCOMPARE(again.last()[0].toInt(), 1);
     }
 
-    void clickedAlarmNamesItsDevice() {
+    void activatedAlarmNamesItsDevice() {
         m_alarms = std::make_unique<AlarmPanel>();
         m_alarms->resize(340, 600);
         m_alarms->show();
@@ -324,10 +324,18 @@ private slots:
         loadAlarms();
         auto *list = m_alarms->findChild<QListView *>("alarmList");
         QSignalSpy chosen(m_alarms.get(), &AlarmPanel::deviceChosen);
-        QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                          list->visualRect(list->model()->index(1, 0)).center());
-        QCOMPARE(chosen.count(), 1);
+        const auto rowCentre = [list](int row) {
+            return list->visualRect(list->model()->index(row, 0)).center();
+        };
+        for (const Qt::KeyboardModifier with : {Qt::NoModifier, Qt::ControlModifier, Qt::ShiftModifier})
+            QTest::mouseClick(list->viewport(), Qt::LeftButton, with, rowCentre(0));
+        QTest::mouseClick(list->viewport(), Qt::LeftButton, {}, rowCentre(1));
+        QCOMPARE(chosen.count(), 0);
+        QTest::mouseDClick(list->viewport(), Qt::LeftButton, {}, rowCentre(1));
+        QTest::keyClick(list, Qt::Key_Return);
+        QCOMPARE(chosen.count(), 2);
         QCOMPARE(chosen[0][0].toString(), QString("DVone"));
+        QCOMPARE(chosen[1][0].toString(), QString("DVone"));
         QTest::keyClick(list, Qt::Key_Delete);
         QTRY_VERIFY(!m_service->sentTo("/v1/alarm/rm").empty());
         const auto sent = m_service->sentTo("/v1/alarm/rm");
