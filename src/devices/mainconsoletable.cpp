@@ -326,6 +326,11 @@ void MainConsoleTable::keepColumns() {
     connect(header, &QHeaderView::sortIndicatorChanged, this, later);
 }
 
+MainConsoleTable::~MainConsoleTable() {
+    if (m_saveTimer.isActive())
+        saveColumns();
+}
+
 void MainConsoleTable::saveColumns() const {
     StoreWriter::post([name = objectName(), state = horizontalHeader()->saveState().toBase64()] {
         CLocalStore::instance().setLayout(name, QString::fromLatin1(state));

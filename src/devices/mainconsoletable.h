@@ -19,6 +19,7 @@ public:
     static constexpr int deviceIdRole = Qt::UserRole;
 
     explicit MainConsoleTable(DeviceClass deviceClass, QWidget *parent = nullptr);
+    ~MainConsoleTable() override;
 
     /// The inventory must outlive the table.
     void setInventory(const DeviceInventory *inventory);
