@@ -241,10 +241,6 @@
         <translation>Die Suche ist fehlgeschlagen: %1.</translation>
     </message>
     <message>
-        <source>The device(s) found there are managed or listed already.</source>
-        <translation>Die dort gefundenen Geräte werden bereits verwaltet oder stehen schon in der Liste.</translation>
-    </message>
-    <message>
         <source>No device was found at %1.</source>
         <translation>Unter %1 wurde kein Gerät gefunden.</translation>
     </message>
@@ -278,13 +274,6 @@
     <message>
         <source>There is no device in the file &quot;%1&quot;.</source>
         <translation>Die Datei „%1“ enthält kein Gerät.</translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) of the file are managed or listed already.</source>
-        <translation>
-            <numerusform>%n Gerät der Datei wird bereits verwaltet oder steht schon in der Liste.</numerusform>
-            <numerusform>%n Geräte der Datei werden bereits verwaltet oder stehen schon in der Liste.</numerusform>
-        </translation>
     </message>
     <message>
         <source>Line %1</source>
@@ -382,27 +371,38 @@
         <source>No new device found</source>
         <translation>Kein neues Gerät gefunden</translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) answered, which are managed already.</source>
-        <translation>
-            <numerusform>%n Gerät hat geantwortet, das bereits verwaltet wird.</numerusform>
-            <numerusform>%n Geräte haben geantwortet, die bereits verwaltet werden.</numerusform>
-        </translation>
-    </message>
     <message>
         <source>Devices that the server does not reach by itself can be added manually or from a file.</source>
         <translation>Geräte, die der Server nicht von selbst erreicht, können manuell oder aus einer Datei hinzugefügt werden.</translation>
     </message>
+    <message>
+        <source>Waiting for the list of managed devices...</source>
+        <translation>Warten auf die Liste der verwalteten Geräte...</translation>
+    </message>
+    <message>
+        <source>What was found there is managed or listed already.</source>
+        <translation>Was dort gefunden wurde, wird bereits verwaltet oder steht schon in der Liste.</translation>
+    </message>
     <message numerus="yes">
-        <source>%n device(s) were managed already and stay as they are.</source>
+        <source>Managed or listed already: %n device(s) of the file.</source>
+        <translation>
+            <numerusform>%n Gerät der Datei wird bereits verwaltet oder steht schon in der Liste.</numerusform>
+            <numerusform>%n Geräte der Datei werden bereits verwaltet oder stehen schon in der Liste.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Managed already and left as they are: %n device(s).</source>
         <translation>
             <numerusform>%n Gerät war bereits verwaltet und bleibt, wie es ist.</numerusform>
             <numerusform>%n Geräte waren bereits verwaltet und bleiben, wie sie sind.</numerusform>
         </translation>
     </message>
-    <message>
-        <source>Waiting for the list of managed devices...</source>
-        <translation>Warten auf die Liste der verwalteten Geräte...</translation>
+    <message numerus="yes">
+        <source>Managed already: %n device(s) that answered.</source>
+        <translation>
+            <numerusform>%n Gerät hat geantwortet, das bereits verwaltet wird.</numerusform>
+            <numerusform>%n Geräte haben geantwortet, die bereits verwaltet werden.</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1509,10 +1509,6 @@
         <translation>Ein Anführungszeichen ist nicht geschlossen.</translation>
     </message>
     <message>
-        <source>The row has %1 column(s) in place of %2.</source>
-        <translation>Die Zeile hat %1 Spalte(n) statt %2.</translation>
-    </message>
-    <message>
         <source>&quot;%1&quot; is no port from 1 to 65535.</source>
         <translation>„%1“ ist kein Port von 1 bis 65535.</translation>
     </message>
@@ -1543,6 +1539,13 @@
     <message>
         <source>it is no file</source>
         <translation>es ist keine Datei</translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n column(s) in place of %1.</source>
+        <translation>
+            <numerusform>Die Zeile hat %n Spalte statt %1.</numerusform>
+            <numerusform>Die Zeile hat %n Spalten statt %1.</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1664,16 +1667,16 @@
         <source>%1 could not be started: %2.</source>
         <translation>„%1“ konnte nicht gestartet werden: %2.</translation>
     </message>
+    <message>
+        <source>%1 may have begun: %2. Look at its task before you try again.</source>
+        <translation>%1 hat vielleicht begonnen: %2. Sehen Sie sich die Aufgabe an, bevor Sie es erneut versuchen.</translation>
+    </message>
     <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <source>Left out: %n device(s) that the server does not manage any more.</source>
         <translation>
             <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
         </translation>
-    </message>
-    <message>
-        <source>%1 may have begun: %2. Look at its task before you try again.</source>
-        <translation>%1 hat vielleicht begonnen: %2. Sehen Sie sich die Aufgabe an, bevor Sie es erneut versuchen.</translation>
     </message>
 </context>
 <context>
@@ -2055,6 +2058,10 @@
         <source>Certificates in use</source>
         <translation>Verwendete Zertifikate</translation>
     </message>
+    <message>
+        <source>Not available in this version yet.</source>
+        <translation>In dieser Version noch nicht verfügbar.</translation>
+    </message>
 </context>
 <context>
     <name>DeviceWindow</name>
@@ -2085,6 +2092,10 @@
     <message>
         <source>The device cannot be shown.</source>
         <translation>Das Gerät kann nicht angezeigt werden.</translation>
+    </message>
+    <message>
+        <source>The device states could not be read: the client is busy, try again.</source>
+        <translation>Die Gerätezustände konnten nicht gelesen werden: Das Programm ist beschäftigt, versuchen Sie es erneut.</translation>
     </message>
 </context>
 <context>
@@ -2995,7 +3006,7 @@
 <context>
     <name>QueueStrips</name>
     <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <source>Left out: %n device(s) that the server does not manage any more.</source>
         <translation>
             <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
@@ -3410,16 +3421,16 @@
         <source>Stopped.</source>
         <translation>Angehalten.</translation>
     </message>
+    <message>
+        <source>Finished: %1.</source>
+        <translation>Abgeschlossen: %1.</translation>
+    </message>
     <message numerus="yes">
-        <source>%n device(s) wait for the second wave.</source>
+        <source>Waiting for the second wave: %n device(s).</source>
         <translation>
             <numerusform>%n Gerät wartet auf die zweite Welle.</numerusform>
             <numerusform>%n Geräte warten auf die zweite Welle.</numerusform>
         </translation>
-    </message>
-    <message>
-        <source>Finished: %1.</source>
-        <translation>Abgeschlossen: %1.</translation>
     </message>
 </context>
 <context>

@@ -241,10 +241,6 @@
         <translation>検索に失敗しました: %1。</translation>
     </message>
     <message>
-        <source>The device(s) found there are managed or listed already.</source>
-        <translation>見つかったデバイスは既に管理されているか、一覧にあります。</translation>
-    </message>
-    <message>
         <source>No device was found at %1.</source>
         <translation>%1 にデバイスは見つかりませんでした。</translation>
     </message>
@@ -277,12 +273,6 @@
     <message>
         <source>There is no device in the file &quot;%1&quot;.</source>
         <translation>ファイル「%1」にデバイスがありません。</translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) of the file are managed or listed already.</source>
-        <translation>
-            <numerusform>ファイルの %n 台のデバイスは既に管理されているか、一覧にあります。</numerusform>
-        </translation>
     </message>
     <message>
         <source>Line %1</source>
@@ -376,25 +366,35 @@
         <source>No new device found</source>
         <translation>新しいデバイスは見つかりませんでした</translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) answered, which are managed already.</source>
-        <translation>
-            <numerusform>%n 台のデバイスが応答しましたが、既に管理されています。</numerusform>
-        </translation>
-    </message>
     <message>
         <source>Devices that the server does not reach by itself can be added manually or from a file.</source>
         <translation>サーバーが自動で検出できないデバイスは、手動またはファイルから追加できます。</translation>
     </message>
+    <message>
+        <source>Waiting for the list of managed devices...</source>
+        <translation>管理中のデバイスの一覧を待っています...</translation>
+    </message>
+    <message>
+        <source>What was found there is managed or listed already.</source>
+        <translation>見つかったデバイスは既に管理されているか、一覧にあります。</translation>
+    </message>
     <message numerus="yes">
-        <source>%n device(s) were managed already and stay as they are.</source>
+        <source>Managed or listed already: %n device(s) of the file.</source>
+        <translation>
+            <numerusform>ファイルの %n 台のデバイスは既に管理されているか、一覧にあります。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Managed already and left as they are: %n device(s).</source>
         <translation>
             <numerusform>%n 台のデバイスはすでに管理されているため、そのままです。</numerusform>
         </translation>
     </message>
-    <message>
-        <source>Waiting for the list of managed devices...</source>
-        <translation>管理中のデバイスの一覧を待っています...</translation>
+    <message numerus="yes">
+        <source>Managed already: %n device(s) that answered.</source>
+        <translation>
+            <numerusform>%n 台のデバイスが応答しましたが、既に管理されています。</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1488,10 +1488,6 @@
         <translation>引用符が閉じられていません。</translation>
     </message>
     <message>
-        <source>The row has %1 column(s) in place of %2.</source>
-        <translation>行の列数が %2 ではなく %1 です。</translation>
-    </message>
-    <message>
         <source>&quot;%1&quot; is no port from 1 to 65535.</source>
         <translation>「%1」は 1～65535 のポートではありません。</translation>
     </message>
@@ -1522,6 +1518,12 @@
     <message>
         <source>it is no file</source>
         <translation>ファイルではありません</translation>
+    </message>
+    <message numerus="yes">
+        <source>The row has %n column(s) in place of %1.</source>
+        <translation>
+            <numerusform>行の列数が %1 ではなく %n です。</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1637,15 +1639,15 @@
         <source>%1 could not be started: %2.</source>
         <translation>「%1」を開始できませんでした: %2。</translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
-        <translation>
-            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
-        </translation>
-    </message>
     <message>
         <source>%1 may have begun: %2. Look at its task before you try again.</source>
         <translation>「%1」は開始された可能性があります: %2。再試行する前にタスクを確認してください。</translation>
+    </message>
+    <message numerus="yes">
+        <source>Left out: %n device(s) that the server does not manage any more.</source>
+        <translation>
+            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -2023,6 +2025,10 @@
         <source>Certificates in use</source>
         <translation>使用中の証明書</translation>
     </message>
+    <message>
+        <source>Not available in this version yet.</source>
+        <translation>このバージョンではまだ利用できません。</translation>
+    </message>
 </context>
 <context>
     <name>DeviceWindow</name>
@@ -2053,6 +2059,10 @@
     <message>
         <source>The device cannot be shown.</source>
         <translation>デバイスを表示できません。</translation>
+    </message>
+    <message>
+        <source>The device states could not be read: the client is busy, try again.</source>
+        <translation>デバイスの状態を読み取れませんでした。クライアントがビジー状態です。もう一度お試しください。</translation>
     </message>
 </context>
 <context>
@@ -2954,7 +2964,7 @@
 <context>
     <name>QueueStrips</name>
     <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <source>Left out: %n device(s) that the server does not manage any more.</source>
         <translation>
             <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
         </translation>
@@ -3363,15 +3373,15 @@
         <source>Stopped.</source>
         <translation>停止しました。</translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) wait for the second wave.</source>
-        <translation>
-            <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
-        </translation>
-    </message>
     <message>
         <source>Finished: %1.</source>
         <translation>完了: %1。</translation>
+    </message>
+    <message numerus="yes">
+        <source>Waiting for the second wave: %n device(s).</source>
+        <translation>
+            <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
+        </translation>
     </message>
 </context>
 <context>

@@ -124,10 +124,11 @@ void MainWindow::stopWork() {
 }
 
 void MainWindow::connectPages() {
-    connect(m_logWindow, &LogWindow::export_button_clicked, m_deviceWindow,
-            &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_logWindow, &LogWindow::export_button_clicked, m_deviceWindow, &DeviceWindow::showProgress);
     connect(m_logWindow, &LogWindow::export_file_generated, m_deviceWindow,
-            &DeviceWindow::onShowAnimatedMsgDlg);
+            [this](const QString &message, bool written) {
+                written ? m_deviceWindow->showSuccess(message) : m_deviceWindow->showError(message);
+            });
 }
 
 /// Leads to a page unless the one that is left has changes: then the user decides, and the rail shows the
@@ -181,10 +182,10 @@ void MainWindow::connectPanels() {
 void MainWindow::connectPostWork() {
     CPostWork &work = CPostWork::instance();
     connect(&work, &CPostWork::exported, m_deviceWindow, [this](const QString &path) {
-        m_deviceWindow->showDefAnimateMsgDlg(
+        m_deviceWindow->showSuccess(
             tr("Debug information saved as “%1”.").arg(QDir::toNativeSeparators(path)));
     });
-    connect(&work, &CPostWork::exportFailed, m_deviceWindow, &DeviceWindow::showDefAnimateMsgDlg);
+    connect(&work, &CPostWork::exportFailed, m_deviceWindow, &DeviceWindow::showError);
 }
 
 /// A button opens its panel, and closes it when it is the one that is open.

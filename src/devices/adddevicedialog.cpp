@@ -189,7 +189,7 @@ void AddDeviceDialog::onFound(const DeviceDiscovery::Search &search,
     if (!isManual || added > 0)
         return;
     if (!devices.empty())
-        m_warning.setText(tr("The device(s) found there are managed or listed already."));
+        m_warning.setText(tr("What was found there is managed or listed already."));
     else if (search.method == DeviceDiscovery::Method::Address)
         m_warning.setText(tr("No device was found at %1.").arg(search.from));
     else
@@ -225,7 +225,7 @@ void AddDeviceDialog::saveTemplate(const QString &path) {
         path, [path] { return CsvDevices::writeTemplate(path); },
         [this](const QString &error) {
             if (error.isEmpty())
-                tell(tr("The template was written."));
+                tell(tr("The template was written."), TransientMessage::Kind::Success);
             else
                 m_warning.setText(tr("The template could not be written: %1.").arg(error));
         });
@@ -238,11 +238,11 @@ void AddDeviceDialog::onCsvRead(const QString &name, const CsvDevices::Reading &
     const int added = m_model->add(reading.devices, DeviceSource::File);
     const int known = static_cast<int>(reading.devices.size()) - added;
     if (added > 0)
-        tell(tr("%n device(s) added to the list.", nullptr, added));
+        tell(tr("%n device(s) added to the list.", nullptr, added), TransientMessage::Kind::Success);
     if (reading.devices.empty() && reading.refused.empty())
         m_warning.setText(tr("There is no device in the file \"%1\".").arg(name));
     else if (known > 0)
-        m_warning.setText(tr("%n device(s) of the file are managed or listed already.", nullptr, known));
+        m_warning.setText(tr("Managed or listed already: %n device(s) of the file.", nullptr, known));
     if (reading.refused.empty())
         return;
     std::vector<InvalidDeviceDialog::Entry> entries;
@@ -311,9 +311,10 @@ void AddDeviceDialog::onAdded(const Addition &addition) {
     else if (missing < addition.sent)
         told += tr("%n device(s) added.", nullptr, addition.sent - missing);
     if (addition.known > 0)
-        told += tr("%n device(s) were managed already and stay as they are.", nullptr, addition.known);
+        told += tr("Managed already and left as they are: %n device(s).", nullptr, addition.known);
     if (!told.isEmpty())
-        tell(told.join(QLatin1Char(' ')));
+        tell(told.join(QLatin1Char(' ')),
+             addition.check == ApiOk ? TransientMessage::Kind::Success : TransientMessage::Kind::Error);
     std::vector<InvalidDeviceDialog::Entry> entries;
     for (const DeviceRecordPtr &device : addition.missing)
         entries.push_back({tr("%1, %2").arg(device->text(DeviceColumn::Ip), device->text(DeviceColumn::Mac)),
@@ -330,13 +331,13 @@ void AddDeviceDialog::onAddFailed(const QString &reason) {
     setManaged(m_managed);
     if (isVisible())
         return;
-    tell(message);
+    tell(message, TransientMessage::Kind::Error);
     deleteLater();
 }
 
-void AddDeviceDialog::tell(const QString &message) {
+void AddDeviceDialog::tell(const QString &message, TransientMessage::Kind kind) {
     if (QWidget *over = isVisible() ? this : parentWidget())
-        TransientMessage::show(over, message);
+        TransientMessage::show(over, message, kind);
 }
 
 void AddDeviceDialog::listInvalid(const QString &message,
@@ -394,7 +395,7 @@ void AddDeviceDialog::updateEmptyPage() {
     } else {
         m_ui->emptyTitleLabel->setText(tr("No new device found"));
         m_ui->emptyHintLabel->setText(
-            m_knownFound > 0 ? tr("%n device(s) answered, which are managed already.", nullptr, m_knownFound)
+            m_knownFound > 0 ? tr("Managed already: %n device(s) that answered.", nullptr, m_knownFound)
                              : tr("Devices that the server does not reach by itself can be added manually or "
                                   "from a file."));
     }

@@ -4,6 +4,7 @@
 #include "deviceinventory.h"
 #include "framelessdialog.h"
 #include "invaliddevicedialog.h"
+#include "transientmessage.h"
 #include "warningline.h"
 
 #include <functional>
@@ -69,7 +70,7 @@ private:
     void onAddFailed(const QString &reason);
 
     /// Tells over the dialog, or over its parent once it is closed.
-    void tell(const QString &message);
+    void tell(const QString &message, TransientMessage::Kind kind);
     void listInvalid(const QString &message, const std::vector<InvalidDeviceDialog::Entry> &entries);
     void updateSelection();
     void updateState();

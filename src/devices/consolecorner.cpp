@@ -15,8 +15,9 @@
 namespace {
 constexpr QSize pictureSize{16, 16};
 constexpr int spaceForTabs = 290;
-constexpr int narrowest = 270;
 constexpr int widest = 560;
+/// Border, padding and arrow of a combo box.
+constexpr int comboFrame = 46;
 } // namespace
 
 ConsoleCorner::ConsoleCorner(QWidget *parent)
@@ -35,7 +36,6 @@ ConsoleCorner::ConsoleCorner(QWidget *parent)
     m_remoteCombo->setObjectName(QStringLiteral("remoteConnectionComboBox"));
     m_remoteCombo->setAccessibleName(tr("Remote connection"));
     m_remoteCombo->setPlaceholderText(tr("Remote connection"));
-    m_remoteCombo->setMinimumWidth(126);
     connect(m_remoteCombo, &QComboBox::activated, this, [this](int index) {
         const QString id = m_remoteCombo->itemData(index).toString();
         m_remoteCombo->setCurrentIndex(-1);
@@ -66,7 +66,15 @@ void ConsoleCorner::loadServers() {
     m_remoteCombo->setEnabled(m_remoteCombo->count() > 0);
 }
 
+/// The combo box says what it is for with its placeholder alone, so that is never cut.
+void ConsoleCorner::showEvent(QShowEvent *event) {
+    m_remoteCombo->ensurePolished();
+    m_remoteCombo->setMinimumWidth(
+        m_remoteCombo->fontMetrics().horizontalAdvance(m_remoteCombo->placeholderText()) + comboFrame);
+    QWidget::showEvent(event);
+}
+
 QSize ConsoleCorner::sizeHint() const {
     const int room = parentWidget() ? parentWidget()->width() - spaceForTabs : widest;
-    return {std::clamp(room, narrowest, widest), QWidget::sizeHint().height()};
+    return {std::clamp(room, minimumSizeHint().width(), widest), QWidget::sizeHint().height()};
 }

@@ -25,6 +25,9 @@ public:
 signals:
     void serverChosen(const QString &serverId);
 
+protected:
+    void showEvent(QShowEvent *event) override;
+
 private:
     QLineEdit *m_search;
     QComboBox *m_remoteCombo;

@@ -163,8 +163,8 @@ private:
             return Text::tr("A quotation mark is not closed.");
         if (fields->size() != m_layout.columns) {
             qDebug("invalid column number in csv file");
-            return Text::tr("The row has %1 column(s) in place of %2.")
-                .arg(fields->size())
+            return Text::tr("The row has %n column(s) in place of %1.", nullptr,
+                            static_cast<int>(fields->size()))
                 .arg(m_layout.columns);
         }
         return refusal(*fields, row.line);

@@ -36,14 +36,23 @@ int countOf(const std::vector<SiteMembership::DeviceOutcome> &outcomes, Outcome 
         }));
 }
 
+bool isAuthorized(DeviceStatusCode code) {
+    return code == DeviceStatusCode::Authorized || code == DeviceStatusCode::Maintaining;
+}
+
+int authorizedOf(const std::map<DeviceStatusCode, int> &states) {
+    int count = 0;
+    for (const auto &[code, devices] : states)
+        count += isAuthorized(code) ? devices : 0;
+    return count;
+}
+
 /// How many devices take the credentials, and what the others say.
 QString authorizationText(const std::map<DeviceStatusCode, int> &states, int asked) {
-    int good = 0;
+    const int good = authorizedOf(states);
     QStringList others;
     for (const auto &[code, count] : states) {
-        if (code == DeviceStatusCode::Authorized || code == DeviceStatusCode::Maintaining)
-            good += count;
-        else
+        if (!isAuthorized(code))
             others += DeviceActions::tr("%1: %2").arg(DeviceStatus::text(code).trimmed()).arg(count);
     }
     if (others.isEmpty())
@@ -64,7 +73,7 @@ QString joined(QStringList sentences) {
 QString leftOutText(qsizetype vanished) {
     if (vanished == 0)
         return {};
-    return DeviceActions::tr("%n device(s) were left out: the server does not manage them any more.", nullptr,
+    return DeviceActions::tr("Left out: %n device(s) that the server does not manage any more.", nullptr,
                              static_cast<int>(vanished));
 }
 
@@ -154,8 +163,13 @@ void DeviceActions::tellAuthorized(const QStringList &deviceIds, const QString &
         [this, leftOut,
          asked = static_cast<int>(deviceIds.size())](const std::map<DeviceStatusCode, int> &states) {
             emit statesChanged();
-            if (!states.empty())
-                emit done(joined({authorizationText(states, asked), leftOut}));
+            if (states.empty())
+                return;
+            const QString message = joined({authorizationText(states, asked), leftOut});
+            if (authorizedOf(states) == asked)
+                emit done(message);
+            else
+                emit failed(message);
         },
         {}, [] { std::this_thread::sleep_for(authorizationTime); });
 }
@@ -256,9 +270,9 @@ void DeviceActions::commit(const QString &name, const QStringList &deviceIds,
 
 void DeviceActions::exportList(const QString &path, const DeviceSnapshotPtr &devices,
                                const std::vector<int> &places) {
-    emit done(tr("Exporting..."));
+    emit working(tr("Exporting..."));
     auto *runner = NetJob::createRunner("exporting the device list", NetTask::Turn::Beside);
-    NetJob::post(
+    const bool started = NetJob::post(
         runner, this, [path, devices, places] { return DeviceExport::write(path, *devices, places); },
         [this](const QString &error) {
             if (error.isEmpty())
@@ -270,6 +284,8 @@ void DeviceActions::exportList(const QString &path, const DeviceSnapshotPtr &dev
             if (end != JobEnd::Delivered)
                 emit failed(tr("The device list could not be exported."));
         });
+    if (!started)
+        emit failed(tr("The device list could not be exported."));
 }
 
 void DeviceActions::start(const Errand &errand) {

@@ -39,6 +39,8 @@ public:
     void exportList(const QString &path, const DeviceSnapshotPtr &devices, const std::vector<int> &places);
 
 signals:
+    /// Something has begun that takes long; done or failed follows.
+    void working(const QString &message);
     /// Something was done that has no task; the message says what.
     void done(const QString &message);
     /// The service's devices are others now, or belong to other sites.

@@ -14,13 +14,17 @@ void DevicePlacement::askToRemove(const QStringList &deviceIds, const QString &s
     const auto kind = forGood ? ConfirmDialog::Kind::DeleteDevices : ConfirmDialog::Kind::RemoveFromSite;
     auto *confirm = new ConfirmDialog(kind, m_over, static_cast<int>(deviceIds.size()));
     confirm->setAttribute(Qt::WA_DeleteOnClose);
-    connect(confirm, &QDialog::accepted, this, [this, deviceIds, siteId, forGood] {
-        if (forGood)
-            m_actions->deleteDevices(deviceIds);
-        else
-            m_actions->removeFromSite(deviceIds, siteId);
-    });
+    m_toRemove = deviceIds;
+    m_siteToLeave = siteId;
+    connect(confirm, &QDialog::accepted, this, [this, forGood] { emit removalConfirmed(forGood); });
     confirm->open();
+}
+
+void DevicePlacement::remove(bool fromOverview) {
+    if (fromOverview)
+        m_actions->deleteDevices(m_toRemove);
+    else
+        m_actions->removeFromSite(m_toRemove, m_siteToLeave);
 }
 
 void DevicePlacement::drop(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,

@@ -75,6 +75,8 @@ struct Operation {
     const char *text;
     const char *icon;
     bool groupBegins = false;
+    /// What it does comes with a later version: it is always off, and the first to give way.
+    bool isPlanned = false;
 };
 
 constexpr Operation operations[] = {
@@ -85,12 +87,12 @@ constexpr Operation operations[] = {
     {"uploadButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Upload"), "tool_upload_line", true},
     {"quickSettingButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Quick Setup"), "tool_quick_setup_line"},
     {"setConfigurationButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Set Configuration"),
-     "tool_set_configuration_line"},
+     "tool_set_configuration_line", false, true},
     {"backupConfigurationButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Backup Configuration"),
-     "tool_backup_configuration_line"},
+     "tool_backup_configuration_line", false, true},
     {"restartButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Restart Device"), "tool_restart_line", true},
     {"restoreButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Restore Device"), "tool_restore_line"},
-    {"replaceButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Replace Device"), "tool_replace_line"},
+    {"replaceButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Replace Device"), "tool_replace_line", false, true},
     {"exportButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Export"), "tool_export_line", true},
     {"refreshButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Refresh"), "tool_refresh_line"},
     {"deleteButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Delete Device"), "tool_delete_line"},
@@ -105,6 +107,7 @@ void addSubstitute(QMenu *menu, QToolButton *button) {
         QObject::connect(entry, &QAction::triggered, button, &QToolButton::click);
     }
     menu->actions().constLast()->setEnabled(button->isEnabled());
+    menu->actions().constLast()->setToolTip(button->toolTip());
 }
 
 struct Entry {
@@ -140,6 +143,8 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
         button->setPopupMode(QToolButton::InstantPopup);
         button->setFocusPolicy(Qt::TabFocus);
         button->setEnabled(false);
+        if (operation.isPlanned)
+            button->setToolTip(tr("Not available in this version yet."));
         layout->addWidget(button);
         m_buttons.push_back(button);
     }
@@ -156,9 +161,8 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
                             {"uploadConfigurationAction", tr("Upload Configuration File")}});
     auto *certificateMenu = new PopupMenu(uploadMenu);
     certificateMenu->setTitle(tr("Upload Certificate"));
-    addEntries(certificateMenu, {{"uploadHttpsAction", tr("HTTPS")},
-                                 {"uploadIeeeAction", tr("IEEE 802.1x")},
-                                 {"certificateListAction", tr("Certificates in use")}});
+    addEntries(certificateMenu,
+               {{"uploadHttpsAction", tr("HTTPS")}, {"uploadIeeeAction", tr("IEEE 802.1x")}});
     uploadMenu->addMenu(certificateMenu);
     button(QStringLiteral("uploadButton"))->setMenu(uploadMenu);
     auto *configurationMenu = new PopupMenu(this);
@@ -168,7 +172,12 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
     auto *restoreMenu = new PopupMenu(this);
     addEntries(restoreMenu, {{"restorePointAction", tr("Restore to Restore Point")},
                              {"factoryDefaultAction", tr("Restore to Factory Default")}});
+    entry(QStringLiteral("restorePointAction"))->setToolTip(tr("Not available in this version yet."));
     button(QStringLiteral("restoreButton"))->setMenu(restoreMenu);
+    // Certificates are looked at for all devices, so this is in the menu of the table's rows.
+    m_certificates = new QAction(tr("Certificates in use"), this);
+    m_certificates->setObjectName(QStringLiteral("certificateListAction"));
+    m_certificates->setEnabled(false);
 }
 
 void DeviceToolBar::buildMoreButton() {
@@ -202,6 +211,8 @@ void DeviceToolBar::addOperations(QMenu *menu) const {
         if (each->isEnabled() && usable)
             addSubstitute(menu, each);
     }
+    menu->addSeparator();
+    menu->addAction(m_certificates);
 }
 
 QAction *DeviceToolBar::entry(const QString &objectName) const {
@@ -217,20 +228,28 @@ void DeviceToolBar::resizeEvent(QResizeEvent *event) {
     fitButtons();
 }
 
-/// Shows as many buttons as there is room for; the others move to the menu at the end.
+/// Shows as many buttons as there is room for; the others move to the menu at the end, those first that do
+/// nothing yet.
 void DeviceToolBar::fitButtons() {
     const auto widthOf = [this](std::size_t i) {
         return m_buttons[i]->sizeHint().width() + buttonGap + (operations[i].groupBegins ? groupGap : 0);
     };
-    int all = 0;
+    int wanted = 0;
     for (std::size_t i = 0; i < m_buttons.size(); ++i)
-        all += widthOf(i);
-    const bool overflow = all > width();
-    int room = overflow ? width() - m_more->sizeHint().width() : width();
-    for (std::size_t i = 0; i < m_buttons.size(); ++i) {
-        room -= widthOf(i);
-        m_buttons[i]->setVisible(room >= 0);
+        wanted += widthOf(i);
+    const bool overflow = wanted > width();
+    wanted += overflow ? m_more->sizeHint().width() : 0;
+    std::vector<bool> shown(m_buttons.size(), true);
+    for (const bool planned : {true, false}) {
+        for (std::size_t i = m_buttons.size(); i-- > 0 && wanted > width();) {
+            if (operations[i].isPlanned != planned)
+                continue;
+            shown[i] = false;
+            wanted -= widthOf(i);
+        }
     }
+    for (std::size_t i = 0; i < m_buttons.size(); ++i)
+        m_buttons[i]->setVisible(shown[i]);
     m_more->setVisible(overflow);
 }
 

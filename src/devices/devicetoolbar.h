@@ -36,4 +36,5 @@ private:
 
     std::vector<QToolButton *> m_buttons;
     QToolButton *m_more = nullptr;
+    QAction *m_certificates = nullptr;
 };

@@ -28,8 +28,8 @@
 #include "sitetree.h"
 #include "targetbox.h"
 #include "taskinfopool.h"
-#include "transientmessage.h"
 
+#include <QApplication>
 #include <QDebug>
 #include <QHBoxLayout>
 #include <QHeaderView>
@@ -43,7 +43,6 @@
 #include <nlohmann/json.hpp>
 
 #include <chrono>
-#include <new>
 #include <thread>
 
 using namespace std::chrono_literals;
@@ -70,7 +69,6 @@ constexpr std::pair<const char *, UploadKind> uploadEntries[] = {
 DeviceWindow::DeviceWindow(QWidget *parent)
     : QWidget(parent),
       m_monitor(std::make_unique<DeviceMonitor>(m_inventory)),
-      m_refreshTask(new (std::nothrow) NetTask),
       m_splitter(new QSplitter(this)),
       m_console(new QWidget(m_splitter)),
       m_siteTree(new SiteTree(m_splitter)),
@@ -86,8 +84,6 @@ DeviceWindow::DeviceWindow(QWidget *parent)
       m_selectionLogDelay(new QTimer(this)) {
     qDebug("DeviceWindow constructor");
     setObjectName(QStringLiteral("DeviceWindow"));
-    if (!m_refreshTask)
-        qDebug("net task create failed!should not be this case!");
     m_selectionLogDelay->setSingleShot(true);
     m_selectionLogDelay->setInterval(selectionLogDelay);
     buildLayout();
@@ -143,14 +139,14 @@ void DeviceWindow::connectParts() {
         m_noticeBar->setVisible(m_siteTree->edits().isDirty());
         followSiteNames();
     });
-    connect(m_siteTree, &SiteTree::editsDropped, this, [this](const QStringList &reasons) {
-        emit onShowAnimatedMsgDlg(reasons.join(QLatin1Char('\n')));
-    });
-    connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
-    connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::onShowAnimatedMsgDlg);
-    connect(m_siteTree, &SiteTree::devicesDropped, m_placement, &DevicePlacement::drop);
+    connect(m_siteTree, &SiteTree::editsDropped, this,
+            [this](const QStringList &reasons) { showError(reasons.join(QLatin1Char('\n'))); });
+    connect(m_siteTree, &SiteTree::editRefused, this, &DeviceWindow::showError);
+    connect(m_siteTree, &SiteTree::dropRefused, this, &DeviceWindow::showError);
+    connect(m_siteTree, &SiteTree::devicesDropped, this, &DeviceWindow::onDeviceDrop);
+    connect(m_placement, &DevicePlacement::removalConfirmed, this, &DeviceWindow::removeDevices);
     connect(m_noticeBar, &NoticeBar::msgButtonClicked, this, &DeviceWindow::commitSites);
-    connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_siteCommit, &SiteCommit::failed, this, &DeviceWindow::showError);
     connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
     connect(m_tabs, &DeviceTabs::currentChanged, this, &DeviceWindow::showStatusCounts);
     connect(m_tabs, &DeviceTabs::selectionChanged, this, &DeviceWindow::onSelectionChanged);
@@ -176,6 +172,7 @@ void DeviceWindow::connectOperations() {
         {"authorizeButton", &DeviceWindow::on_authorizeButton_clicked},
         {"setPasswordButton", &DeviceWindow::on_setPasswordButton_clicked},
         {"ipButton", &DeviceWindow::on_ipButton_clicked},
+        {"quickSettingButton", &DeviceWindow::on_quickSettingButton_clicked},
         {"restartButton", &DeviceWindow::on_restartButton_clicked},
         {"refreshButton", &DeviceWindow::openRefreshDialog},
         {"deleteButton", &DeviceWindow::on_deleteButton_clicked},
@@ -191,10 +188,9 @@ void DeviceWindow::connectOperations() {
     for (const auto &[name, kind] : uploadEntries)
         connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this,
                 [this, kind = kind] { emit uploadWanted(kind, targetsOf(selectedDevices())); });
-    connect(m_toolBar->button(QStringLiteral("quickSettingButton")), &QToolButton::clicked, this,
-            [this] { emit uploadWanted(UploadKind::QuickSetup, targetsOf(selectedDevices())); });
-    connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::onShowAnimatedMsgDlg);
-    connect(m_actions, &DeviceActions::done, this, &DeviceWindow::onShowAnimatedMsgDlg);
+    connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::showError);
+    connect(m_actions, &DeviceActions::done, this, &DeviceWindow::showSuccess);
+    connect(m_actions, &DeviceActions::working, this, &DeviceWindow::showProgress);
     connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
     connect(m_actions, &DeviceActions::devicesDeleted, m_updater, &InventoryUpdater::readStatesSoon);
     connect(m_actions, &DeviceActions::statesChanged, this, [this] { m_monitor->forceRefresh(); });
@@ -299,7 +295,7 @@ void DeviceWindow::on_setPasswordButton_clicked() {
 
 void DeviceWindow::openSetPasswordDialog(const OperationTargets::List &targets) {
     if (targets.empty())
-        return showDefAnimateMsgDlg(tr("The devices are not managed any more."));
+        return showError(tr("The devices are not managed any more."));
     auto *dialog = new SetPasswordDialog(targets, m_actions, this);
     connect(dialog, &SetPasswordDialog::setPassword, this, &DeviceWindow::onSetPassword);
     dialog->open();
@@ -335,6 +331,15 @@ void DeviceWindow::on_ipButton_clicked() {
     dialog->open();
 }
 
+void DeviceWindow::on_quickSettingButton_clicked() {
+    emit uploadWanted(UploadKind::QuickSetup, targetsOf(selectedDevices()));
+}
+
+void DeviceWindow::onDeviceDrop(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
+                                const QString &sourceSiteId) {
+    m_placement->drop(siteId, deviceIds, action, sourceSiteId);
+}
+
 void DeviceWindow::on_restartButton_clicked() {
     auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this);
     confirm->setAttribute(Qt::WA_DeleteOnClose);
@@ -358,6 +363,10 @@ void DeviceWindow::on_deleteButton_clicked() {
     for (const DeviceRecordPtr &device : selectedDevices())
         ids += device->id;
     m_placement->askToRemove(ids, m_siteTree->currentSite());
+}
+
+void DeviceWindow::removeDevices(bool fromOverview) {
+    m_placement->remove(fromOverview);
 }
 
 void DeviceWindow::exportDeviceList() {
@@ -446,7 +455,8 @@ void DeviceWindow::onServerAnswered() {
         m_reconnecting->setStatusVisible(false);
         m_reconnecting->close();
     }
-    if (!m_online && !m_refreshing)
+    // A name that is being typed is not interrupted; the next answer comes soon enough.
+    if (!m_online && !m_refreshing && !m_siteTree->isTyping())
         openRefreshDialog();
     else
         m_updater->reloadAfterRest();
@@ -471,37 +481,50 @@ void DeviceWindow::onServerLost() {
 void DeviceWindow::openRefreshDialog() {
     if (m_refreshing)
         return;
-    m_refreshing = new RefreshDeviceDialog(this);
+    QWidget *modal = QApplication::activeModalWidget();
+    m_refreshing = new RefreshDeviceDialog(modal ? modal : this);
     m_refreshing->setAttribute(Qt::WA_DeleteOnClose);
-    connect(m_refreshing, &RefreshDeviceDialog::refresh, this, &DeviceWindow::onRefreshDevice);
-    connect(m_refreshing, &QDialog::accepted, this, &DeviceWindow::onRefreshDone);
+    connect(m_refreshing, &RefreshDeviceDialog::refresh, this, &DeviceWindow::onRefreshAll);
+    connect(m_refreshing, &RefreshDeviceDialog::refreshDone, this, &DeviceWindow::onRefreshDone);
     connect(m_refreshing, &QDialog::rejected, this, &DeviceWindow::onRefreshDone);
     m_refreshing->open();
 }
 
-void DeviceWindow::onRefreshDevice() {
+void DeviceWindow::onRefreshAll() {
+    if (onRefreshDevice(m_refreshing))
+        return;
+    m_refreshing->finish();
+    showError(tr("The device states could not be read: the client is busy, try again."));
+}
+
+/// Reads the states for a dialog. On a runner of its own, since that of a refresh which was cancelled may
+/// still be at work. False when there is none.
+bool DeviceWindow::onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog) {
     qDebug("onRefreshDevice@@@@@");
     const auto read = [snapshot = m_inventory.snapshot(),
                        codes = m_inventory.statuses()](ServiceSession &session) {
         return InventoryReader::readStatus(session, snapshot, codes);
     };
-    const QPointer<RefreshDeviceDialog> dialog = m_refreshing;
-    const bool started = ServiceRequest::post(
-        m_refreshTask.get(), this, read,
-        [this](const std::optional<DeviceStatusUpdate> &update) {
+    return ServiceRequest::post(
+        NetJob::createRunner("refreshing the device states"), this, read,
+        [this, dialog](const std::optional<DeviceStatusUpdate> &update) {
             if (update)
                 onUpdateDeviceStatus(*update);
-            else
-                emit onShowAnimatedMsgDlg(tr("The device states could not be read. Try again."));
+            else if (dialog)
+                showError(tr("The device states could not be read. Try again."));
         },
-        [dialog](JobEnd) {
-            if (dialog)
-                dialog->finish();
+        [this, dialog](JobEnd end) {
+            // Whoever has cancelled it does not wait for its outcome.
+            if (!dialog)
+                return;
+            dialog->finish();
+            if (end == JobEnd::NotRun)
+                showError(tr("The device states could not be read: the client is busy, try again."));
+            else if (end == JobEnd::Failed)
+                showError(tr("The device states could not be read. Try again."));
         },
         // The devices need a moment to settle; the wait must not keep other jobs from their turn.
         [] { std::this_thread::sleep_for(refreshDelay); });
-    if (!started && dialog)
-        dialog->finish();
 }
 
 void DeviceWindow::onRefreshDone() {
@@ -536,13 +559,13 @@ void DeviceWindow::selectDevice(const QString &id, const QString &ip) {
             place = each;
     }
     if (place < 0)
-        return showDefAnimateMsgDlg(tr("The device is not managed any more."));
+        return showError(tr("The device is not managed any more."));
     if (m_tabs->selectDevice(place))
         return;
     clearFilter();
     m_siteTree->select(Sites::overviewId);
     if (!m_tabs->selectDevice(place))
-        showDefAnimateMsgDlg(tr("The device cannot be shown."));
+        showError(tr("The device cannot be shown."));
 }
 
 void DeviceWindow::onSelectionChanged() {
@@ -583,6 +606,18 @@ void DeviceWindow::showContent() {
     m_tabs->showContent(content, m_siteTree->currentSite() != Sites::overviewId);
 }
 
-void DeviceWindow::showDefAnimateMsgDlg(const QString &message) {
-    TransientMessage::show(this, message);
+void DeviceWindow::showDefAnimateMsgDlg(const QString &message, TransientMessage::Kind kind) {
+    TransientMessage::show(this, message, kind);
+}
+
+void DeviceWindow::showSuccess(const QString &message) {
+    emit onShowAnimatedMsgDlg(message, TransientMessage::Kind::Success);
+}
+
+void DeviceWindow::showError(const QString &message) {
+    emit onShowAnimatedMsgDlg(message, TransientMessage::Kind::Error);
+}
+
+void DeviceWindow::showProgress(const QString &message) {
+    emit onShowAnimatedMsgDlg(message, TransientMessage::Kind::Loading);
 }

@@ -3,8 +3,8 @@
 #include "deviceinventory.h"
 #include "deviceoperations.h"
 #include "inventoryreader.h"
-#include "nettask.h"
 #include "operationtargets.h"
+#include "transientmessage.h"
 #include "uploadkind.h"
 
 #include <QPointer>
@@ -62,12 +62,21 @@ public slots:
     /// Selects the device with the id, or else the one with the address, and brings it into view.
     void selectDevice(const QString &id, const QString &ip);
     /// Shows a transient message.
-    void showDefAnimateMsgDlg(const QString &message);
+    void showDefAnimateMsgDlg(const QString &message,
+                              TransientMessage::Kind kind = TransientMessage::Kind::Plain);
+    void showSuccess(const QString &message);
+    void showError(const QString &message);
+    /// What shows until the outcome takes its place.
+    void showProgress(const QString &message);
+    /// Removes the devices that were selected when the user was asked: from the service, or from the site
+    /// that was selected then.
+    void removeDevices(bool fromOverview);
 
 signals:
     /// No task is at work any more.
     void allTasksDone();
-    void onShowAnimatedMsgDlg(const QString &message);
+    void onShowAnimatedMsgDlg(const QString &message,
+                              TransientMessage::Kind kind = TransientMessage::Kind::Plain);
     /// The user gives the lost server up.
     void disconnectRequested();
     /// A server of the saved list was chosen in place of the present one.
@@ -89,6 +98,9 @@ private:
     void openSetPasswordDialog(const OperationTargets::List &targets);
     void onSetPassword(JSON &devices, const QString &name, const QString &password);
     void on_ipButton_clicked();
+    void on_quickSettingButton_clicked();
+    void onDeviceDrop(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
+                      const QString &sourceSiteId);
     void on_restartButton_clicked();
     void openRestoreDialog();
     void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
@@ -111,7 +123,8 @@ private:
     OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
 
     void openRefreshDialog();
-    void onRefreshDevice();
+    void onRefreshAll();
+    bool onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog);
     void onRefreshDone();
 
     void showContent();
@@ -120,7 +133,6 @@ private:
 
     DeviceInventory m_inventory;
     std::unique_ptr<DeviceMonitor> m_monitor;
-    NetTask::Owner m_refreshTask;
 
     QSplitter *m_splitter;
     QWidget *m_console; ///< right of the tree

@@ -24,5 +24,7 @@ public:
     ~InvalidDeviceDialog() override;
 
 private:
+    void fitWidth();
+
     std::unique_ptr<Ui::InvalidDeviceDialog> m_ui;
 };

@@ -16,8 +16,8 @@ QueueStrips::QueueStrips(QWidget *parent) : QWidget(parent) {
                                    static_cast<TaskQueue *>(&ExeTaskMgr::instance())})
         connect(queue, &TaskQueue::devicesLeftOut, this, [this](const QString &, int count) {
             TransientMessage::show(
-                this,
-                tr("%n device(s) were left out: the server does not manage them any more.", nullptr, count));
+                this, tr("Left out: %n device(s) that the server does not manage any more.", nullptr, count),
+                TransientMessage::Kind::Error);
         });
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);

@@ -20,8 +20,9 @@ RolloutStrip::RolloutStrip(QWidget *parent) : QFrame(parent), m_layout(new QVBox
     m_timer.setInterval(refreshMs);
     connect(&m_timer, &QTimer::timeout, this, &RolloutStrip::showTexts);
     connect(&RolloutMgr::instance(), &RolloutMgr::changed, this, &RolloutStrip::onChanged);
-    connect(&RolloutMgr::instance(), &RolloutMgr::dropped, this,
-            [this](const QString &message) { TransientMessage::show(this, message); });
+    connect(&RolloutMgr::instance(), &RolloutMgr::dropped, this, [this](const QString &message) {
+        TransientMessage::show(this, message, TransientMessage::Kind::Error);
+    });
     onChanged();
 }
 

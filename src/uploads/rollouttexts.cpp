@@ -67,7 +67,7 @@ QString reasonText(const Rollout &rollout) {
 QString restText(const Rollout &rollout) {
     if (rollout.progress().stoppedIn == Rollout::State::SecondWave)
         return {};
-    return Texts::tr("%n device(s) wait for the second wave.", nullptr,
+    return Texts::tr("Waiting for the second wave: %n device(s).", nullptr,
                      static_cast<int>(rollout.plan().rest().size()));
 }
 

@@ -65,7 +65,7 @@ QDialog *UploadDialogs::dialogFor(UploadKind kind, const OperationTargets::List 
 void UploadDialogs::openAgain(const QString &serviceType, const QStringList &deviceIds) {
     const OperationTargets::List targets = m_console->targetsWith(deviceIds);
     if (targets.empty())
-        return m_console->showDefAnimateMsgDlg(tr("The devices are not managed any more."));
+        return m_console->showError(tr("The devices are not managed any more."));
     const bool isIeee = serviceType.contains(QLatin1String("IEEE"));
     open(isIeee ? UploadKind::IeeeCertificate : UploadKind::HttpsCertificate, targets, serviceType);
 }

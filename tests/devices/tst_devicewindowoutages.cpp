@@ -198,8 +198,10 @@ private slots:
         QTest::mouseClick(visible<RefreshDeviceDialog>()->findChild<QPushButton *>("cancelButton"),
                           Qt::LeftButton);
         QTRY_VERIFY(!m_window->findChild<RefreshDeviceDialog *>());
-        // The job of the first one still waits for the devices to settle.
+        // The job of the first one still waits for the devices to settle, and the second waits as long again.
         QTest::mouseClick(refresh, Qt::LeftButton);
+        QTest::qWait(1500);
+        QVERIFY(visible<RefreshDeviceDialog>());
         QTRY_VERIFY_WITH_TIMEOUT(!m_window->findChild<RefreshDeviceDialog *>(), patienceMs);
         QVERIFY(!QApplication::activeModalWidget());
         QTest::mouseClick(table("cameraTable")->viewport(), Qt::LeftButton, {}, QPoint(30, 18));

@@ -245,7 +245,7 @@ private slots:
         m_service.tell("remove " + id);
         m_service.tell("fault code=4@/v1/task/init,times=1");
         visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
-        QTRY_VERIFY(messageHas("1 device(s) were left out: the server does not manage them any more."));
+        QTRY_VERIFY(messageHas("Left out: 1 device(s) that the server does not manage any more."));
         QTRY_VERIFY_WITH_TIMEOUT(ended("deviceRestart"), patienceMs);
     }
 

@@ -248,7 +248,7 @@ void TestRollout::stoppedByTheUser() {
     bed.beginFirst();
     bed.rollout.stop();
     bed.list("T1", "pTaskDone", QStringList(5, done));
-    QCOMPARE(bed.text(), "First wave: 5 of 5 done. Stopped. 2 device(s) wait for the second wave.");
+    QCOMPARE(bed.text(), "First wave: 5 of 5 done. Stopped. Waiting for the second wave: 2 device(s).");
     bed.rollout.goOn();
     QCOMPARE(bed.rollout.state(), State::Waiting);
     bed.rollout.stop();

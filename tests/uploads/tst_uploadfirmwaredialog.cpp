@@ -261,7 +261,7 @@ void TestUploadFirmwareDialog::wavesAreFollowedInTheStrip() {
     QTRY_COMPARE(standing->text(), "First wave: 3 of 3 done, 3 failed.");
     strip.findChild<QToolButton *>("stopRolloutButton")->click();
     QCOMPARE(standing->text(),
-             "First wave: 3 of 3 done, 3 failed. Stopped. 7 device(s) wait for the second wave.");
+             "First wave: 3 of 3 done, 3 failed. Stopped. Waiting for the second wave: 7 device(s).");
     strip.findChild<QToolButton *>("continueRolloutButton")->click();
     QCOMPARE(RolloutMgr::instance().rollouts().at(0)->state(), Rollout::State::FirstWave);
     strip.findChild<QToolButton *>("stopRolloutButton")->click();
