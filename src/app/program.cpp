@@ -40,6 +40,12 @@ QIcon applicationIcon() {
     return icon;
 }
 
+/// Ends the process beside threads that still hang.
+[[noreturn]] void endNow(int status) {
+    MessageLog::finish();
+    std::_Exit(status);
+}
+
 int runWindows(QApplication &application, const std::function<void(QWidget &)> &shown) {
     const QPixmap picture(QStringLiteral(":/images/img_splash.png"));
     QSplashScreen splash(picture);
@@ -96,8 +102,9 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         StoreWriter::flush();
         // A name look-up cannot be interrupted; nothing is being written while one hangs.
         if (!NetTask::waitForAll(runnersEndMs))
-            std::_Exit(status);
+            endNow(status);
     }
+    MessageLog::finish();
     return status;
 }
 

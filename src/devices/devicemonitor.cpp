@@ -55,6 +55,7 @@ void DeviceMonitor::poll() {
         return;
     const auto read = [snapshot = m_inventory.snapshot(),
                        codes = m_inventory.statuses()](ServiceSession &session) {
+        const MessageLog::PollScope counted;
         return InventoryReader::readStatus(session, snapshot, codes);
     };
     // The flag goes when the runner ends, whatever became of the job.
@@ -76,6 +77,7 @@ void DeviceMonitor::checkConnection() {
     std::uint32_t online = 0;
     unsigned result = ApiException;
     NetTask::runAndWait([&] {
+        const MessageLog::PollScope counted;
         result =
             ServiceSession(login).call([&](CApiClient &client) { return client.isServerOnline(online); });
     });

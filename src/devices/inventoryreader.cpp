@@ -1,5 +1,6 @@
 #include "inventoryreader.h"
 
+#include "messagelog.h"
 #include "pagereader.h"
 #include "servicesession.h"
 
@@ -8,6 +9,7 @@
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
+#include <atomic>
 
 namespace InventoryReader {
 
@@ -116,6 +118,15 @@ std::vector<DeviceStatusCode> carriedOver(const DeviceSnapshot &snapshot, const 
     return codes;
 }
 
+/// Only a list that differs from the last one is worth its room in the log.
+void logSites(const JSON &sites) {
+    static std::atomic<std::size_t> logged = 0;
+    const std::string dump = dumpJson(sites);
+    const std::size_t hash = std::hash<std::string>()(dump);
+    if (logged.exchange(hash) != hash)
+        qDebug("site list size: %d, dump: %s", static_cast<int>(sites.size()), dump.c_str());
+}
+
 } // namespace
 
 std::optional<Sites::List> readSites(ServiceSession &session) {
@@ -131,7 +142,7 @@ std::optional<Sites::List> readSites(ServiceSession &session) {
     }
     if (all.empty())
         qDebug("no site found!");
-    qDebug("site list size: %d, dump: %s", static_cast<int>(all.size()), dumpJson(all).c_str());
+    logSites(all);
     Sites::List sites = Sites::parse(all);
     const auto isReadable = [](const JSON &site) { return !textMember(site, "siteid").empty(); };
     if (all.empty() || std::any_of(all.begin(), all.end(), isReadable))
@@ -142,6 +153,7 @@ std::optional<Sites::List> readSites(ServiceSession &session) {
 
 Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
                 std::vector<DeviceStatusCode> previousCodes) {
+    const MessageLog::PollScope counted;
     Reading reading;
     reading.sites = readSites(session);
     reading.devices = readDevices(session, previous);

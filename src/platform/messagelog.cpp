@@ -1,22 +1,28 @@
 #include "messagelog.h"
 
-#include "apppaths.h"
 #include "crashreport.h"
-#include "privatefiles.h"
+#include "logfile.h"
+#include "repeatedlines.h"
 
 #include <QDateTime>
-#include <QFile>
+#include <QThreadPool>
 
+#include <algorithm>
 #include <atomic>
 #include <cstdio>
 #include <cstdlib>
 #include <mutex>
 
+#ifdef Q_OS_WIN
+#include <windows.h>
+#else
+#include <sys/stat.h>
+#include <unistd.h>
+#endif
+
 namespace MessageLog {
 
 namespace {
-
-constexpr QFileDevice::Permissions ownerOnly = QFileDevice::ReadOwner | QFileDevice::WriteOwner;
 
 // Noncharacters around a secret on its way into a line; whoever writes the line takes them out.
 constexpr QByteArrayView secretBegin("\xEF\xB7\x90");
@@ -24,7 +30,9 @@ constexpr QByteArrayView secretEnd("\xEF\xB7\x91");
 constexpr QByteArrayView mask("***");
 
 std::mutex logMutex;
+QDate day; ///< of the last line
 std::atomic<bool> installed = false;
+thread_local int pollScopes = 0;
 
 /// Local time, with the zone's offset asked for once a minute: asking costs more than the whole line.
 QDateTime localNow() {
@@ -61,18 +69,6 @@ void print(const QByteArray &text) {
     std::fflush(stdout);
 }
 
-bool append(const QDateTime &time, const QByteArray &line) {
-    const QString folder = AppPaths::logFolder();
-    if (!PrivateFiles::ensureFolder(folder))
-        return false;
-    QFile file(folder + QLatin1Char('/') + time.toString(QStringLiteral("yyyy-MM-dd")) +
-               QStringLiteral(".log"));
-    // One write a line keeps lines whole, also beside another process; without the buffer the end of a line
-    // would be a write of its own where text files have a longer one.
-    return file.open(QIODevice::WriteOnly | QIODevice::Append | QIODevice::Text, ownerOnly) &&
-           file.write(line) == line.size() && file.flush();
-}
-
 QByteArray withoutMarks(QByteArray text) {
     return text.replace(secretBegin, {}).replace(secretEnd, {});
 }
@@ -85,21 +81,86 @@ QByteArray masked(QByteArray text) {
     return text;
 }
 
-void write(QtMsgType type, const QMessageLogContext &context, const QString &message) {
-    const QByteArray marked = message.toUtf8();
-    const QByteArray text = withoutMarks(marked);
-    const std::lock_guard lock(logMutex);
-    print(text);
+/// The text with everything in letters that would end the line or steer a terminal: part of it may come from
+/// a service.
+QByteArray asOneLine(const QString &message) {
+    const auto isControl = [](QChar character) {
+        const char16_t code = character.unicode();
+        return (code < 0x20 && code != '\t') || (code >= 0x7f && code < 0xa0) || code == 0x2028 ||
+               code == 0x2029;
+    };
+    if (std::none_of(message.begin(), message.end(), isControl))
+        return message.toUtf8();
+    QString text;
+    for (const QChar character : message) {
+        if (character == QLatin1Char('\n'))
+            text += QLatin1String("\\n");
+        else if (character == QLatin1Char('\r'))
+            text += QLatin1String("\\r");
+        else if (isControl(character))
+            text += QStringLiteral("\\u%1").arg(character.unicode(), 4, 16, QLatin1Char('0'));
+        else
+            text += character;
+    }
+    return text.toUtf8();
+}
+
+/// Whether standard output is the user's alone; what a desktop starts writes to a journal that others read.
+bool isOutputPrivate() {
+#ifdef Q_OS_WIN
+    const auto kind = ::GetFileType(::GetStdHandle(STD_OUTPUT_HANDLE));
+    return kind == FILE_TYPE_CHAR || kind == FILE_TYPE_DISK;
+#else
+    struct stat file = {};
+    if (::isatty(STDOUT_FILENO) != 0)
+        return true;
+    return ::fstat(STDOUT_FILENO, &file) == 0 && S_ISREG(file.st_mode) && file.st_uid == ::geteuid();
+#endif
+}
+
+void removeOldFiles(const QDate &today) {
+    QThreadPool::globalInstance()->start([today] { LogFile::removeOld(today); });
+}
+
+void writeLine(const RepeatedLines::Line &message) {
+    static const bool privateOutput = isOutputPrivate();
+    const QByteArray maskedText = masked(message.text);
+    const QByteArray text = withoutMarks(message.text);
+    print(privateOutput ? text : maskedText);
     const QDateTime time = localNow();
+    day = time.date();
     const QByteArray begin =
-        time.toString(QStringLiteral("yyyy-MM-dd hh:mm:ss.zzz ")).toUtf8() + severityLabel(type);
-    const QByteArray line = begin + text + ", file: " + context.file +
-                            ", line: " + QByteArray::number(context.line) +
-                            ", function: " + context.function + '\n';
+        time.toString(QStringLiteral("yyyy-MM-dd hh:mm:ss.zzz ")).toUtf8() + severityLabel(message.type);
+    const QByteArray line = begin + text + ", file: " + message.file +
+                            ", line: " + QByteArray::number(message.line) +
+                            ", function: " + message.function + '\n';
     // A message from inside a handler would bypass it, so this one is printed directly.
-    if (!append(time, line))
+    if (!LogFile::append(time, line))
         print("Failed to open log file");
-    CrashReport::remember(begin + masked(marked));
+    CrashReport::remember(begin + maskedText);
+}
+
+/// Never destroyed: there are threads that log at the very end.
+RepeatedLines &repeatedLines() {
+    static auto *const lines = new RepeatedLines(writeLine);
+    return *lines;
+}
+
+void write(QtMsgType type, const QMessageLogContext &context, const QString &message) {
+    const RepeatedLines::Line line{type, context.file, context.line, context.function, asOneLine(message)};
+    QDate newDay;
+    {
+        const std::lock_guard lock(logMutex);
+        const qint64 now = QDateTime::currentMSecsSinceEpoch();
+        if (pollScopes > 0 && repeatedLines().count(line, now))
+            return;
+        repeatedLines().writeEnded(now);
+        const QDate before = day;
+        writeLine(line);
+        newDay = day == before ? QDate() : day;
+    }
+    if (newDay.isValid())
+        removeOldFiles(newDay);
 }
 
 void handle(QtMsgType type, const QMessageLogContext &context, const QString &message) {
@@ -114,6 +175,19 @@ void handle(QtMsgType type, const QMessageLogContext &context, const QString &me
 void install() {
     installed = true;
     qInstallMessageHandler(handle);
+}
+
+void finish() {
+    const std::lock_guard lock(logMutex);
+    repeatedLines().writeAll();
+}
+
+PollScope::PollScope() {
+    ++pollScopes;
+}
+
+PollScope::~PollScope() {
+    --pollScopes;
 }
 
 QByteArray secret(const QByteArray &text) {

@@ -80,6 +80,7 @@ CTaskInfoPool::CTaskInfoPool()
 void CTaskInfoPool::loadTaskStatuses() {
     ServiceRequest::post(&m_taskRunner, this,
                          [this](ServiceSession &session) {
+                             const MessageLog::PollScope counted;
                              if (fetchTaskStatuses(session))
                                  startPostWork();
                              return true;
@@ -90,6 +91,7 @@ void CTaskInfoPool::loadTaskStatuses() {
 void CTaskInfoPool::loadAlarmInfo() {
     ServiceRequest::post(&m_alarmRunner, this,
                          [this](ServiceSession &session) {
+                             const MessageLog::PollScope counted;
                              guarded([&] { readAlarms(session); });
                              return true;
                          },

@@ -26,7 +26,7 @@ QMessageLogger logger() {
 
 void logEverySeverity() {
     logger().debug("plain %s", "text");
-    logger().warning("two\nlines");
+    logger().warning("two\nlines\r\x1b[2J\tend\u2028");
     logger().critical("ä€");
     logger().info("told");
     QMessageLogger().debug("nowhere");
@@ -58,6 +58,25 @@ void logSecrets() {
     logger().debug("empty [%s]", MessageLog::secret(QByteArray()).constData());
 }
 
+void logPolls() {
+    {
+        const MessageLog::PollScope counted;
+        for (int i = 0; i < 500; ++i) {
+            logger().debug("the same");
+            if (i % 100 == 0)
+                logger().debug("answer %d", i);
+        }
+    }
+    logger().debug("the same");
+    MessageLog::finish();
+}
+
+void logMuch() {
+    const QByteArray text(1 << 20, 'x');
+    for (int i = 0; i < 70; ++i)
+        logger().debug("%d %s", i, text.constData());
+}
+
 void logTwice() {
     logger().debug("one");
     logger().debug("two");
@@ -68,6 +87,8 @@ int playScene(const QString &name) {
                                                              {"folder", logAndRemoveFolder},
                                                              {"threads", logFromThreads},
                                                              {"secrets", logSecrets},
+                                                             {"polls", logPolls},
+                                                             {"much", logMuch},
                                                              {"twice", logTwice}};
     MessageLog::install();
     scenes.at(name)();
@@ -94,7 +115,11 @@ private slots:
     void filesAreOfTheUserAlone();
     void unusableFolder();
     void linesOfThreadsStayWhole();
+    void repeatedLinesOfPollsAreCounted();
+    void dayHasABound();
+    void oldFilesAreRemoved();
     void secretsAreMaskedOnDemand();
+    void secretsStayOffForeignOutput();
 
 private:
     QStringList logFiles() const { return QDir(AppPaths::logFolder()).entryList(QDir::Files); }
@@ -112,14 +137,16 @@ void TestMessageLog::init() {
 void TestMessageLog::lineFormat() {
     const SecondLife::Outcome outcome = SecondLife::run({"severities"});
     QVERIFY2(!outcome.exited || outcome.status != 0, "a fatal message ends the program");
-    QCOMPARE(outcome.output, "plain text\ntwo\nlines\nä€\ntold\nnowhere\nthe end\n");
+    // What would end a line or steer a terminal is written in letters.
+    const QString second = "two\\nlines\\r\\u001b[2J\tend\\u2028";
+    QCOMPARE(QString::fromUtf8(outcome.output), "plain text\n" + second + "\nä€\ntold\nnowhere\nthe end\n");
     static const QRegularExpression stamp(R"(^\d{4}-\d\d-\d\d \d\d:\d\d:\d\d\.\d{3} )",
                                           QRegularExpression::MultilineOption);
     const QString place = ", file: main.cpp, line: 7, function: void start()\n";
     QString text = QString::fromUtf8(logged());
     QCOMPARE(text.count(stamp), 6);
-    QCOMPARE(text.remove(stamp), "DEBUG: plain text" + place + "WARNING: two\nlines" + place +
-                                     "CRITICAL: ä€" + place + "INFO: WARNING: told" + place +
+    QCOMPARE(text.remove(stamp), "DEBUG: plain text" + place + "WARNING: " + second + place + "CRITICAL: ä€" +
+                                     place + "INFO: WARNING: told" + place +
                                      "DEBUG: nowhere, file: , line: 0, function: \n" +
                                      "FATAL: DEFAULT: the end" + place);
 }
@@ -176,13 +203,62 @@ void TestMessageLog::linesOfThreadsStayWhole() {
                  linesOfWriter);
 }
 
+void TestMessageLog::repeatedLinesOfPollsAreCounted() {
+    const QByteArray output = SecondLife::run({"polls"}).output;
+    QCOMPARE(output.count("the same\n"), 2);
+    QCOMPARE(output.count("the same [repeated 499 times within a minute]\n"), 1);
+    QCOMPARE(output.count("answer "), 5);
+    QCOMPARE(logged().count("DEBUG: the same"), 3);
+}
+
+void TestMessageLog::dayHasABound() {
+    QVERIFY(SecondLife::run({"much"}).exited);
+    QCOMPARE(logFiles().size(), 2);
+    const QString day = logFiles()[1];
+    const QString earlier = logFiles()[0];
+    QVERIFY2(earlier.endsWith(".earlier.log"), qPrintable(earlier));
+    for (const QString &name : logFiles())
+        QVERIFY(m_root->read("Logs/" + name).size() <= 32 * 1024 * 1024);
+    const QByteArray newest = m_root->read("Logs/" + day);
+    const QByteArray firstLine = newest.left(newest.indexOf('\n'));
+    QVERIFY2(firstLine.contains("cut") && firstLine.contains(earlier.toUtf8()), firstLine.constData());
+    QVERIFY(newest.contains("DEBUG: 69 x"));
+}
+
+void TestMessageLog::oldFilesAreRemoved() {
+    const auto name = [](int daysAgo, const char *ending) {
+        return QDate::currentDate().addDays(-daysAgo).toString("yyyy-MM-dd") + ending;
+    };
+    QVERIFY(QDir(m_root->path()).mkdir("Logs"));
+    const QStringList kept = {name(29, ".log"), "crash-2020-01-02-120000-7.txt", "notes.log"};
+    const QStringList old = {name(32, ".log"), name(400, ".log"), name(32, ".earlier.log")};
+    for (const QString &file : kept + old)
+        QVERIFY(m_root->write("Logs/" + file, "text"));
+    QVERIFY(SecondLife::run({"twice"}).exited);
+    for (const QString &file : kept)
+        QVERIFY2(logFiles().contains(file), qPrintable(file));
+    for (const QString &file : old)
+        QVERIFY2(!logFiles().contains(file), qPrintable(file));
+}
+
 void TestMessageLog::secretsAreMaskedOnDemand() {
-    const QByteArray told = SecondLife::run({"secrets"}, with("NVLDM_LOG_REDACT", "0")).output;
-    QCOMPARE(told, "bytes hunter2\ntext hunter2\nstring hunter2\nempty []\n");
+    QVERIFY(SecondLife::run({"secrets"}, with("NVLDM_LOG_REDACT", "0")).exited);
+    QVERIFY(logged().contains("bytes hunter2") && logged().contains("string hunter2"));
     init();
     const QByteArray masked = SecondLife::run({"secrets"}, with("NVLDM_LOG_REDACT", "1")).output;
     QCOMPARE(masked, "bytes ***\ntext ***\nstring ***\nempty []\n");
     QVERIFY(logged().contains("bytes ***") && !logged().contains("hunter2"));
+}
+
+void TestMessageLog::secretsStayOffForeignOutput() {
+    // A pipe may lead to a journal that others read.
+    const QByteArray piped = SecondLife::run({"secrets"}, with("NVLDM_LOG_REDACT", "0")).output;
+    QCOMPARE(piped, "bytes ***\ntext ***\nstring ***\nempty []\n");
+    QProcess process;
+    process.setStandardOutputFile(m_root->filePath("output.txt"));
+    SecondLife::start(process, {"secrets"});
+    QVERIFY(process.waitForFinished());
+    QCOMPARE(m_root->read("output.txt"), "bytes hunter2\ntext hunter2\nstring hunter2\nempty []\n");
 }
 
 int main(int argc, char *argv[]) {
