@@ -21,6 +21,7 @@
 
 #include <algorithm>
 #include <new>
+#include <utility>
 
 SettingWindow::SettingWindow(QWidget *parent) : QWidget(parent), m_runner(new (std::nothrow) NetTask) {
     qDebug("SettingWindow constructor");
@@ -94,11 +95,13 @@ QWidget *SettingWindow::buildFooter() {
 }
 
 bool SettingWindow::hasUnsavedEdits() const {
-    return m_everLoaded && !ServerSettings::differences(m_loaded, m_form->values()).isEmpty();
+    const QVariantMap &kept = m_discardedWhileSaving ? m_saving : m_loaded;
+    return m_everLoaded && !ServerSettings::differences(kept, m_form->values()).isEmpty();
 }
 
 void SettingWindow::discardEdits() {
-    m_form->restore(m_loaded);
+    m_discardedWhileSaving = !m_saving.isEmpty();
+    m_form->restore(m_discardedWhileSaving ? m_saving : m_loaded);
     enableButtons(false);
     m_status->clear();
 }
@@ -107,6 +110,8 @@ void SettingWindow::reset() {
     if (m_question)
         m_question->close();
     m_loaded.clear();
+    m_saving.clear();
+    m_discardedWhileSaving = false;
     m_form->restore({});
     m_everLoaded = false;
     m_form->setEnabled(false);
@@ -201,10 +206,29 @@ void SettingWindow::saveConfig() {
         [loaded = m_loaded, wanted](ServiceSession &session) { return save(session, loaded, wanted); },
         [this, wanted](const Saved &saved) { onSaved(saved, wanted); },
         [this](JobEnd end) {
+            endSaving();
             onJobEnded(end, tr("The settings could not be saved: the client is busy, try again."), false);
         });
-    if (started)
-        showBusy(tr("Saving settings..."));
+    if (!started)
+        return;
+    m_saving = wanted;
+    m_discardedWhileSaving = false;
+    showBusy(tr("Saving settings..."));
+}
+
+/// What was discarded while it was being saved, and was not saved, goes now.
+void SettingWindow::endSaving() {
+    const QVariantMap saving = std::exchange(m_saving, {});
+    if (!std::exchange(m_discardedWhileSaving, false))
+        return;
+    const QVariantMap shown = m_form->values();
+    QVariantMap discarded;
+    for (const QString &key : ServerSettings::differences(saving, m_loaded)) {
+        if (shown.value(key) == saving.value(key))
+            discarded[key] = m_loaded.value(key);
+    }
+    m_form->setValues(discarded);
+    enableButtons(hasUnsavedEdits());
 }
 
 SettingWindow::Saved SettingWindow::save(ServiceSession &session, const QVariantMap &loaded,
@@ -232,7 +256,7 @@ SettingWindow::Saved SettingWindow::save(ServiceSession &session, const QVariant
 
 void SettingWindow::onSaved(const Saved &saved, const QVariantMap &wanted) {
     if (!saved.changed.isEmpty())
-        return askWhoseValues(saved, wanted);
+        return m_discardedWhileSaving ? takeOver(saved.fresh.values) : askWhoseValues(saved, wanted);
     if (const unsigned result = saved.loadResult != ApiOk ? saved.loadResult : saved.saveResult;
         result != ApiOk)
         return showNotice(tr("The settings could not be saved: %1.").arg(apiResultText(result)));

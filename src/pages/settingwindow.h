@@ -23,7 +23,7 @@ public:
     ~SettingWindow() override;
 
     bool hasUnsavedEdits() const;
-    /// Puts the loaded values back.
+    /// Puts the loaded values back; while a save is under way, those that are being saved.
     void discardEdits();
     /// Forgets what was loaded, as at the end of a session.
     void reset();
@@ -60,6 +60,7 @@ private:
     void onLoaded(const Loaded &loaded);
     void onSaved(const Saved &saved, const QVariantMap &wanted);
     void onEdited(const QString &key);
+    void endSaving();
     void askWhoseValues(const Saved &saved, const QVariantMap &wanted);
     void takeOver(const QVariantMap &values);
     void onJobEnded(JobEnd end, const QString &failure, bool offersRetry);
@@ -69,6 +70,8 @@ private:
 
     NetTask::Owner m_runner;
     QVariantMap m_loaded; ///< what the service has, as far as known
+    QVariantMap m_saving; ///< what is on its way to it
+    bool m_discardedWhileSaving = false;
     bool m_everLoaded = false;
     QString m_busyText;
 

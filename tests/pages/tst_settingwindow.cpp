@@ -7,6 +7,7 @@
 #include "settingwindow.h"
 #include "storewriter.h"
 #include "toast.h"
+#include "waitingspinner.h"
 
 #include <QApplication>
 #include <QCheckBox>
@@ -197,6 +198,35 @@ private slots:
         QTRY_VERIFY(find<QWidget>("settingsForm")->isEnabled());
         QTRY_COMPARE(find<QSpinBox>("logSpinBox")->value(),
                      m_service->settings().at("log_keepdays").get<int>());
+    }
+
+    void discardedWhileSaving_data() {
+        QTest::addColumn<int>("code");   // of the answer to the save
+        QTest::addColumn<int>("theirs"); // what another client has set meanwhile
+        QTest::addColumn<int>("days");   // in the end, here and on the service
+        QTest::newRow("saved") << 0 << 30 << 60;
+        QTest::newRow("refused") << 5 << 30 << 30;
+        QTest::newRow("changed by others") << 0 << 90 << 90;
+    }
+    void discardedWhileSaving() {
+        QFETCH(int, code);
+        QFETCH(int, theirs);
+        open();
+        json changed = someSettings();
+        changed["log_keepdays"] = theirs;
+        m_service->setSettings(changed);
+        m_service->refuse("/v1/config/set", code);
+        find<QSpinBox>("logSpinBox")->setValue(60);
+        button("applyButton")->click();
+        find<QSpinBox>("restorePointSpinBox")->setValue(8);
+        button("cancelButton")->click();
+        QVERIFY(!m_window->hasUnsavedEdits());
+        QTRY_VERIFY(!m_window->findChild<WaitingSpinner *>()->isVisible());
+        QTEST(find<QSpinBox>("logSpinBox")->value(), "days");
+        QTEST(m_service->settings().at("log_keepdays").get<int>(), "days");
+        QCOMPARE(find<QSpinBox>("restorePointSpinBox")->value(), 3);
+        QVERIFY(!m_window->hasUnsavedEdits() && !button("applyButton")->isEnabled());
+        QVERIFY(!QApplication::activeModalWidget());
     }
 
     void twoAdministrators_data() {
