@@ -68,12 +68,15 @@ void LogPager::setRowCount(int rows) {
     showPage();
 }
 
-void LogPager::updateLimit(const QString &limit) {
-    const int first = firstRow();
+void LogPager::showRow(int row) {
+    m_page = row / m_pageSize;
+    showPage();
+}
+
+void LogPager::updateLimit(const QString &limit, int row) {
     m_limit->setCurrentText(limit);
     m_pageSize = std::max(limit.toInt(), 1);
-    m_page = first / m_pageSize;
-    showPage();
+    showRow(row);
     emit pageChanged();
 }
 

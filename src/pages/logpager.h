@@ -15,6 +15,8 @@ public:
 
     /// The number of rows that there are to turn over; leads to the first page.
     void setRowCount(int rows);
+    /// Leads to the page with the row, without telling so.
+    void showRow(int row);
     int pageSize() const { return m_pageSize; }
     /// The first row of the present page.
     int firstRow() const { return m_page * m_pageSize; }
@@ -25,8 +27,8 @@ signals:
     void limitChosen(const QString &limit);
 
 public slots:
-    /// limit: the number of rows on a page. Stays with the row that was the first one.
-    void updateLimit(const QString &limit);
+    /// limit: the number of rows on a page. Leads to the page with the row.
+    void updateLimit(const QString &limit, int row);
 
 private:
     QToolButton *addButton(const char *name, const QString &icon, const QString &text,

@@ -1,5 +1,6 @@
 #include "logsidebar.h"
 
+#include "sectionclick.h"
 #include "theme.h"
 
 #include <QCalendarWidget>
@@ -139,6 +140,8 @@ std::pair<QDateEdit *, QTimeEdit *> LogSidebar::addTimes(QVBoxLayout *layout, co
     time->setDisplayFormat(QStringLiteral("HH:mm"));
     time->setFixedWidth(timeWidth);
     time->setAccessibleName(tr("%1, time of day").arg(caption));
+    SectionClick::install(date);
+    SectionClick::install(time);
     auto *row = new QHBoxLayout;
     row->setSpacing(6);
     row->addWidget(date, 1);

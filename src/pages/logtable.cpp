@@ -6,6 +6,7 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QHeaderView>
+#include <QItemSelection>
 #include <QKeyEvent>
 #include <QScrollBar>
 
@@ -54,6 +55,9 @@ LogTable::LogTable(QWidget *parent) : CustomTable(parent) {
 }
 
 void LogTable::showEntries(const LogListPtr &list, const std::vector<int> &places) {
+    const bool isSameList = list == m_list;
+    const int current = isSameList ? currentPlace() : -1;
+    const std::vector<int> selected = isSameList ? selectedPlaces() : std::vector<int>();
     m_list = list;
     m_places = places;
     clearSelection();
@@ -62,6 +66,7 @@ void LogTable::showEntries(const LogListPtr &list, const std::vector<int> &place
     setRowCount(rows);
     makeItems(rows);
     scrollToTop();
+    select(selected, current);
     viewport()->update();
     emit currentEntryChanged();
 }
@@ -74,11 +79,35 @@ void LogTable::makeItems(int rows) {
     }
 }
 
-const LogEntry *LogTable::currentEntry() const {
+std::vector<int> LogTable::selectedPlaces() const {
+    std::vector<int> places;
+    for (const QModelIndex &index : selectionModel()->selectedRows())
+        places.push_back(m_places[static_cast<std::size_t>(index.row())]);
+    return places;
+}
+
+void LogTable::select(const std::vector<int> &selected, int current) {
+    QItemSelection selection;
+    for (int row = 0; row < rowCount(); ++row) {
+        const int place = m_places[static_cast<std::size_t>(row)];
+        if (std::find(selected.begin(), selected.end(), place) != selected.end())
+            selection.select(model()->index(row, 0), model()->index(row, 0));
+        if (place == current)
+            setCurrentCell(row, 0, QItemSelectionModel::NoUpdate);
+    }
+    selectionModel()->select(selection, QItemSelectionModel::Select | QItemSelectionModel::Rows);
+    if (currentRow() >= 0)
+        scrollToItem(item(currentRow(), 0));
+}
+
+int LogTable::currentPlace() const {
     const int row = currentRow();
-    return row >= 0 && row < static_cast<int>(m_places.size())
-               ? &m_list->at(m_places[static_cast<std::size_t>(row)])
-               : nullptr;
+    return row >= 0 && row < static_cast<int>(m_places.size()) ? m_places[static_cast<std::size_t>(row)] : -1;
+}
+
+const LogEntry *LogTable::currentEntry() const {
+    const int place = currentPlace();
+    return place >= 0 ? &m_list->at(place) : nullptr;
 }
 
 QVariant LogTable::cellData(int row, int column, int role) const {

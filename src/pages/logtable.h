@@ -10,10 +10,14 @@ class LogTable : public CustomTable {
 public:
     explicit LogTable(QWidget *parent = nullptr);
 
-    /// Shows the entries at the places. Nothing is selected after it, and the first row is in view.
+    /// Shows the entries at the places. Those of the same list that were selected still are, where they are
+    /// among them; the current one is in view then, else the first row.
     void showEntries(const LogListPtr &list, const std::vector<int> &places);
+    const LogListPtr &list() const { return m_list; }
     /// The entry in the current row, or null.
     const LogEntry *currentEntry() const;
+    /// Its place in the list, or -1.
+    int currentPlace() const;
     /// What an item shows; for the items.
     QVariant cellData(int row, int column, int role) const;
 
@@ -25,6 +29,8 @@ protected:
 
 private:
     void makeItems(int rows);
+    std::vector<int> selectedPlaces() const;
+    void select(const std::vector<int> &selected, int current);
     void copySelected() const;
     void showSortMenu(const QPoint &position);
 

@@ -337,13 +337,24 @@ void LogWindow::sortEntries() {
     m_places = m_list->order(static_cast<LogColumn>(header->sortIndicatorSection()),
                              header->sortIndicatorOrder(), m_matches, m_span);
     m_pager->setRowCount(static_cast<int>(m_places.size()));
+    if (const int row = currentRow(); row >= 0)
+        m_pager->showRow(row);
     showPage();
     showCount();
     showState();
 }
 
 void LogWindow::updateLimit(const QString &limit) {
-    m_pager->updateLimit(limit);
+    const int row = currentRow();
+    m_pager->updateLimit(limit, row >= 0 ? row : m_pager->firstRow());
+}
+
+/// Where the entry that is being read stands in the whole result, or -1.
+int LogWindow::currentRow() const {
+    if (m_table->list() != m_list || m_table->currentPlace() < 0)
+        return -1;
+    const auto found = std::find(m_places.begin(), m_places.end(), m_table->currentPlace());
+    return found == m_places.end() ? -1 : static_cast<int>(found - m_places.begin());
 }
 
 void LogWindow::showPage() {

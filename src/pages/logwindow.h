@@ -79,6 +79,7 @@ private:
     void onSpanChosen(const LogFrame &span);
     void giveUpSpan();
     void sortEntries();
+    int currentRow() const;
     void showPage();
     void showEntry();
     void showCount();

@@ -1,5 +1,7 @@
 #include "schedulefield.h"
 
+#include "sectionclick.h"
+
 #include <QDateTimeEdit>
 #include <QHBoxLayout>
 #include <QLabel>
@@ -32,6 +34,7 @@ ScheduleField::ScheduleField(QWidget *parent)
     m_time->setObjectName(QStringLiteral("timeEdit"));
     m_time->setAccessibleName(tr("Time of the upload"));
     m_time->setDisplayFormat(QStringLiteral("yyyy/MM/dd hh:mm"));
+    SectionClick::install(m_time);
     m_zone->setObjectName(QStringLiteral("zoneLabel"));
     m_zone->setProperty("role", "quiet");
     const QDateTime ahead = QDateTime::currentDateTime().addSecs(secondsAhead);

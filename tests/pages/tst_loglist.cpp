@@ -1,4 +1,7 @@
+#include "isolatedroot.h"
 #include "logbins.h"
+#include "logcapture.h"
+#include "logexport.h"
 #include "loglist.h"
 
 #include <QDateTime>
@@ -167,6 +170,33 @@ private slots:
         QCOMPARE(bins.counts(0)[0], 1);
         QCOMPARE(bins.counts(bins.size() - 1)[1], 1);
         QCOMPARE(bins.frame(0, bins.size() - 1).from, local(1990, 1, 1));
+    }
+
+    void exportsWhatOtherProgramsRead() {
+        const LogListPtr list =
+            LogList::parse({row("none", "Probe", "Alarm", "a,b", "two\nlines\r\nand a \"word\""),
+                            row(local(2026, 5, 2, 9), "System", "Audit", "Zürich", "plain")});
+        const IsolatedRoot root;
+        const LogCapture log;
+        bool opened = false;
+        const auto write = [&](const QString &path, const std::vector<int> &places) {
+            return LogExport::write(path, *list, places, [&] { opened = true; });
+        };
+        const QByteArray header = "Date/Time,Source,Type,Description,User,\n";
+        const QByteArray odd = ",Probe,Alarm,\"two lines and a \"\"word\"\"\",\"a,b\",\n";
+        const QByteArray plain = "2026/05/02 09:00:00,System,Audit,plain,Zürich,\n";
+        QVERIFY(write(root.filePath("log.csv"), {1, 0}));
+        QVERIFY(opened);
+        QCOMPARE(root.read("log.csv"), header + plain + odd);
+        QVERIFY(write(root.filePath("log.csv"), {}));
+        QCOMPARE(root.read("log.csv"), header);
+        // 2 MiB, which go out in parts.
+        QVERIFY(write(root.filePath("log.csv"), std::vector<int>(40000, 1)));
+        QCOMPARE(root.read("log.csv").size(), header.size() + 40000 * plain.size());
+        opened = false;
+        QVERIFY(!write(root.filePath("no such folder/log.csv"), {1}));
+        QVERIFY(!opened);
+        QCOMPARE(log.count("The log could not be exported: "), 1);
     }
 };
 

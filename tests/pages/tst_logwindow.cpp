@@ -180,6 +180,47 @@ private slots:
         QVERIFY(detail->toPlainText().isEmpty());
     }
 
+    void selectedEntryStaysInView() {
+        std::vector<json> items;
+        for (int i = 0; i < 120; ++i)
+            items.push_back(entry(today(0) + 1000 * i, "Device", "Alarm", "n" + std::to_string(i)));
+        open(items);
+        const auto *detail = find<QPlainTextEdit>("logDetail");
+        const auto selected = [this] {
+            QStringList texts;
+            for (const QModelIndex &index : table()->selectionModel()->selectedRows())
+                texts += cell(index.row(), LogColumn::Description);
+            return texts.join(' ');
+        };
+        table()->selectRow(1);
+        QTest::keyClick(table(), Qt::Key_Down, Qt::ShiftModifier);
+        QCOMPARE(detail->toPlainText(), QStringLiteral("n117"));
+        auto *header = table()->horizontalHeader();
+        QTest::mouseClick(header->viewport(), Qt::LeftButton, {}, QPoint(20, header->height() / 2));
+        QCOMPARE(text("pageLabel"), QStringLiteral("5 from 5"));
+        QCOMPARE(detail->toPlainText(), QStringLiteral("n117"));
+        QCOMPARE(selected(), QStringLiteral("n117 n118"));
+        find<QComboBox>("limitDropdown")->setCurrentText("100");
+        QCOMPARE(text("pageLabel"), QStringLiteral("2 from 2"));
+        QCOMPARE(detail->toPlainText(), QStringLiteral("n117"));
+        QVERIFY(table()->viewport()->rect().intersects(table()->visualItemRect(table()->currentItem())));
+        find<QPushButton>("searchButton")->click();
+        QTRY_VERIFY(detail->toPlainText().isEmpty());
+        QCOMPARE(selected(), QString());
+    }
+
+    void digitsAreTakenAfterAClick() {
+        open({});
+        auto *time = find<QTimeEdit>("startTimeEdit");
+        auto *edit = time->findChild<QLineEdit *>();
+        QTest::mouseClick(edit, Qt::LeftButton, {}, QPoint(edit->width() - 2, edit->height() / 2));
+        QTest::keyClicks(edit, "45");
+        QCOMPARE(time->time(), QTime(0, 45));
+        QTest::mouseClick(edit, Qt::LeftButton, {}, QPoint(2, edit->height() / 2));
+        QTest::keyClicks(edit, "1030");
+        QCOMPARE(time->time(), QTime(10, 30));
+    }
+
     void chartNarrowsTheFrame() {
         open({entry(today(3, 30), "Device", "Alarm", "three"), entry(today(5), "System", "Event", "five"),
               entry(today(9), "System", "Audit", "nine")});
