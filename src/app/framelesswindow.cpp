@@ -9,6 +9,7 @@
 #include "devicewindow.h"
 #include "exetaskmgr.h"
 #include "idlewatch.h"
+#include "localnotices.h"
 #include "localstore.h"
 #include "logindialog.h"
 #include "mainwindow.h"
@@ -70,7 +71,8 @@ FramelessWindow::FramelessWindow(QWidget *parent)
       m_welcome(new WelcomePage),
       m_startCheck(new StartCheck(this)),
       m_serviceManagement(new ServiceManagement(this)),
-      m_idle(new IdleWatch(this)) {
+      m_idle(new IdleWatch(this)),
+      m_notices(new LocalNotices(this)) {
     qDebug("FramelessWindow constructor");
     setObjectName(QStringLiteral("FramelessWindow"));
     setWindowTitle(QCoreApplication::applicationName());
@@ -257,6 +259,7 @@ void FramelessWindow::onLoginSuccess() {
     m_dialog = nullptr;
     m_idle->start();
     m_serviceManagement->lookUp();
+    m_notices->tellOfMissingKey();
 }
 
 void FramelessWindow::onAccontManagement() {

@@ -8,6 +8,7 @@
 #include <functional>
 
 class IdleWatch;
+class LocalNotices;
 class FramelessDialog;
 class LoginDialog;
 class MainWindow;
@@ -111,6 +112,7 @@ private:
     StartCheck *m_startCheck;
     ServiceManagement *m_serviceManagement;
     IdleWatch *m_idle;
+    LocalNotices *m_notices;
     bool m_loggedIn = false;
     bool m_closeConfirmed = false;
 };

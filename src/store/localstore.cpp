@@ -10,6 +10,7 @@
 namespace {
 const QString kLayoutPrefix = QStringLiteral("kLayout_");
 const QString kDefaultFilePath = QStringLiteral("kDefaultFilePath");
+const QString kMissingKeyTold = QStringLiteral("kMissingKeyTold");
 const QString kUiLanguage = QStringLiteral("kUiLanguage");
 const QString kPendingExports = QStringLiteral("kPendingExports");
 const QString kFwUploadOnlyApplyFail = QStringLiteral("kFwUploadOnlyApplyFail");
@@ -132,6 +133,14 @@ QString CLocalStore::defaultFilePath() const {
 
 bool CLocalStore::setDefaultFilePath(const QString &folder) {
     return m_store.replace(kDefaultFilePath, folder);
+}
+
+bool CLocalStore::isMissingKeyTold() const {
+    return m_store.queryFlag(kMissingKeyTold);
+}
+
+bool CLocalStore::setMissingKeyTold(bool told) {
+    return m_store.replaceFlag(kMissingKeyTold, told);
 }
 
 QString CLocalStore::uiLanguage() const {

@@ -60,6 +60,9 @@ public:
     QString defaultFilePath() const;
     bool setDefaultFilePath(const QString &folder);
 
+    /// Whether the user was told that there is no key file.
+    bool isMissingKeyTold() const;
+    bool setMissingKeyTold(bool told);
     /// Code of the language that the windows are to speak; empty for that of the system.
     QString uiLanguage() const;
     bool setUiLanguage(const QString &language);
