@@ -2379,6 +2379,29 @@
     </message>
 </context>
 <context>
+    <name>LocalNotices</name>
+    <message>
+        <source>The file %1 was damaged. What could be read of it was kept, and the damaged file is now called %2. Saved servers and settings may be missing.</source>
+        <translation>Die Datei %1 war beschädigt. Was noch lesbar war, wurde behalten, und die beschädigte Datei heißt jetzt %2. Gespeicherte Server und Einstellungen können fehlen.</translation>
+    </message>
+    <message>
+        <source>The file %1 is damaged and could not be repaired. Saved servers and settings may be missing, and changes of them are not kept.</source>
+        <translation>Die Datei %1 ist beschädigt und konnte nicht repariert werden. Gespeicherte Server und Einstellungen können fehlen, und Änderungen daran werden nicht behalten.</translation>
+    </message>
+    <message>
+        <source>The file %1 cannot be read. Saved servers and settings may be missing.</source>
+        <translation>Die Datei %1 kann nicht gelesen werden. Gespeicherte Server und Einstellungen können fehlen.</translation>
+    </message>
+    <message>
+        <source>The file %1 cannot be written; the disk may be full. What is saved there is used, but changes are not kept.</source>
+        <translation>Die Datei %1 kann nicht geschrieben werden; vielleicht ist der Datenträger voll. Was darin gespeichert ist, wird verwendet, aber Änderungen werden nicht behalten.</translation>
+    </message>
+    <message>
+        <source>There is no key file of your own. Passwords are ciphered with a key that every copy of this program has. The user guide says what that means, and how a key file is made.</source>
+        <translation>Es gibt keine eigene Schlüsseldatei. Passwörter werden mit einem Schlüssel chiffriert, den jede Kopie dieses Programms hat. Das Benutzerhandbuch sagt, was das bedeutet und wie eine Schlüsseldatei erstellt wird.</translation>
+    </message>
+</context>
+<context>
     <name>LogChart</name>
     <message>
         <source>Log entries over time</source>
@@ -2802,6 +2825,17 @@
     <message>
         <source>Apply</source>
         <translation>Übernehmen</translation>
+    </message>
+</context>
+<context>
+    <name>NoticeCard</name>
+    <message>
+        <source>User Guide</source>
+        <translation>Benutzerhandbuch</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>Schließen</translation>
     </message>
 </context>
 <context>

@@ -2341,6 +2341,29 @@
     </message>
 </context>
 <context>
+    <name>LocalNotices</name>
+    <message>
+        <source>The file %1 was damaged. What could be read of it was kept, and the damaged file is now called %2. Saved servers and settings may be missing.</source>
+        <translation>ファイル %1 が破損していました。読み取れた内容は引き継がれ、破損したファイルの名前は %2 になりました。保存されたサーバーや設定が失われている可能性があります。</translation>
+    </message>
+    <message>
+        <source>The file %1 is damaged and could not be repaired. Saved servers and settings may be missing, and changes of them are not kept.</source>
+        <translation>ファイル %1 は破損しており、修復できませんでした。保存されたサーバーや設定が失われている可能性があり、変更は保存されません。</translation>
+    </message>
+    <message>
+        <source>The file %1 cannot be read. Saved servers and settings may be missing.</source>
+        <translation>ファイル %1 を読み取れません。保存されたサーバーや設定が表示されない可能性があります。</translation>
+    </message>
+    <message>
+        <source>The file %1 cannot be written; the disk may be full. What is saved there is used, but changes are not kept.</source>
+        <translation>ファイル %1 に書き込めません。ディスクの空き容量がない可能性があります。保存済みの内容は使用されますが、変更は保存されません。</translation>
+    </message>
+    <message>
+        <source>There is no key file of your own. Passwords are ciphered with a key that every copy of this program has. The user guide says what that means, and how a key file is made.</source>
+        <translation>独自のキーファイルがありません。パスワードは、このプログラムのすべてのコピーが持つキーで暗号化されます。その意味とキーファイルの作成方法はユーザーガイドに記載されています。</translation>
+    </message>
+</context>
+<context>
     <name>LogChart</name>
     <message>
         <source>Log entries over time</source>
@@ -2764,6 +2787,17 @@
     <message>
         <source>Apply</source>
         <translation>適用</translation>
+    </message>
+</context>
+<context>
+    <name>NoticeCard</name>
+    <message>
+        <source>User Guide</source>
+        <translation>ユーザーガイド</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>閉じる</translation>
     </message>
 </context>
 <context>
