@@ -5,13 +5,16 @@
 #include "noticecard.h"
 #include "storewriter.h"
 
+#include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
 #include <QPointer>
 
 LocalNotices::LocalNotices(QWidget *frame) : QObject(frame), m_card(new NoticeCard(frame)) {
     StoreTrouble::setReceiver([notices = QPointer(this)](const StoreTrouble::Report &report) {
-        // Stores are used on any thread.
+        // Stores are used on any thread, and until the very end.
+        if (!qApp)
+            return;
         QMetaObject::invokeMethod(
             qApp,
             [notices, report] {
@@ -20,10 +23,6 @@ LocalNotices::LocalNotices(QWidget *frame) : QObject(frame), m_card(new NoticeCa
             },
             Qt::QueuedConnection);
     });
-}
-
-LocalNotices::~LocalNotices() {
-    StoreTrouble::setReceiver({});
 }
 
 void LocalNotices::tell(const StoreTrouble::Report &report) {

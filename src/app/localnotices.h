@@ -12,7 +12,6 @@ class LocalNotices : public QObject {
 
 public:
     explicit LocalNotices(QWidget *frame);
-    ~LocalNotices() override;
 
     /// Says once and for all that there is no key of the user's own.
     void tellOfMissingKey();

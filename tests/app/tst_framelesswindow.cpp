@@ -21,6 +21,8 @@
 #include "servicemanagementaddservicedialog.h"
 #include "servicesession.h"
 #include "sidepanel.h"
+#include "storetrouble.h"
+#include "storewriter.h"
 #include "taskinfopool.h"
 #include "titlebar.h"
 #include "welcomepage.h"
@@ -177,6 +179,41 @@ private slots:
         openWindow();
         QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
         QVERIFY(!Form::visible<CrashDialog>());
+    }
+
+    void troubleWithFilesIsToldOnce() {
+        openWindow();
+        auto *card = m_window->findChild<QWidget *>("noticeCard");
+        QVERIFY(card && !card->isVisible());
+        const QString file = m_root.filePath("told.sdb");
+        for (int i = 0; i < 2; ++i) {
+            StoreTrouble::report({StoreTrouble::Kind::Repaired, file, file + ".damaged-1", 3});
+            StoreTrouble::report({StoreTrouble::Kind::Unwritable, file, {}, 0});
+        }
+        QTRY_VERIFY(card->isVisible());
+        QVERIFY(Form::text(card, "noticeCardText").contains("told.sdb.damaged-1"));
+        QVERIFY(m_window->rect().contains(card->geometry()));
+        Form::click(card, "noticeDismissButton");
+        QVERIFY(Form::text(card, "noticeCardText").contains("disk may be full"));
+        Form::click(card, "noticeDismissButton");
+        QVERIFY(!card->isVisible());
+    }
+
+    void missingKeyFileIsToldOnce() {
+        CLocalStore::instance().setMissingKeyTold(false);
+        logIn();
+        auto *card = m_window->findChild<QWidget *>("noticeCard");
+        QTRY_VERIFY(card->isVisible());
+        const Viewer viewer;
+        Form::click(card, "noticeGuideButton");
+        QCOMPARE(QFileInfo(viewer.opened.value(0)).fileName(), "security.html");
+        QVERIFY(QFileInfo(viewer.opened.value(0)).isFile());
+        Form::click(card, "noticeDismissButton");
+        StoreWriter::flush();
+        m_window.reset();
+        m_service.kill();
+        logIn();
+        QVERIFY(!m_window->findChild<QWidget *>("noticeCard")->isVisible());
     }
 
     void logOffEndsTheSession() {
