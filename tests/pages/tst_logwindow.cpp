@@ -214,10 +214,10 @@ private slots:
         auto *time = find<QTimeEdit>("startTimeEdit");
         auto *edit = time->findChild<QLineEdit *>();
         QTest::mouseClick(edit, Qt::LeftButton, {}, QPoint(edit->width() - 2, edit->height() / 2));
-        QTest::keyClicks(edit, "45");
+        QTest::keyClicks(time, "45");
         QCOMPARE(time->time(), QTime(0, 45));
         QTest::mouseClick(edit, Qt::LeftButton, {}, QPoint(2, edit->height() / 2));
-        QTest::keyClicks(edit, "1030");
+        QTest::keyClicks(time, "1030");
         QCOMPARE(time->time(), QTime(10, 30));
     }
 
