@@ -18,8 +18,7 @@ constexpr const char *quickSetupKeys[] = {
 } // namespace
 
 unsigned CApiClient::listCgis(int nStart, int nCount, JSON &cgis) {
-    return postAsAccount({"listCgis", "/v1/cgi/list", Payload::Ciphered},
-                         {{"start", nStart}, {"count", nCount}}, &cgis);
+    return postForPage({"listCgis", "/v1/cgi/list", Payload::Ciphered}, nStart, nCount, cgis);
 }
 
 unsigned CApiClient::commitCgis(const JSON &cgis, const char *szStage) {

@@ -18,6 +18,7 @@
 #include <mutex>
 #include <stdexcept>
 #include <string_view>
+#include <utility>
 
 namespace {
 
@@ -112,6 +113,24 @@ unsigned CApiClient::postAsAccount(const Call &call, JSON body, const Output &ou
         return ApiInvalidArgument;
     body["id"] = m_strAccount;
     return post(call, body, output);
+}
+
+unsigned CApiClient::postForPage(const Call &call, int nStart, int nCount, JSON &records) {
+    JSON page;
+    const unsigned result = postAsAccount(call, {{"start", nStart}, {"count", nCount}}, &page);
+    if (result != ApiOk)
+        return result;
+    if (page.is_array() && std::cmp_greater(page.size(), nCount)) {
+        qWarning("CApiClient::%s > %zu records where %d were asked for", call.method, page.size(), nCount);
+        return ApiException;
+    }
+    records = std::move(page);
+    return ApiOk;
+}
+
+void CApiClient::cutTo(JSON &list, int nCount) {
+    if (list.is_array() && std::cmp_greater(list.size(), nCount))
+        list.erase(list.begin() + std::max(nCount, 0), list.end());
 }
 
 unsigned CApiClient::post(const Call &call, const JSON &body, const Output &output) {

@@ -81,7 +81,7 @@ public:
     virtual unsigned deviceDiscovery(int nTimeout);
     virtual unsigned deviceDiscoverByIP(const char *szIp, int nTimeout);
     virtual unsigned deviceDiscoverByIPs(const char *szFirst, const char *szLast, int nTimeout);
-    /// What the last scan has found so far.
+    /// What the last scan has found so far, 65,536 devices at most.
     virtual unsigned discoveredDevices(JSON &devices);
     virtual unsigned setPassPolicy(const JSON &devices, const char *szType, int nMinLength,
                                    const char *szTaskId);
@@ -125,7 +125,8 @@ public:
     virtual unsigned removeTaskStatus(const JSON &tids);
     /// Ends a task. szState: "pTaskDone", "pTaskAborted" or "pTaskFailed".
     virtual unsigned updateTaskState(const char *szTaskId, const char *szState);
-    /// A page of alarms, newest first: an object with "items" and "total_items".
+    /// A page of alarms, newest first: an object with "items", of which those beyond nCount are dropped, and
+    /// "total_items".
     virtual unsigned listAlarmInfo(int nStart, int nCount, JSON &alarms);
     /// alids: array of the ids of alarms.
     virtual unsigned removeAlarmInfo(const JSON &alids);
@@ -178,7 +179,8 @@ public:
     // The service's log
 
     /// Log entries of a time range, both ends Unix ms as decimal text and inclusive. table: array of objects
-    /// whose members are named like the columns of the log page; ApiException when an entry lacks a value.
+    /// whose members are named like the columns of the log page, the first 200,000; ApiException when an
+    /// entry lacks a value.
     virtual unsigned browseLogs(const char *szStart, const char *szEnd, JSON &table);
 
     // Remote access; what is signed in to, listed and added lives with the service, not with this client
@@ -229,6 +231,13 @@ protected:
     /// The same for an authenticated method: checks the preconditions and adds "id" to the body.
     unsigned postAsAccount(const Call &call, JSON body, const Output &output = {});
 
+    /// The same for a method that lists a page of records: an answer with more than were asked for is
+    /// refused with ApiException.
+    unsigned postForPage(const Call &call, int nStart, int nCount, JSON &records);
+
+    /// Drops what an array holds beyond a count.
+    static void cutTo(JSON &list, int nCount);
+
     /// True when there is what every authenticated method needs.
     bool hasSession() const;
 
@@ -248,7 +257,6 @@ private:
     /// Of a request without an answer.
     static unsigned transportResult(const HttpAnswer &answer);
 
-    unsigned postPage(const char *method, const char *path, int nStart, int nCount, const Output &output);
     /// How the uploads differ from the rest of the road.
     static Call uploadCall(const char *method, const char *path, const char *transportError = nullptr);
     static Call certificateCall(const char *method, const char *path);

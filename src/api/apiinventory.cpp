@@ -9,17 +9,14 @@
 namespace {
 
 constexpr const char *siteRoot = "SR000000000000";
+/// The addresses of a network of 16 bits; more would be no answer to a scan.
+constexpr int discoveryLimit = 65536;
 
 const char *orRoot(const char *szParent) {
     return szParent && *szParent ? szParent : siteRoot;
 }
 
 } // namespace
-
-unsigned CApiClient::postPage(const char *method, const char *path, int nStart, int nCount,
-                              const Output &output) {
-    return postAsAccount({method, path, Payload::Ciphered}, {{"start", nStart}, {"count", nCount}}, output);
-}
 
 unsigned CApiClient::addSite(const char *szName, const char *szParent, std::string &strSiteId) {
     if (isEmpty(szName))
@@ -50,7 +47,7 @@ unsigned CApiClient::removeSite(const char *szSiteId) {
 }
 
 unsigned CApiClient::listSites(int nStart, int nCount, JSON &sites) {
-    return postPage("listSites", "/v1/site/list", nStart, nCount, &sites);
+    return postForPage({"listSites", "/v1/site/list", Payload::Ciphered}, nStart, nCount, sites);
 }
 
 unsigned CApiClient::commitSites(const JSON &sites, const char *szStage) {
@@ -60,11 +57,12 @@ unsigned CApiClient::commitSites(const JSON &sites, const char *szStage) {
 }
 
 unsigned CApiClient::listDevices(int nStart, int nCount, JSON &devices) {
-    return postPage("listDevices", "/v1/dev/list", nStart, nCount, &devices);
+    return postForPage({"listDevices", "/v1/dev/list", Payload::Ciphered}, nStart, nCount, devices);
 }
 
 unsigned CApiClient::listDevicesText(int nStart, int nCount, std::string &text) {
-    return postPage("listDevices", "/v1/dev/list", nStart, nCount, &text);
+    return postAsAccount({"listDevices", "/v1/dev/list", Payload::Ciphered},
+                         {{"start", nStart}, {"count", nCount}}, &text);
 }
 
 unsigned CApiClient::commitDevices(const JSON &devices, const char *szStage) {
@@ -91,8 +89,11 @@ unsigned CApiClient::deviceDiscoverByIPs(const char *szFirst, const char *szLast
 }
 
 unsigned CApiClient::discoveredDevices(JSON &devices) {
-    return postAsAccount({"discoveredDevices", "/v1/dev/scanout", Payload::Ciphered}, JSON::object(),
-                         &devices);
+    const unsigned result =
+        postAsAccount({"discoveredDevices", "/v1/dev/scanout", Payload::Ciphered}, JSON::object(), &devices);
+    if (result == ApiOk)
+        cutTo(devices, discoveryLimit);
+    return result;
 }
 
 unsigned CApiClient::setPassPolicy(const JSON &devices, const char *szType, int nMinLength,
@@ -114,9 +115,10 @@ unsigned CApiClient::authDevices(const JSON &devices, const char *szAccount, con
 }
 
 unsigned CApiClient::listDeviceStatus(int nStart, int nCount, JSON &statuses) {
-    return postPage("listDeviceStatus", "/v1/dstatus/list", nStart, nCount, &statuses);
+    return postForPage({"listDeviceStatus", "/v1/dstatus/list", Payload::Ciphered}, nStart, nCount, statuses);
 }
 
 unsigned CApiClient::listDeviceStatusText(int nStart, int nCount, std::string &text) {
-    return postPage("listDeviceStatus", "/v1/dstatus/list", nStart, nCount, &text);
+    return postAsAccount({"listDeviceStatus", "/v1/dstatus/list", Payload::Ciphered},
+                         {{"start", nStart}, {"count", nCount}}, &text);
 }

@@ -11,6 +11,8 @@
 
 namespace {
 
+constexpr int logEntryLimit = 200'000;
+
 /// The members of a log entry and the columns that show them.
 constexpr std::pair<const char *, const char *> logColumns[] = {{"created_at", "Date/Time"},
                                                                 {"source", "Source"},
@@ -42,8 +44,7 @@ unsigned CApiClient::newTaskState(const char *szType, const JSON &devices, JSON 
 }
 
 unsigned CApiClient::listTaskStatus(int nStart, int nCount, JSON &tasks) {
-    return postAsAccount({"listTaskStatus", "/v1/task/list", Payload::Ciphered},
-                         {{"start", nStart}, {"count", nCount}}, &tasks);
+    return postForPage({"listTaskStatus", "/v1/task/list", Payload::Ciphered}, nStart, nCount, tasks);
 }
 
 unsigned CApiClient::removeTaskStatus(const JSON &tids) {
@@ -71,8 +72,11 @@ unsigned CApiClient::updateTaskState(const char *szTaskId, const char *szState) 
 }
 
 unsigned CApiClient::listAlarmInfo(int nStart, int nCount, JSON &alarms) {
-    return postAsAccount({"listAlarmInfo", "/v1/alarm/list", Payload::Ciphered},
-                         {{"start", nStart}, {"count", nCount}}, &alarms);
+    const unsigned result = postAsAccount({"listAlarmInfo", "/v1/alarm/list", Payload::Ciphered},
+                                          {{"start", nStart}, {"count", nCount}}, &alarms);
+    if (result == ApiOk && alarms.is_object() && alarms.contains("items"))
+        cutTo(alarms["items"], nCount);
+    return result;
 }
 
 unsigned CApiClient::removeAlarmInfo(const JSON &alids) {
@@ -102,6 +106,7 @@ unsigned CApiClient::browseLogs(const char *szStart, const char *szEnd, JSON &ta
         return result;
     try {
         JSON rows = JSON::array();
+        cutTo(data.at("items"), logEntryLimit);
         for (const JSON &entry : data.at("items"))
             rows.push_back(logRow(entry));
         table = std::move(rows);

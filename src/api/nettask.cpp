@@ -1,13 +1,13 @@
 #include "nettask.h"
 
 #include "crashcatcher.h"
+#include "requestturn.h"
 
 #include <QDeadlineTimer>
 #include <QDebug>
 
 #include <algorithm>
 #include <chrono>
-#include <mutex>
 #include <vector>
 
 namespace {
@@ -15,8 +15,6 @@ namespace {
 constexpr std::chrono::milliseconds turnWait{30000};
 /// The transport matches status lines with a recursive expression; a long line needs a deep stack.
 constexpr uint stackBytes = 64u << 20;
-
-std::timed_mutex turnMutex;
 
 /// Every runner that exists; touched in the user-interface thread only.
 std::vector<NetTask *> &runners() {
@@ -64,10 +62,13 @@ void NetTask::run() {
 }
 
 void NetTask::runJob() {
-    std::unique_lock lock(turnMutex, std::defer_lock);
-    if (m_turn == Turn::Wait && !lock.try_lock_for(turnWait))
+    if (!m_job)
         return;
-    if (m_job)
+    if (m_turn == Turn::Beside)
+        return m_job(m_context);
+    const RequestTurn turn(m_turn == Turn::Reading ? RequestTurn::Order::Reading : RequestTurn::Order::User,
+                           turnWait);
+    if (turn.isHeld())
         m_job(m_context);
 }
 

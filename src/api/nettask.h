@@ -8,15 +8,17 @@
 /// Runs one blocking job on a thread of its own, one job of the whole process at a time.
 ///
 /// Set up with a job and started, from the user-interface thread; a long-lived runner takes the next job when
-/// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that. A runner
-/// beside the turn does neither: it is for the polls, which nobody's click should wait for.
+/// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that. Those of a
+/// runner for readings let what a user does go first, also between the pages of a list, so that a click waits
+/// for one request of theirs at most. A runner beside the turn does not wait: it is for the polls of tasks
+/// and alarms, for transfers, and for work that sends no requests.
 class NetTask : public QThread {
     Q_OBJECT
 
 public:
     using Job = std::function<void(quintptr context)>;
     using Preparation = std::function<void()>;
-    enum class Turn { Wait, Beside };
+    enum class Turn { Wait, Reading, Beside };
 
     /// Lets a runner go without waiting for it: one that still runs deletes itself when it has finished.
     struct LetGo {

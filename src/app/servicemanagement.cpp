@@ -45,7 +45,8 @@ void ServiceManagement::validateOrbServiceAdded() {
         return answer;
     };
     const bool started = ServiceRequest::post(
-        NetJob::createRunner("validateOrbServiceAdded in FramelessWindow"), this, work,
+        NetJob::createRunner("validateOrbServiceAdded in FramelessWindow", NetTask::Turn::Reading), this,
+        work,
         [this](const Answer &answer) {
             finishAsking();
             onAnswer(answer);

@@ -41,15 +41,16 @@ unsigned sendBatches(ServiceSession &session, const JSON &records) {
 unsigned readPresent(ServiceSession &session, const QStringList &deviceIds, JSON &records) {
     const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
     QHash<QString, JSON> found;
-    const unsigned result =
-        PageReader::readUntil(session, &CApiClient::listDevices, pageSize, [&](JSON &page) {
+    const unsigned result = PageReader::readAll(
+        session, &CApiClient::listDevices, pageSize,
+        [&](JSON &page) {
             for (JSON &record : page) {
                 const QString id = DeviceRecords::identityOf(record);
                 if (wanted.contains(id))
                     found[id] = std::move(record);
             }
-            return found.size() == wanted.size();
-        });
+        },
+        [&] { return found.size() < wanted.size(); });
     records = JSON::array();
     for (const QString &id : deviceIds) {
         if (found.contains(id))

@@ -20,7 +20,7 @@ MonitorBeat::Due MonitorBeat::tick() {
 }
 
 DeviceMonitor::DeviceMonitor(const DeviceInventory &inventory, QObject *parent)
-    : QObject(parent), m_inventory(inventory), m_runner(new (std::nothrow) NetTask) {
+    : QObject(parent), m_inventory(inventory), m_runner(new (std::nothrow) NetTask(NetTask::Turn::Reading)) {
     if (!m_runner)
         qDebug("monitor task create failed!should not be this case!");
     m_timer.setInterval(1000ms);

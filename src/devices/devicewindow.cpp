@@ -506,7 +506,7 @@ bool DeviceWindow::onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog) 
         return InventoryReader::readStatus(session, snapshot, codes);
     };
     return ServiceRequest::post(
-        NetJob::createRunner("refreshing the device states"), this, read,
+        NetJob::createRunner("refreshing the device states", NetTask::Turn::Reading), this, read,
         [this, dialog](const std::optional<DeviceStatusUpdate> &update) {
             if (update)
                 onUpdateDeviceStatus(*update);

@@ -25,7 +25,7 @@ InventoryUpdater::InventoryUpdater(const DeviceInventory &inventory, std::functi
     : QObject(parent),
       m_inventory(inventory),
       m_siteCommits(std::move(siteCommits)),
-      m_netTask(new (std::nothrow) NetTask) {
+      m_netTask(new (std::nothrow) NetTask(NetTask::Turn::Reading)) {
     if (!m_netTask)
         qDebug("net task create failed!should not be this case!");
 }
@@ -115,7 +115,7 @@ void InventoryUpdater::readStatesSoon() {
         return InventoryReader::readStatus(session, snapshot, codes);
     };
     ServiceRequest::post(
-        NetJob::createRunner("reading the states after a removal"), this, work,
+        NetJob::createRunner("reading the states after a removal", NetTask::Turn::Reading), this, work,
         [this](const std::optional<DeviceStatusUpdate> &update) {
             if (update)
                 emit statesRead(*update);

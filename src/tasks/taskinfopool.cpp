@@ -1,7 +1,6 @@
 #include "taskinfopool.h"
 
 #include "messagelog.h"
-#include "pagereader.h"
 #include "postwork.h"
 #include "servicerequest.h"
 #include "taskstate.h"
@@ -81,7 +80,8 @@ void CTaskInfoPool::loadTaskStatuses() {
     ServiceRequest::post(&m_taskRunner, this,
                          [this](ServiceSession &session) {
                              const MessageLog::PollScope counted;
-                             if (fetchTaskStatuses(session))
+                             const std::lock_guard fetch(m_fetch);
+                             if (guarded([&] { readTasks(session, [this] { return m_waiting == 0; }); }))
                                  startPostWork();
                              return true;
                          },
@@ -99,8 +99,10 @@ void CTaskInfoPool::loadAlarmInfo() {
 }
 
 bool CTaskInfoPool::fetchTaskStatuses(ServiceSession &session) {
+    ++m_waiting;
     const std::lock_guard fetch(m_fetch);
-    return guarded([&] { readTasks(session); });
+    --m_waiting;
+    return guarded([&] { readTasks(session, [] { return true; }); });
 }
 
 void CTaskInfoPool::startPostWork() {
@@ -108,19 +110,23 @@ void CTaskInfoPool::startPostWork() {
         this, [] { CPostWork::instance().SyncExportDebugInfo(); }, Qt::QueuedConnection);
 }
 
-void CTaskInfoPool::readTasks(ServiceSession &session) {
+void CTaskInfoPool::readTasks(ServiceSession &session, const PageReader::GoOn &goOn) {
     const TaskListPtr previous = taskList();
     std::vector<TaskRecordPtr> records;
     int unreadable = 0;
-    const unsigned result =
-        PageReader::readAll(session, &CApiClient::listTaskStatus, taskPageSize, [&](JSON &page) {
+    const unsigned result = PageReader::readAll(
+        session, &CApiClient::listTaskStatus, taskPageSize,
+        [&](JSON &page) {
             for (const JSON &value : page) {
                 if (TaskRecordPtr record = m_parser.parse(value, *previous))
                     records.push_back(std::move(record));
                 else
                     ++unreadable;
             }
-        });
+        },
+        goOn);
+    if (result == ApiOk && !goOn())
+        return;
     if (result != ApiOk) {
         qDebug("HTTP API(listTaskStatus) failed! (%u)", result);
         return tell(session, &CTaskInfoPool::taskListFailed);

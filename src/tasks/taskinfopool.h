@@ -2,6 +2,7 @@
 
 #include "alarmrecord.h"
 #include "nettask.h"
+#include "pagereader.h"
 #include "taskrecord.h"
 
 #include <QObject>
@@ -26,8 +27,9 @@ public:
     /// The same for the alarm list.
     void loadAlarmInfo();
 
-    /// Fetches the task list at once, for a job that has made a task and wants it to be seen. Waits for a
-    /// fetch that is under way. False when it has thrown, which is logged.
+    /// Fetches the task list at once, for a job that has made a task and wants it to be seen. Waits for
+    /// another fetch of this kind that is under way, but for one request of a poll only, which then gives up:
+    /// the job may hold the turn of all requests. False when it has thrown, which is logged.
     bool fetchTaskStatuses(ServiceSession &session);
 
     /// Writes a task's final state on the service. Blocks for a request: for a runner's thread.
@@ -65,7 +67,8 @@ private:
     CTaskInfoPool();
 
     void startPostWork();
-    void readTasks(ServiceSession &session);
+    /// Ends without a list when it may not go on between its pages.
+    void readTasks(ServiceSession &session, const PageReader::GoOn &goOn);
     void readAlarms(ServiceSession &session);
     bool takeTasks(const ServiceSession &session, TaskListPtr tasks, bool changed);
     void tell(const ServiceSession &session, void (CTaskInfoPool::*signal)());
@@ -74,6 +77,7 @@ private:
     NetTask m_alarmRunner;
 
     std::mutex m_fetch; ///< held for a whole fetch of tasks, so that an older list never replaces a newer one
+    std::atomic<int> m_waiting = 0; ///< fetches at once that wait for m_fetch
     TaskParser m_parser;
 
     mutable std::mutex m_mutex; ///< for the two lists, which are swapped under it with what is told of them

@@ -53,6 +53,7 @@ private slots:
     void judgesAnswers_data();
     void judgesAnswers();
     void outputIsFilledOnlyWithSuccess();
+    void listsLongerThanAskedFor();
     void longHead_data();
     void longHead();
     void totalTime_data();
@@ -198,6 +199,23 @@ void TestApiClientJudging::outputIsFilledOnlyWithSuccess() {
     QCOMPARE(client(m_peer.port())->listSites(0, 1, devices), unsigned(ApiCode105));
     QCOMPARE(id, "as before");
     QCOMPARE(devices.dump(), "\"as before\"");
+}
+
+void TestApiClientJudging::listsLongerThanAskedFor() {
+    const LogCapture log;
+    m_peer.answer(ScriptedPeer::sealed(JSON::array({1, 2, 3})));
+    using ListCall = unsigned (CApiClient::*)(int, int, JSON &);
+    for (const ListCall list : {&CApiClient::listSites, &CApiClient::listDevices, &CApiClient::listCgis,
+                                &CApiClient::listDeviceStatus, &CApiClient::listTaskStatus}) {
+        JSON records;
+        QCOMPARE((client(m_peer.port()).get()->*list)(0, 2, records), unsigned(ApiException));
+        QVERIFY(records.is_null());
+        QCOMPARE((client(m_peer.port()).get()->*list)(0, 3, records), unsigned(ApiOk));
+    }
+    m_peer.answer(ScriptedPeer::sealed({{"items", JSON::array({1, 2, 3})}, {"total_items", 3}}));
+    JSON alarms;
+    QCOMPARE(client(m_peer.port())->listAlarmInfo(0, 2, alarms), unsigned(ApiOk));
+    QCOMPARE(alarms.dump(), R"({"items":[1,2],"total_items":3})");
 }
 
 void TestApiClientJudging::longHead_data() {

@@ -1,5 +1,6 @@
 #include "logcapture.h"
 #include "netjob.h"
+#include "requestturn.h"
 
 #include <QCoreApplication>
 #include <QPointer>
@@ -20,6 +21,7 @@ private slots:
     void cleanup();
 
     void oneJobAtATime();
+    void readingsLetOthersGoFirst();
     void preparationRunsOutsideTheTurn();
     void resultComesHome();
     void runnerTakesTheNextJob();
@@ -69,6 +71,37 @@ void TestNetTask::oneJobAtATime() {
     }
     QTRY_COMPARE(ended, runners);
     QCOMPARE(meetings.load(), 0);
+}
+
+/// What a user does goes before readings that waited longer, and in the middle of one that has the turn.
+void TestNetTask::readingsLetOthersGoFirst() {
+    QStringList steps;
+    QSemaphore paused;
+    QSemaphore goOn;
+    const auto job = [&](const QString &name) { return [&steps, name](quintptr) { steps << name; }; };
+    NetTask reading(NetTask::Turn::Reading);
+    reading.setUp(0, [&](quintptr) {
+        steps << "page 1";
+        paused.release();
+        goOn.acquire();
+        RequestTurn::passOn();
+        steps << "page 2";
+        RequestTurn::passOn();
+        steps << "page 3";
+    });
+    reading.start();
+    QVERIFY(paused.tryAcquire(1, 10000));
+    NetTask later(NetTask::Turn::Reading);
+    NetTask user;
+    later.setUp(0, job("later reading"));
+    user.setUp(0, job("user"));
+    later.start();
+    QTest::qWait(100);
+    user.start();
+    QTest::qWait(100);
+    goOn.release();
+    QVERIFY(NetTask::waitForAll(10000));
+    QCOMPARE(steps, QStringList({"page 1", "user", "later reading", "page 2", "page 3"}));
 }
 
 void TestNetTask::preparationRunsOutsideTheTurn() {
