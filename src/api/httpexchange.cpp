@@ -256,5 +256,8 @@ private:
 HttpAnswer exchangeHttp(const HttpRequest &request) {
     if (request.port == 0 || request.port > 65535)
         return failed(request, false, "Invalid port");
+    // Not left to the transport, which would take no host for this computer.
+    if (request.host.empty())
+        return failed(request, false, httplib::to_string(httplib::Error::Connection));
     return Exchange(request).run();
 }

@@ -38,7 +38,7 @@ QString ServerAddress::resolved() const {
     const QHostInfo info = QHostInfo::fromName(host);
     if (info.error() != QHostInfo::NoError) {
         qDebug() << "Lookup failed:" << info.errorString();
-        return host;
+        return {};
     }
     const QList<QHostAddress> addresses = info.addresses();
     qDebug() << "-----> IP: " << addresses;
@@ -47,5 +47,5 @@ QString ServerAddress::resolved() const {
         if (address.protocol() == QAbstractSocket::IPv4Protocol)
             return address.toString();
     }
-    return addresses.isEmpty() ? host : addresses.first().toString();
+    return addresses.isEmpty() ? QString() : addresses.first().toString();
 }

@@ -22,6 +22,6 @@ struct ServerAddress {
     bool isIpAddress() const;
 
     /// The address to connect to: the host itself, or the first one that its name has. A failed look-up is
-    /// logged and yields the name. Blocks for a name; any thread.
+    /// logged and yields nothing, which no request is sent to. Blocks for a name; any thread.
     QString resolved() const;
 };

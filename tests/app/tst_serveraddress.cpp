@@ -48,7 +48,7 @@ private slots:
 
     void nameIsLookedUp() {
         QCOMPARE(ServerAddress{"10.1.2.3"}.resolved(), QStringLiteral("10.1.2.3"));
-        QCOMPARE(ServerAddress{"no-such-host.invalid"}.resolved(), QStringLiteral("no-such-host.invalid"));
+        QCOMPARE(ServerAddress{"no-such-host.invalid"}.resolved(), QString());
         // A bare file system has no table of hosts, and then nobody knows this name.
         if (QHostInfo::fromName("localhost").error() != QHostInfo::NoError)
             QSKIP("localhost has no address on this machine");
