@@ -1,5 +1,7 @@
 #include "clientidentity.h"
 
+#include "privatefiles.h"
+
 #include <openssl/bio.h>
 #include <openssl/pem.h>
 #include <openssl/x509.h>
@@ -8,6 +10,7 @@ namespace {
 
 constexpr const char *certificateFile = "./client.cer";
 constexpr const char *keyFile = "./client.key";
+constexpr qint64 sizeLimit = 64 << 10;
 
 struct FreeBio {
     void operator()(BIO *bio) const { BIO_free_all(bio); }
@@ -20,7 +23,8 @@ int refusePassPhrase(char *, int, int, void *) {
 
 template <typename Reader>
 auto readFrom(const char *file, Reader reader) {
-    const std::unique_ptr<BIO, FreeBio> bio(BIO_new_file(file, "rb"));
+    const QByteArray text = PrivateFiles::readOwn(QString::fromUtf8(file), sizeLimit).value_or(QByteArray());
+    const std::unique_ptr<BIO, FreeBio> bio(BIO_new_mem_buf(text.constData(), static_cast<int>(text.size())));
     return bio ? reader(bio.get(), nullptr, &refusePassPhrase, nullptr) : nullptr;
 }
 

@@ -5,7 +5,8 @@
 #include <memory>
 
 /// The certificate and the private key with which the client shows itself to a service: "./client.cer" and
-/// "./client.key", in PEM form. Neither is there unless both can be read; a key behind a pass phrase cannot.
+/// "./client.key", in PEM form, plain files of this user of 64 KiB at most. Neither is there unless both can
+/// be read; a key behind a pass phrase cannot.
 class ClientIdentity {
 public:
     ClientIdentity();

@@ -6,6 +6,10 @@
 
 #ifdef Q_OS_WIN
 #include "owneraccess.h"
+#else
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
 #endif
 
 namespace PrivateFiles {
@@ -23,6 +27,11 @@ bool makeFile(const QString &path) {
     return OwnerAccess::makeFile(QDir::toNativeSeparators(path).toStdWString());
 }
 
+bool openOwn(QFile &file, const QString &path) {
+    file.setFileName(path);
+    return QFileInfo(path).isFile() && file.open(QIODevice::ReadOnly);
+}
+
 #else
 
 constexpr QFileDevice::Permissions ownerFile = QFileDevice::ReadOwner | QFileDevice::WriteOwner;
@@ -33,6 +42,20 @@ bool makeFolder(const QString &folder) {
 
 bool makeFile(const QString &path) {
     return QFile(path).open(QIODevice::NewOnly | QIODevice::WriteOnly, ownerFile);
+}
+
+/// What was opened is what is looked at: the name may mean something else a moment later.
+bool openOwn(QFile &file, const QString &path) {
+    const int descriptor =
+        ::open(QFile::encodeName(path).constData(), O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC);
+    if (descriptor < 0)
+        return false;
+    struct stat status {};
+    if (::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode) && status.st_uid == ::geteuid() &&
+        file.open(descriptor, QIODevice::ReadOnly, QFileDevice::AutoCloseHandle))
+        return true;
+    ::close(descriptor);
+    return false;
 }
 
 #endif
@@ -55,6 +78,16 @@ bool ensureFile(const QString &path) {
     if (!ensureFolder(QFileInfo(path).absolutePath()))
         return false;
     return makeFile(path) || QFileInfo::exists(path);
+}
+
+std::optional<QByteArray> readOwn(const QString &path, qint64 limit) {
+    QFile file;
+    if (!openOwn(file, path) || file.size() > limit)
+        return std::nullopt;
+    QByteArray content = file.read(limit + 1);
+    if (file.error() != QFileDevice::NoError || content.size() > limit)
+        return std::nullopt;
+    return content;
 }
 
 } // namespace PrivateFiles

@@ -20,6 +20,9 @@
 #include <functional>
 #include <future>
 
+#include <sys/stat.h>
+#include <unistd.h>
+
 using TestSession::client;
 using TestSession::sealed;
 
@@ -69,6 +72,7 @@ private slots:
     void nobodyListens();
     void clientCertificate_data();
     void clientCertificate();
+    void certificateFilesOfNoUse();
     void nothingIsSentWithoutAKey();
     void anotherServerKeyGetsNothing();
     void keyOfAResumedSessionIsLookedAt();
@@ -404,6 +408,9 @@ void TestApiClientJudging::nobodyListens() {
     QCOMPARE(log.count("Login occuring error: "), 1);
     for (const std::uint32_t port : {0u, 65536u, 4294967295u})
         QCOMPARE(client(port)->removeSite("SR1"), unsigned(ApiTransportError));
+    const int before = m_peer.connections();
+    QCOMPARE(CApiClient("", m_peer.port()).loginServer("a", "b"), unsigned(ApiTransportError));
+    QCOMPARE(m_peer.connections(), before);
     std::uint32_t closedPort = 0;
     {
         const ScriptedPeer gone;
@@ -452,6 +459,28 @@ void TestApiClientJudging::clientCertificate() {
     QCOMPARE(result, unsigned(ApiOk));
     QCOMPARE(isThere, shown);
     QCOMPARE(questions, 0);
+}
+
+/// A pipe must not hold every request, and another user must not put a key under this one's hands.
+void TestApiClientJudging::certificateFilesOfNoUse() {
+    const auto key = CertificateMaker::makeKey();
+    const QByteArray plain = CertificateMaker::pem(key);
+    const QByteArray path = m_root.filePath("client.key").toUtf8();
+    const QString folder = QDir::currentPath();
+    QVERIFY(m_root.write("client.cer",
+                         CertificateMaker::pem(CertificateMaker::makeCertificate(key.get(), "gate"))));
+    QVERIFY(m_root.write("client.key", plain) && QDir::setCurrent(m_root.path()));
+    QVERIFY(ClientIdentity().isThere());
+    if (::geteuid() == 0) {
+        QCOMPARE(::chown(path.constData(), 65534, 65534), 0);
+        QVERIFY(!ClientIdentity().isThere());
+    }
+    QVERIFY(m_root.write("client.key", plain + QByteArray(64 << 10, '\n')));
+    QVERIFY(!ClientIdentity().isThere());
+    QVERIFY(QFile::remove(QString::fromUtf8(path)) && ::mkfifo(path.constData(), 0600) == 0);
+    QVERIFY(!ClientIdentity().isThere());
+    QVERIFY(QDir::setCurrent(folder));
+    QVERIFY(QFile::remove(QString::fromUtf8(path)) && QFile::remove(m_root.filePath("client.cer")));
 }
 
 void TestApiClientJudging::nothingIsSentWithoutAKey() {
