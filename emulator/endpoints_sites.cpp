@@ -22,8 +22,7 @@ Answer newSite(Service &service, const Call &call) {
 Answer updateSite(Service &service, const Call &call) {
     const std::string id = filledTextMember(call.body, "siteid");
     const std::string name = filledTextMember(call.body, "sitename");
-    const std::string parent = filledTextMember(call.body, "parentid");
-    service.withModel([&](Model &model) { model.sites.update(id, name, parent); });
+    service.withModel([&](Model &model) { model.sites.rename(id, name); });
     return {};
 }
 

@@ -137,14 +137,14 @@ std::string SiteTree::add(const std::string &name, const std::string &parent, st
     return id;
 }
 
-void SiteTree::update(const std::string &id, const std::string &name, const std::string &parent) {
+void SiteTree::rename(const std::string &id, const std::string &name) {
     const auto known =
         std::find_if(m_sites.begin(), m_sites.end(), [&](const Site &s) { return s.id == id; });
     if (known == m_sites.end()) {
         throw Refusal(Code::UnknownId, "no such site");
     }
     Draft draft(m_sites);
-    draft.put({id, name, parent, known->extra});
+    draft.put({id, name, known->parent, known->extra});
     draft.judge();
     replaceAll(draft.take());
 }

@@ -22,7 +22,7 @@ public:
 
     /// Adds a site and gives its id.
     std::string add(const std::string &name, const std::string &parent, std::int64_t nowMs);
-    void update(const std::string &id, const std::string &name, const std::string &parent);
+    void rename(const std::string &id, const std::string &name);
 
     /// Applies records and deletions and gives the ids of all the sites that went.
     std::unordered_set<std::string> commit(const Json &records);

@@ -33,11 +33,10 @@ unsigned CApiClient::addSite(const char *szName, const char *szParent, std::stri
     return ApiOk;
 }
 
-unsigned CApiClient::updateSite(const char *szSiteId, const char *szName, const char *szParent) {
+unsigned CApiClient::updateSite(const char *szSiteId, const char *szName, const char *) {
     if (isEmpty(szSiteId) || isEmpty(szName))
         return ApiInvalidArgument;
-    return postAsAccount({"updateSite", "/v1/site/update"},
-                         {{"siteid", szSiteId}, {"sitename", szName}, {"parentid", orRoot(szParent)}});
+    return postAsAccount({"updateSite", "/v1/site/update"}, {{"siteid", szSiteId}, {"sitename", szName}});
 }
 
 unsigned CApiClient::removeSite(const char *szSiteId) {

@@ -48,7 +48,7 @@ std::vector<Method> sessionMethods() {
         {"updateSite",
          [](CApiClient &c) { return c.updateSite("SR1", "b\"'", "SR2"); },
          "/v1/site/update",
-         {{"siteid", "SR1"}, {"sitename", "b\"'"}, {"parentid", "SR2"}}},
+         {{"siteid", "SR1"}, {"sitename", "b\"'"}}},
         {"removeSite",
          [](CApiClient &c) { return c.removeSite("SR1"); },
          "/v1/site/rms",
