@@ -79,7 +79,10 @@ bool NetTask::waitForAll(int milliseconds) {
 }
 
 void NetTask::runAndWait(const std::function<void()> &function) {
-    const std::unique_ptr<QThread> thread(QThread::create(function));
+    const std::unique_ptr<QThread> thread(QThread::create([&function] {
+        const CrashCatcher::ThreadGuard guard;
+        function();
+    }));
     thread->setStackSize(stackBytes);
     thread->start();
     thread->wait();

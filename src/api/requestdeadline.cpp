@@ -1,5 +1,6 @@
 #include "requestdeadline.h"
 
+#include "crashcatcher.h"
 #include "socketlifeline.h"
 
 #include <algorithm>
@@ -71,7 +72,10 @@ public:
 
 private:
     Watchdog() {
-        std::thread([this] { watch(); }).detach();
+        std::thread([this] {
+            const CrashCatcher::ThreadGuard guard;
+            watch();
+        }).detach();
     }
 
     static void cut(Watched &watched) {

@@ -148,7 +148,11 @@ QStringList siteIdsOf(const JSON &record) {
     const JSON *value = member(record, "siteid");
     JSON parsed;
     if (value && value->is_string()) {
-        parsed = JSON::parse(value->get_ref<const std::string &>(), nullptr, false);
+        try {
+            parsed = parseJson(value->get_ref<const std::string &>());
+        } catch (const std::exception &) {
+            return {};
+        }
         value = &parsed;
     }
     QStringList ids;
