@@ -23,7 +23,11 @@ QString apiResultText(unsigned result) {
     case ApiCipherFailure:
         return Texts::tr("a secret could not be ciphered");
     case ApiInvalidArgument:
-        return Texts::tr("nobody is logged in");
+        return Texts::tr("nothing was sent, because something in it is missing or not allowed");
+    case ApiCode105:
+        return Texts::tr("the server does not know the session any more");
+    case ApiCode108:
+        return Texts::tr("the server takes no more sessions");
     case ApiKeyChanged:
         return Texts::tr("the server's key has changed");
     case ApiTargetNotWritten:

@@ -76,8 +76,10 @@ void AccountManagementDialog::startChange(const Change &change) {
         },
         [this](JobEnd end) {
             setBusy(false);
-            if (end != JobEnd::Delivered)
-                m_warning.setText(tr("Change password failed."));
+            if (end == JobEnd::Delivered)
+                return;
+            qDebug("account management change password failed!");
+            m_warning.setText(tr("Change password failed."));
         });
     if (!started)
         return;

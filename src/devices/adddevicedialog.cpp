@@ -206,7 +206,7 @@ void AddDeviceDialog::runOnFile(const QString &path, Work work, Done done) {
         m_onFile = false;
         updateState();
         if (end != JobEnd::Delivered)
-            m_warning.setText(tr("Nothing was done with the file: %1.").arg(DeviceDiscovery::reasonOf(end)));
+            m_warning.setText(tr("Nothing was done with the file: %1.").arg(jobEndText(end)));
     };
     auto *runner = NetJob::createRunner("working on a device file", NetTask::Turn::Beside);
     if (!NetJob::post(runner, this, work, done, ended))

@@ -2,6 +2,7 @@
 
 #include "devicecommit.h"
 #include "deviceexport.h"
+#include "jobendtext.h"
 #include "servicerequest.h"
 #include "taskrepeats.h"
 #include "tasktype.h"
@@ -89,8 +90,11 @@ QString failureText(const QString &name, const DeviceOperations::Outcome &outcom
         .arg(name, reason);
 }
 
-QString busyText(const QString &name) {
-    return DeviceActions::tr("%1 could not be started: the client is busy, try again.").arg(name);
+/// Why an operation has no outcome.
+QString failureText(const QString &name, JobEnd end) {
+    const QString text = end == JobEnd::NotRun ? DeviceActions::tr("%1 could not be started: %2.")
+                                               : DeviceActions::tr("%1 failed: %2.");
+    return text.arg(name, jobEndText(end));
 }
 
 } // namespace
@@ -149,10 +153,10 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
         },
         [this, title](JobEnd end) {
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                emit failed(busyText(title));
+                emit failed(failureText(title, end));
         });
     if (!started)
-        emit failed(busyText(title));
+        emit failed(failureText(title, JobEnd::NotRun));
 }
 
 /// The devices need a moment to look at the credentials.
@@ -171,7 +175,11 @@ void DeviceActions::tellAuthorized(const QStringList &deviceIds, const QString &
             else
                 emit failed(message);
         },
-        {}, [] { std::this_thread::sleep_for(authorizationTime); });
+        [](JobEnd end) {
+            if (end == JobEnd::NotRun || end == JobEnd::Failed)
+                qDebug("HTTP API(listDeviceStatus) failed! (%d)", static_cast<int>(ApiException));
+        },
+        [] { std::this_thread::sleep_for(authorizationTime); });
 }
 
 void DeviceActions::deleteDevices(const QStringList &deviceIds) {
@@ -262,10 +270,10 @@ void DeviceActions::commit(const QString &name, const QStringList &deviceIds,
         },
         [this, name](JobEnd end) {
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                emit failed(busyText(name));
+                emit failed(failureText(name, end));
         });
     if (!started)
-        emit failed(busyText(name));
+        emit failed(failureText(name, JobEnd::NotRun));
 }
 
 void DeviceActions::exportList(const QString &path, const DeviceSnapshotPtr &devices,
@@ -311,10 +319,10 @@ void DeviceActions::start(const Errand &errand, NetTask *runner, const std::func
         },
         [this, name = errand.name](JobEnd end) {
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                emit failed(busyText(name));
+                emit failed(failureText(name, end));
         });
     if (!started)
-        emit failed(busyText(errand.name));
+        emit failed(failureText(errand.name, JobEnd::NotRun));
 }
 
 void DeviceActions::remember(const QString &tid, const Errand &errand) {

@@ -76,10 +76,6 @@ DeviceDiscovery::DeviceDiscovery(QObject *parent) : QObject(parent) {
 
 DeviceDiscovery::~DeviceDiscovery() = default;
 
-QString DeviceDiscovery::reasonOf(JobEnd end) {
-    return end == JobEnd::SessionGone ? tr("the session has ended") : tr("the client is busy, try again");
-}
-
 int DeviceDiscovery::passedSeconds() const {
     if (m_running.empty() || !m_running.back()->sinceStart.isValid())
         return 0;

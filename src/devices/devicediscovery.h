@@ -1,6 +1,7 @@
 #pragma once
 
 #include "devicerecord.h"
+#include "jobendtext.h"
 #include "servicerequest.h"
 
 #include <QElapsedTimer>
@@ -45,15 +46,12 @@ public:
                         const std::function<void(const QString &reason)> &failed) {
         const auto ended = [failed](JobEnd end) {
             if (end != JobEnd::Delivered)
-                failed(reasonOf(end));
+                failed(jobEndText(end));
         };
         if (!ServiceRequest::post(NetJob::createRunner(purpose), receiver, std::move(work), std::move(done),
                                   ended))
             ended(JobEnd::NotRun);
     }
-    /// The reason of a job without a result.
-    static QString reasonOf(JobEnd end);
-
 signals:
     /// What a search has found, whether it was known before or not.
     void found(const DeviceDiscovery::Search &search, const std::vector<DeviceRecordPtr> &devices);

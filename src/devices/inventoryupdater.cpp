@@ -120,7 +120,12 @@ void InventoryUpdater::readStatesSoon() {
             if (update)
                 emit statesRead(*update);
         },
-        [this](JobEnd) { emit statesSettled(); }, [] { std::this_thread::sleep_for(settlingTime); });
+        [this](JobEnd end) {
+            if (end == JobEnd::NotRun || end == JobEnd::Failed)
+                qDebug("HTTP API(listDeviceStatus) failed! (%d)", static_cast<int>(ApiException));
+            emit statesSettled();
+        },
+        [] { std::this_thread::sleep_for(settlingTime); });
 }
 
 void InventoryUpdater::stop() {

@@ -2,6 +2,7 @@
 
 #include "filedialogs.h"
 #include "icons.h"
+#include "jobendtext.h"
 #include "lastfolder.h"
 #include "logchart.h"
 #include "logexport.h"
@@ -235,7 +236,7 @@ void LogWindow::search(const LogFrame &frame) {
         [this](JobEnd end) {
             m_searching = false;
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                fail(tr("the client is busy, try again"));
+                fail(jobEndText(end));
             showCount();
             showState();
             // Another session may have begun while the answer for the last one was awaited.
@@ -243,7 +244,7 @@ void LogWindow::search(const LogFrame &frame) {
                 on_searchButton_clicked();
         });
     if (!m_searching)
-        fail(tr("the client is busy, try again"));
+        fail(jobEndText(JobEnd::NotRun));
     showCount();
     showState();
 }

@@ -1,5 +1,6 @@
 #include "settingwindow.h"
 
+#include "jobendtext.h"
 #include "lastfolder.h"
 #include "localstore.h"
 #include "notifier.h"
@@ -125,9 +126,7 @@ void SettingWindow::reset() {
 void SettingWindow::loadConfig() {
     const bool started = ServiceRequest::post(
         m_runner.get(), this, &SettingWindow::load, [this](const Loaded &loaded) { onLoaded(loaded); },
-        [this](JobEnd end) {
-            onJobEnded(end, tr("The settings could not be read: the client is busy, try again."), true);
-        });
+        [this](JobEnd end) { onJobEnded(end, tr("The settings could not be read: %1."), true); });
     if (started)
         showBusy(tr("Loading settings..."));
 }
@@ -135,7 +134,7 @@ void SettingWindow::loadConfig() {
 void SettingWindow::onJobEnded(JobEnd end, const QString &failure, bool offersRetry) {
     showBusy({});
     if (end == JobEnd::NotRun || end == JobEnd::Failed)
-        showNotice(failure, offersRetry);
+        showNotice(failure.arg(jobEndText(end)), offersRetry);
     // Another session may have begun while the answer for the last one was awaited, and the page was busy
     // then.
     if (end == JobEnd::SessionGone && CLocalStore::instance().loginInfo().isComplete())
@@ -207,7 +206,7 @@ void SettingWindow::saveConfig() {
         [this, wanted](const Saved &saved) { onSaved(saved, wanted); },
         [this](JobEnd end) {
             endSaving();
-            onJobEnded(end, tr("The settings could not be saved: the client is busy, try again."), false);
+            onJobEnded(end, tr("The settings could not be saved: %1."), false);
         });
     if (!started)
         return;

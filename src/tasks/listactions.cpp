@@ -1,6 +1,7 @@
 #include "listactions.h"
 
 #include "alarmrecord.h"
+#include "jobendtext.h"
 #include "servicerequest.h"
 #include "taskinfopool.h"
 #include "taskstate.h"
@@ -134,7 +135,7 @@ void ListActions::run(std::function<unsigned(ServiceSession &)> action, std::fun
             m_busy = false;
             emit busyChanged(false);
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                emit failed(failure.arg(tr("the client is busy, try again")));
+                emit failed(failure.arg(jobEndText(end)));
             if (end != JobEnd::SessionGone)
                 reload();
         });
