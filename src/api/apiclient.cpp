@@ -40,6 +40,11 @@ bool isToken(std::string_view text) {
     return std::all_of(text.begin(), text.end(), isTokenCharacter);
 }
 
+/// Of the statuses, only these say that nothing was done.
+bool isRefusal(int status) {
+    return status >= 400 && status < 500;
+}
+
 unsigned judgeUsualCode(int code) {
     switch (code) {
     case 0:
@@ -145,9 +150,12 @@ unsigned CApiClient::post(const Call &call, const JSON &body, const Output &outp
 }
 
 unsigned CApiClient::send(const Call &call, const Fill &fill, const Output &output) {
+    m_unanswered = false;
     try {
         return exchange(call, fill, output);
     } catch (const TransferError &error) {
+        // A form that could not be sent to its end is nothing to the service.
+        m_unanswered = false;
         if (m_transfer)
             m_transfer->fail(error.failure(), error.file());
         logException(call, error.what());
@@ -172,8 +180,10 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, const Output &
     fill(request);
     qDebug("CApiClient::%s > Set authorization to %s", call.method,
            MessageLog::secret(request.authorization).constData());
+    m_unanswered = true;
     const HttpAnswer answer = exchange(request);
     if (!answer.arrived) {
+        m_unanswered = answer.wasSent;
         std::cout << call.transportError << answer.error << std::endl;
         if (call.logTransportError)
             call.logTransportError(call, answer.error);
@@ -181,7 +191,9 @@ unsigned CApiClient::exchange(const Call &call, const Fill &fill, const Output &
     }
     if (call.logAnswer)
         call.logAnswer(call, answer);
-    return judge(call, answer, output);
+    const unsigned result = judge(call, answer, output);
+    m_unanswered = result == ApiMissingData || (result == ApiHttpStatusError && !isRefusal(answer.status));
+    return result;
 }
 
 HttpAnswer CApiClient::exchange(HttpRequest &request) {

@@ -49,6 +49,9 @@ public:
     void setTransfer(std::shared_ptr<Transfer> transfer) { m_transfer = std::move(transfer); }
     /// The raw token: as set, or as the service renewed it in the last call.
     const std::string &accessToken() const { return m_strAccess; }
+    /// After a call that failed: true when the service may have done it all the same, for it may have got the
+    /// whole request and has not answered it with a yes or a no that can be read.
+    bool isUnanswered() const { return m_unanswered; }
 
     // Session and server
 
@@ -281,4 +284,5 @@ private:
     std::string m_strServerKey;
     std::chrono::milliseconds m_totalTimeout{60000};
     std::shared_ptr<Transfer> m_transfer;
+    bool m_unanswered = false;
 };

@@ -4,6 +4,7 @@
 #include "bodysender.h"
 #include "clientidentity.h"
 #include "downloadtarget.h"
+#include "multipartbody.h"
 #include "requestdeadline.h"
 #include "responsebody.h"
 #include "serverkeycheck.h"
@@ -161,6 +162,19 @@ HttpAnswer failed(const HttpRequest &request, bool timeIsOver, const std::string
     return answer;
 }
 
+/// True unless the transport stopped before the last byte of the request.
+bool isSent(const HttpRequest &request, httplib::Error error) {
+    switch (error) {
+    case httplib::Error::Connection:
+    case httplib::Error::ConnectionTimeout:
+    case httplib::Error::SSLConnection:
+    case httplib::Error::Write:
+        return false;
+    default:
+        return !request.form || request.transfer->bytesDone() >= request.form->length();
+    }
+}
+
 httplib::Request messageOf(const HttpRequest &request) {
     httplib::Request message;
     message.method = request.verb;
@@ -225,11 +239,12 @@ private:
             m_sender->rethrow();
         if (m_sender && m_sender->refusal() != 0)
             return arrived(m_sender->refusal());
-        if (m_headStatus == 0)
-            return failed(m_request, m_deadline.isOver(), httplib::to_string(result.error()));
-        if (!m_request.headOnly && !m_receiver.isWhole())
-            return failed(m_request, m_deadline.isOver(), m_receiver.error());
-        return arrived(m_headStatus);
+        if (m_headStatus != 0 && (m_request.headOnly || m_receiver.isWhole()))
+            return arrived(m_headStatus);
+        const std::string error = m_headStatus == 0 ? httplib::to_string(result.error()) : m_receiver.error();
+        HttpAnswer answer = failed(m_request, m_deadline.isOver(), error);
+        answer.wasSent = isSent(m_request, result.error());
+        return answer;
     }
 
     HttpAnswer arrived(int status) {

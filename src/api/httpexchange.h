@@ -33,6 +33,7 @@ struct HttpAnswer {
     std::string error;
     std::string serverKey;   ///< fingerprint of the server's public key, once it was seen
     bool keyChanged = false; ///< it is not the expected one, so nothing was sent
+    bool wasSent = false;    ///< without an answer: the service may have the whole request all the same
     int status = 0;
     std::string authorization; ///< the answer's header of that name, or empty
     std::string body;

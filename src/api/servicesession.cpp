@@ -40,6 +40,7 @@ void ServiceSession::log(const LoginInfo &login) {
 }
 
 unsigned ServiceSession::send(const std::function<unsigned(CApiClient &)> &endpoint) {
+    m_unanswered = false;
     const LoginInfo present = CLocalStore::instance().loginInfo();
     if (present.generation != m_login.generation)
         return ApiInvalidArgument;
@@ -53,6 +54,7 @@ unsigned ServiceSession::send(const std::function<unsigned(CApiClient &)> &endpo
     const unsigned result = endpoint(client);
     if (result == ApiKeyChanged)
         SessionEvents::instance().reportKeyChanged(m_login.generation, client.serverKey());
+    m_unanswered = result != ApiOk && client.isUnanswered();
     if (client.accessToken() != before)
         CLocalStore::instance().renewAccess(QByteArray::fromStdString(client.accessToken()), m_carried,
                                             m_login.generation);

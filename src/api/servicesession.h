@@ -23,6 +23,9 @@ public:
     /// True when the service has told that it does not know the session any more.
     bool isLost() const { return m_lost; }
 
+    /// True when the service may have done what the last call asked for although it failed.
+    bool isUnanswered() const { return m_unanswered; }
+
     /// True while the stored session is still the one that this object began with.
     bool isPresent() const;
 
@@ -37,4 +40,5 @@ private:
     LoginInfo m_login;
     QByteArray m_carried; ///< the token, in cipher form, of the last call
     bool m_lost = false;
+    bool m_unanswered = false;
 };
