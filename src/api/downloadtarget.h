@@ -2,6 +2,7 @@
 
 #include <QTemporaryFile>
 
+#include <chrono>
 #include <string>
 
 /// Where a file from the service goes: a temporary file beside the target, for its user alone, that takes the
@@ -11,6 +12,10 @@ class DownloadTarget {
 public:
     /// path: UTF-8.
     explicit DownloadTarget(const char *path);
+
+    /// Removes what fetches into the folder have left behind that ended with the program, unless it was
+    /// written to within that time.
+    static void removeLeftovers(const QString &folder, std::chrono::milliseconds age);
 
     /// False when the target exists or nothing can be written there.
     bool open();

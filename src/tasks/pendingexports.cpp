@@ -43,12 +43,15 @@ QString PendingExports::serverOf(const LoginInfo &login) {
 }
 
 void PendingExports::add(PendingExport pending) {
-    const std::lock_guard lock(m_mutex);
-    load();
-    m_entries.push_back({std::move(pending)});
-    if (m_entries.size() > mostEntries)
-        m_entries.erase(m_entries.begin());
-    save();
+    {
+        const std::lock_guard lock(m_mutex);
+        load();
+        m_entries.push_back({std::move(pending)});
+        if (m_entries.size() > mostEntries)
+            m_entries.erase(m_entries.begin());
+        save();
+    }
+    StoreWriter::flush();
 }
 
 void PendingExports::remove(const PendingExport &pending) {

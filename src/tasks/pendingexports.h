@@ -29,7 +29,8 @@ public:
     /// How a session's service stands in an export.
     static QString serverOf(const LoginInfo &login);
 
-    /// The oldest ones give way when nobody has collected very many of them.
+    /// Notes an export, durably when it returns. The oldest ones give way when nobody has collected very many
+    /// of them.
     void add(PendingExport pending);
     void remove(const PendingExport &pending);
 

@@ -1,5 +1,6 @@
 #include "postwork.h"
 
+#include "downloadtarget.h"
 #include "servicerequest.h"
 #include "taskinfopool.h"
 #include "taskstate.h"
@@ -102,15 +103,22 @@ bool CPostWork::isToCollect(const PendingExport &pending, const TaskRecordPtr &t
     }
     if (!task || !task->isFinal())
         return false;
-    if (!hasReport(*task))
-        m_pending.remove(pending);
-    return hasReport(*task);
+    if (hasReport(*task))
+        return true;
+    m_pending.remove(pending);
+    // Whoever has cancelled it waits for nothing.
+    if (task->status != TaskState::aborted)
+        tellFailure(tr("There will be no debug information in “%1”: no device delivered any.")
+                        .arg(QDir::toNativeSeparators(pending.folder)));
+    return false;
 }
 
 void CPostWork::collect(ServiceSession &session, const PendingExport &pending, const TaskRecord &task) {
     // The program ended between the last step of the fetch and the note that it is done.
     if (!pending.target.isEmpty() && QFileInfo::exists(pending.target))
         return succeed(pending, pending.target);
+    if (!pending.target.isEmpty())
+        DownloadTarget::removeLeftovers(pending.folder, {});
     const QString path = freePath(pending.folder, reportName(pending, devicesTold(task)));
     m_pending.setTarget(pending, path);
     const auto transfer = std::make_shared<Transfer>();
