@@ -1,11 +1,12 @@
 #include "serversettings.h"
 
+#include "settingvalue.h"
+
 #include <QCoreApplication>
 
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
-#include <cmath>
 
 namespace ServerSettings {
 
@@ -32,43 +33,18 @@ QString rawText(const JSON &value) {
     return text.size() > longestShownValue ? text.left(longestShownValue) + QChar(0x2026) : text;
 }
 
-/// A number, however it is written; not-a-number for what is none.
-double numberOf(const JSON &value) {
-    if (value.is_boolean())
-        return value.get<bool>() ? 1 : 0;
-    if (value.is_number())
-        return value.get<double>();
-    bool isNumber = false;
-    const double number =
-        value.is_string() ? QString::fromStdString(value.get<std::string>()).toDouble(&isNumber) : 0;
-    return isNumber ? number : std::nan("");
-}
-
-QVariant switchValue(const JSON &value) {
-    if (value.is_string()) {
-        const std::string text = value.get<std::string>();
-        if (text == "true" || text == "false")
-            return text == "true";
-    }
-    const double number = numberOf(value);
-    return std::isnan(number) ? QVariant() : QVariant(number != 0);
-}
-
-QVariant numberValue(const JSON &value, const Setting &setting) {
-    const double number = numberOf(value);
-    if (std::isnan(number))
-        return {};
-    return static_cast<int>(std::clamp(std::trunc(number), static_cast<double>(setting.least),
-                                       static_cast<double>(setting.most)));
+template <typename Value>
+QVariant variantOf(const std::optional<Value> &value) {
+    return value ? QVariant(*value) : QVariant();
 }
 
 /// What the controls show of a value; nothing where its type makes no sense.
 QVariant shownValue(const JSON &value, const Setting &setting) {
     switch (setting.kind) {
     case Kind::Switch:
-        return switchValue(value);
+        return variantOf(SettingValue::toSwitch(value));
     case Kind::Number:
-        return numberValue(value, setting);
+        return variantOf(SettingValue::toNumber(value, setting.least, setting.most));
     case Kind::Text:
         break;
     }
@@ -119,7 +95,8 @@ const std::vector<Setting> &all() {
         {uploadLimitSwitchKey, Kind::Switch,
          QT_TRANSLATE_NOOP("ServerSettings", "Limit of firmware uploads")},
         {"svr_fw_upload_limit", Kind::Number,
-         QT_TRANSLATE_NOOP("ServerSettings", "Number of simultaneous firmware uploads"), 1, 50}};
+         QT_TRANSLATE_NOOP("ServerSettings", "Number of simultaneous firmware uploads"),
+         SettingValue::minUploads, SettingValue::maxUploads}};
     return settings;
 }
 

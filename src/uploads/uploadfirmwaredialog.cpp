@@ -11,6 +11,7 @@
 #include "rolloutmgr.h"
 #include "schedulefield.h"
 #include "servicerequest.h"
+#include "settingvalue.h"
 #include "storewriter.h"
 #include "targetbox.h"
 #include "taskinfopool.h"
@@ -37,15 +38,6 @@ constexpr int fewestRows = 1;
 
 QString number(int value) {
     return QLocale().toString(value);
-}
-
-/// How many uploads the service lets run at a time; 0 where it has no limit or does not tell.
-int uploadLimitOf(const JSON &settings) {
-    const auto isOn = settings.find("svr_fw_upload_limit_enabled");
-    const auto limit = settings.find("svr_fw_upload_limit");
-    if (isOn == settings.end() || *isOn != true || limit == settings.end() || !limit->is_number_integer())
-        return 0;
-    return static_cast<int>(std::clamp<std::int64_t>(limit->get<std::int64_t>(), 0, 1'000'000));
 }
 
 } // namespace
@@ -101,7 +93,7 @@ void UploadFirmwareDialog::buildDevices() {
     m_shown.resize(m_all->size());
     std::iota(m_shown.begin(), m_shown.end(), 0);
     m_isUnticked.resize(m_all->size());
-    m_table->showList(m_groups, {190, 100, 170}, -1);
+    m_table->showList(m_groups, {160, 90, 130}, -1);
     addPart(m_table);
     m_empty = label(tr("The last upload failed on none of the devices."), "quiet");
     m_empty->setObjectName(QStringLiteral("noDevicesLabel"));
@@ -163,7 +155,7 @@ void UploadFirmwareDialog::readUploadLimit() {
                 session.call([&](CApiClient &client) { return client.loadServerSettings(settings); });
             if (result != ApiOk)
                 qWarning("HTTP API(loadServerSettings) failed! (%u)", result);
-            return result == ApiOk && settings.is_object() ? uploadLimitOf(settings) : 0;
+            return result == ApiOk && settings.is_object() ? SettingValue::uploadLimit(settings) : 0;
         },
         [this](int limit) { setFootNote(limit > 0 ? tr("%1 at a time").arg(number(limit)) : QString()); });
 }

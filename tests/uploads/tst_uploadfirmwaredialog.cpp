@@ -236,7 +236,7 @@ void TestUploadFirmwareDialog::limitOfTheServiceIsShown() {
     auto *note = part<QLabel>("footNoteLabel");
     QVERIFY(note->text().isEmpty());
     m_service->setAnswer("/v1/config/get",
-                         {{"svr_fw_upload_limit_enabled", true}, {"svr_fw_upload_limit", 20}});
+                         {{"svr_fw_upload_limit_enabled", 1}, {"svr_fw_upload_limit", "20"}});
     open();
     note = part<QLabel>("footNoteLabel");
     QTRY_COMPARE(note->text(), "20 at a time");
@@ -271,7 +271,6 @@ void TestUploadFirmwareDialog::wavesAreFollowedInTheStrip() {
 
 void TestUploadFirmwareDialog::failedWaveIsOfferedOnce() {
     FailedTaskStrip failures;
-    failures.follow(&UploadTaskMgr::instance());
     const auto countOfUploads = [this] { return m_service->sentTo("/v1/task/init").size(); };
     chooseImage("NVLFW1 NC 2.5.0\n");
     part<QCheckBox>("inWavesCheckBox")->click();
