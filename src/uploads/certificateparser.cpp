@@ -1,6 +1,7 @@
 #include "certificateparser.h"
 
 #include "certificatefile.h"
+#include "privatekeys.h"
 
 #include <QCoreApplication>
 #include <QCryptographicHash>
@@ -37,7 +38,6 @@ struct Freed {
 };
 using Bio = std::unique_ptr<BIO, Freed<BIO_free_all>>;
 using Certificate = std::unique_ptr<X509, Freed<X509_free>>;
-using Key = std::unique_ptr<EVP_PKEY, Freed<EVP_PKEY_free>>;
 using Sealed = std::unique_ptr<X509_SIG, Freed<X509_SIG_free>>;
 
 /// Memory that the library has given.
@@ -131,10 +131,13 @@ void take(const Certificate &certificate, CertificateFile &file) {
 }
 
 /// A key that is under no pass phrase has to open; one that is may stay closed.
-void take(const Key &key, CertificateFile &file) {
+void take(const PrivateKeys::Opened &opened, CertificateFile &file) {
     file.hasKey = true;
-    file.keyMark = markOf(key.get());
-    if (!key && !file.isEncrypted)
+    file.keyMark = markOf(opened.key.get());
+    if (opened.isExcessive)
+        file.error = Texts::tr("The private key in the file is larger than any in use, or made to take too "
+                               "long to open.");
+    else if (!opened.key && !file.isEncrypted)
         file.error = Texts::tr("The private key in the file is damaged or of an unknown kind.");
 }
 
@@ -147,7 +150,27 @@ QString strangerText(const QByteArray &name) {
     return Texts::tr("The file holds neither a certificate nor a private key.");
 }
 
-void takeBlock(const Block &block, CertificateFile &file) {
+/// Takes the older way of keeping a key under a pass phrase off the block.
+bool decrypt(Block &block, const QByteArray &passPhrase) {
+    EVP_CIPHER_INFO cipher;
+    return PEM_get_EVP_CIPHER_INFO(block.header, &cipher) == 1 &&
+           PEM_do_header(&cipher, block.body.data, &block.body.length, &givePassPhrase,
+                         passPhraseArgument(passPhrase)) == 1;
+}
+
+void takeKeyBlock(Block &block, const QByteArray &passPhrase, CertificateFile &file) {
+    const bool isSealed = block.isNamed({"ENCRYPTED PRIVATE KEY"});
+    const bool hasHeader = QByteArrayView(block.header).contains("ENCRYPTED");
+    file.isEncrypted = isSealed || hasHeader;
+    if (isSealed)
+        return take(PrivateKeys::openSealed(block.body.data, block.body.length, passPhrase), file);
+    if (block.body.length > PrivateKeys::longestKey)
+        return take({{}, true}, file);
+    const bool isReadable = !hasHeader || decrypt(block, passPhrase);
+    take(isReadable ? PrivateKeys::open(block.body.data, block.body.length) : PrivateKeys::Opened(), file);
+}
+
+void takeBlock(Block &block, const QByteArray &passPhrase, CertificateFile &file) {
     if (block.isNamed({"CERTIFICATE", "X509 CERTIFICATE", "TRUSTED CERTIFICATE"})) {
         const unsigned char *at = block.body.data;
         const Certificate certificate(d2i_X509(nullptr, &at, block.body.length));
@@ -155,10 +178,8 @@ void takeBlock(const Block &block, CertificateFile &file) {
             take(certificate, file);
         else
             file.error = Texts::tr("A certificate in the file is damaged.");
-    } else if (QByteArrayView(block.name).endsWith("PRIVATE KEY")) {
-        file.hasKey = true;
-        file.isEncrypted =
-            block.isNamed({"ENCRYPTED PRIVATE KEY"}) || QByteArrayView(block.header).contains("ENCRYPTED");
+    } else if (QByteArrayView(block.name).endsWith("PRIVATE KEY") && !file.hasKey) {
+        takeKeyBlock(block, passPhrase, file);
     }
 }
 
@@ -169,27 +190,16 @@ void parsePem(const QByteArray &bytes, const QByteArray &passPhrase, Certificate
         Block block;
         if (PEM_read_bio(reader.get(), &block.name, &block.header, &block.body.data, &block.body.length) != 1)
             break;
-        takeBlock(block, file);
+        takeBlock(block, passPhrase, file);
+        ERR_clear_error();
         stranger = block.name;
     }
     // Behind the last block it finds no other start; anything else is a block that is cut or garbled.
     const bool isWhole = ERR_GET_REASON(ERR_peek_last_error()) == PEM_R_NO_START_LINE;
     if (!isWhole && file.error.isEmpty())
         file.error = Texts::tr("The file is damaged or cut off.");
-    if (file.hasKey) {
-        const Bio again = readerOf(bytes);
-        take(Key(PEM_read_bio_PrivateKey(again.get(), nullptr, &givePassPhrase,
-                                         passPhraseArgument(passPhrase))),
-             file);
-    }
     if (file.error.isEmpty() && !file.hasCertificate() && !file.hasKey)
         file.error = strangerText(stranger);
-}
-
-Key openSealed(const QByteArray &bytes, const QByteArray &passPhrase) {
-    const Bio reader = readerOf(bytes);
-    return Key(
-        d2i_PKCS8PrivateKey_bio(reader.get(), nullptr, &givePassPhrase, passPhraseArgument(passPhrase)));
 }
 
 void parseDer(const QByteArray &bytes, const QByteArray &passPhrase, CertificateFile &file) {
@@ -200,11 +210,13 @@ void parseDer(const QByteArray &bytes, const QByteArray &passPhrase, Certificate
     at = bytesOf(bytes);
     if (const Sealed sealed(d2i_X509_SIG(nullptr, &at, length)); sealed) {
         file.isEncrypted = true;
-        return take(openSealed(bytes, passPhrase), file);
+        return take(PrivateKeys::openSealed(bytesOf(bytes), length, passPhrase), file);
     }
-    at = bytesOf(bytes);
-    if (const Key key(d2i_AutoPrivateKey(nullptr, &at, length)); key)
-        return take(key, file);
+    if (length <= PrivateKeys::longestKey) {
+        const PrivateKeys::Opened opened = PrivateKeys::open(bytesOf(bytes), length);
+        if (opened.key || opened.isExcessive)
+            return take(opened, file);
+    }
     file.error = Texts::tr("The file holds neither a certificate nor a private key in PEM or DER form.");
 }
 

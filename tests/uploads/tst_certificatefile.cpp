@@ -4,6 +4,7 @@
 #include "isolatedroot.h"
 
 #include <QDateTime>
+#include <QElapsedTimer>
 #include <QTest>
 
 #include <sys/stat.h>
@@ -93,14 +94,28 @@ private slots:
         QTest::newRow("garbled certificate") << QByteArray(request).replace(" REQUEST", "") << "is damaged";
         QTest::newRow("garbled key") << QByteArray(request).replace("CERTIFICATE REQUEST", "PRIVATE KEY")
                                      << "key in the file is damaged";
+        const QString excessive = QStringLiteral("larger than any in use, or made to take too long");
+        QTest::newRow("2^31 rounds") << sealedUnder(PKCS5_pbe2_set_iv(EVP_aes_128_cbc(), INT_MAX, nullptr, 0,
+                                                                      nullptr, NID_hmacWithSHA256))
+                                     << excessive;
+        QTest::newRow("2^31 rounds, old scheme")
+            << sealedUnder(PKCS5_pbe_set(NID_pbeWithMD5AndDES_CBC, INT_MAX, nullptr, 0)) << excessive;
+        QTest::newRow("scrypt for hours")
+            << sealedUnder(PKCS5_pbe2_set_scrypt(EVP_aes_128_cbc(), nullptr, 0, nullptr, 1 << 14, 8, 8000))
+            << excessive;
+        QTest::newRow("15 KB of DSA") << dsaKey(5000) << excessive;
+        QTest::newRow("over 64 KiB") << block("PRIVATE KEY", QByteArray(70000, 'x')) << excessive;
         QTest::newRow("text") << QByteArray("no certificate at all") << "neither";
         QTest::newRow("der cut") << der(m_leaf).chopped(5) << "neither";
     }
     void badFilesAreRefused() {
         QFETCH(QByteArray, bytes);
         QFETCH(QString, reason);
-        const CertificateFile file = read(bytes);
+        QElapsedTimer timer;
+        timer.start();
+        const CertificateFile file = read(bytes, "secret");
         QVERIFY2(file.error.contains(reason), qPrintable(file.error));
+        QVERIFY2(timer.elapsed() < 3000, "whatever it asks for");
     }
 
     void whatIsNoFileIsRefused() {
@@ -139,6 +154,45 @@ private:
         if (!m_root.write(name, bytes))
             qFatal("a test's file cannot be written");
         return CertificateFiles::read(m_root.filePath(name), passPhrase);
+    }
+
+    static QByteArray block(const char *name, const QByteArray &body) {
+        return written([&](BIO *out) {
+            const auto *bytes = reinterpret_cast<const unsigned char *>(body.constData());
+            return PEM_write_bio(out, name, "", bytes, body.size()) > 0 ? 1 : 0;
+        });
+    }
+    /// Something that says of itself that it is a key under this scheme.
+    static QByteArray sealedUnder(X509_ALGOR *scheme) {
+        const std::unique_ptr<X509_ALGOR, Freed<X509_ALGOR_free>> owned(scheme);
+        const std::unique_ptr<X509_SIG, Freed<X509_SIG_free>> sealed(X509_SIG_new());
+        X509_ALGOR *inside = nullptr;
+        ASN1_OCTET_STRING *text = nullptr;
+        X509_SIG_getm(sealed.get(), &inside, &text);
+        X509_ALGOR_copy(inside, scheme);
+        ASN1_STRING_set(text, std::string(64, 'x').data(), 64);
+        return written([&](BIO *out) { return PEM_write_bio_PKCS8(out, sealed.get()); });
+    }
+    /// A DSA key with numbers of so many bytes, whose public half takes minutes to compute.
+    static QByteArray dsaKey(int bytes) {
+        QByteArray number("\x02\x82", 2);
+        number += char(bytes >> 8);
+        number += char(bytes & 0xff);
+        number += QByteArray(bytes, 'Q');
+        const QByteArray numbers = number + number + number;
+        ASN1_STRING *parameters = ASN1_STRING_new();
+        QByteArray sequence("\x30\x82", 2);
+        sequence += char(numbers.size() >> 8);
+        sequence += char(numbers.size() & 0xff);
+        sequence += numbers;
+        ASN1_STRING_set(parameters, sequence.constData(), int(sequence.size()));
+        auto *secret = static_cast<unsigned char *>(OPENSSL_malloc(number.size()));
+        std::copy(number.begin(), number.end(), secret);
+        const std::unique_ptr<PKCS8_PRIV_KEY_INFO, Freed<PKCS8_PRIV_KEY_INFO_free>> info(
+            PKCS8_PRIV_KEY_INFO_new());
+        PKCS8_pkey_set0(info.get(), OBJ_nid2obj(NID_dsa), 0, V_ASN1_SEQUENCE, parameters, secret,
+                        int(number.size()));
+        return written([&](BIO *out) { return PEM_write_bio_PKCS8_PRIV_KEY_INFO(out, info.get()); });
     }
 
     IsolatedRoot m_root;
