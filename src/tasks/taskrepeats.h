@@ -21,7 +21,13 @@ public:
     static TaskRepeats &instance();
 
     void remember(const QString &tid, Repeat repeat);
-    /// Null for a task whose parameters are not known here.
+    /// It is done again already: nobody is offered the same once more.
+    void take(const QString &tid);
+    /// Tells of tasks that somebody else may do again; those are not offered either.
+    void setGuard(std::function<bool(const QString &tid)> guard) { m_guard = std::move(guard); }
+    /// True when it was taken, or is guarded.
+    bool isTaken(const QString &tid) const;
+    /// Null for a task whose parameters are not known here, and for one that is taken.
     const Repeat *find(const QString &tid) const;
     /// Takes a new list in, and forgets the tasks that the service has no more.
     void follow(const TaskList &tasks);
@@ -30,8 +36,10 @@ public:
 private:
     struct Entry {
         Repeat repeat;
+        bool isTaken = false;
         int lacking = 0; ///< lists in a row
     };
 
     QHash<QString, Entry> m_entries;
+    std::function<bool(const QString &)> m_guard;
 };

@@ -7,6 +7,7 @@
 namespace TaskState {
 
 inline const QString init = QStringLiteral("pTaskInitState");
+inline const QString queued = QStringLiteral("pTaskQueueState");
 inline const QString scheduled = QStringLiteral("pTaskScheduled");
 inline const QString processing = QStringLiteral("pTaskProcessing");
 inline const QString done = QStringLiteral("pTaskDone");

@@ -1,6 +1,7 @@
 #include "rollout.h"
 
 #include "taskstate.h"
+#include "tasktype.h"
 
 #include <QSet>
 
@@ -16,12 +17,18 @@ bool isServed(const TaskDevice &device) {
            device.state != TaskState::aborted;
 }
 
-/// The devices of a wave that its task has not served.
+/// True for a device that a cancelled task has come to and not finished with: it may be updating.
+bool isAtWork(const TaskDevice &device) {
+    return !TaskState::isFinal(device.state) && device.state != TaskState::init &&
+           device.state != TaskState::queued && device.state != TaskState::scheduled;
+}
+
+/// The devices of a wave that its task has not served and is not at work on.
 QStringList notDone(const Rollout::Wave &wave, const TaskRecord *task) {
     QSet<QString> done;
     if (task) {
         for (const TaskDevice &device : task->devices) {
-            if (isServed(device))
+            if (isServed(device) || isAtWork(device))
                 done.insert(device.target->id);
         }
     }
@@ -44,11 +51,42 @@ void Rollout::begin() {
 
 void Rollout::resume(const Progress &progress) {
     m_progress = progress;
-    const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
-    // What the queue of that session held is gone with it.
-    if (isUploading && m_progress.wave.tid.isEmpty())
-        return halt(Reason::NotBegun, tr("The session ended before it began."));
+    if (isUploading() && m_progress.wave.tid.isEmpty()) {
+        // The program may have ended before it noted the task that it had made.
+        for (const QString &tid : tasksFor(m_progress.wave.deviceIds)) {
+            if (!m_progress.wave.earlierTids.contains(tid))
+                m_progress.wave.tid = tid;
+        }
+        // What the queue of that session held is gone with it.
+        if (m_progress.wave.tid.isEmpty())
+            return halt(Reason::NotBegun, tr("The session ended before it began."));
+        emit moved();
+    }
+    // A clock that was set back meanwhile must not make it wait for years.
+    const qint64 left = m_progress.waitUntil - m_surroundings.now();
+    m_waitEnd = m_surroundings.steady() + std::clamp<qint64>(left, 0, m_plan->waitMinutes * minuteMs);
     advance();
+}
+
+qint64 Rollout::waitLeft() const {
+    return std::max<qint64>(m_waitEnd - m_surroundings.steady(), 0);
+}
+
+bool Rollout::isUploading() const {
+    return state() == State::FirstWave || state() == State::SecondWave;
+}
+
+/// The firmware tasks in the list that are for these devices, or for those of them that are left.
+QStringList Rollout::tasksFor(const QStringList &deviceIds) const {
+    const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
+    const auto isWanted = [&](const TaskDevice &device) { return wanted.contains(device.target->id); };
+    QStringList tids;
+    for (const TaskRecordPtr &task : m_surroundings.tasks()->records()) {
+        if (task->type == TaskType::firmwareUpload && !task->devices.empty() &&
+            std::all_of(task->devices.begin(), task->devices.end(), isWanted))
+            tids += task->tid;
+    }
+    return tids;
 }
 
 void Rollout::beginWave(State state, const QStringList &deviceIds) {
@@ -56,12 +94,13 @@ void Rollout::beginWave(State state, const QStringList &deviceIds) {
     m_progress.earlierFailed += m_progress.wave.failed;
     m_progress.wave = {};
     m_progress.wave.deviceIds = deviceIds;
+    m_progress.wave.earlierTids = tasksFor(deviceIds);
     setState(state);
     m_surroundings.upload(*this, deviceIds, state == State::FirstWave ? m_plan->actionTime : QString());
 }
 
 void Rollout::advance() {
-    if (state() == State::Waiting && m_surroundings.now() >= m_progress.waitUntil)
+    if (state() == State::Waiting && waitLeft() == 0)
         return beginWave(State::SecondWave, m_plan->rest());
     if (!m_progress.wave.tid.isEmpty())
         follow();
@@ -90,14 +129,13 @@ void Rollout::onHandOverFailed(const QString &ctid, const QString &reason) {
 
 /// The figures are followed in a stopped rollout too: its devices are at work all the same.
 void Rollout::follow() {
-    const bool isUploading = state() == State::FirstWave || state() == State::SecondWave;
     const TaskListPtr tasks = m_surroundings.tasks();
     const TaskRecordPtr task = tasks->find(m_progress.wave.tid);
     const bool isGone = isTaskGone(tasks, task);
     if (task && task != m_counted)
         count(*task);
     m_counted = task;
-    if (!isUploading)
+    if (!isUploading())
         return;
     if (task && task->isFinal())
         return onWaveEnded(*task);
@@ -149,6 +187,7 @@ void Rollout::judgeFirstWave() {
     if (failed * 100 > qint64{m_plan->mostFailedPercent} * m_plan->firstWave().size())
         return halt(Reason::TooManyFailed);
     m_progress.waitUntil = m_surroundings.now() + m_plan->waitMinutes * minuteMs;
+    m_waitEnd = m_surroundings.steady() + m_plan->waitMinutes * minuteMs;
     setState(State::Waiting);
     advance();
 }
@@ -177,7 +216,21 @@ void Rollout::goOn() {
         setState(stoppedIn);
         return advance();
     }
+    if (reason == Reason::TaskGone)
+        return leaveWave(stoppedIn);
     repeatWave(stoppedIn);
+}
+
+/// Nobody can tell any more whom the wave has reached, so it is not sent again.
+void Rollout::leaveWave(State wave) {
+    if (wave == State::FirstWave && !m_plan->rest().isEmpty())
+        return beginWave(State::SecondWave, m_plan->rest());
+    setState(State::Done);
+}
+
+bool Rollout::mayRepeatWave() const {
+    return isUploading() || (state() == State::Stopped && (m_progress.reason == Reason::Cancelled ||
+                                                           m_progress.reason == Reason::NotBegun));
 }
 
 void Rollout::repeatWave(State wave) {

@@ -29,8 +29,9 @@ public:
     /// One of the two uploads.
     struct Wave {
         QStringList deviceIds;
-        QString ctid; ///< of the record in the queue
-        QString tid;  ///< of the task on the service
+        QString ctid;            ///< of the record in the queue
+        QString tid;             ///< of the task on the service
+        QStringList earlierTids; ///< the tasks for the same devices that were in the list before it
         bool isSeen = false;
         qint64 scheduledAt = 0; ///< Unix ms, 0 where it does not wait for its time
         int done = 0;
@@ -49,11 +50,13 @@ public:
         Wave wave;           ///< the present one, or the last one
         int earlierDone = 0; ///< devices that waves before this one have brought to an end
         int earlierFailed = 0;
-        qint64 waitUntil = 0; ///< Unix ms
+        qint64 waitUntil =
+            0; ///< Unix ms, for the next run of the program: this one waits by its steady clock
     };
 
     struct Surroundings {
-        std::function<qint64()> now; ///< Unix ms
+        std::function<qint64()> now;    ///< Unix ms: for what is kept over a restart of the program
+        std::function<qint64()> steady; ///< ms that pass whatever is done to the machine's clock
         std::function<TaskListPtr()> tasks;
         /// actionTime: Unix ms as text, empty for now.
         std::function<void(Rollout &, const QStringList &deviceIds, const QString &actionTime)> upload;
@@ -73,8 +76,10 @@ public:
 
     void stop();
     /// Does not wait any longer, or goes on after a stop: with the wave that did not come to its end, else
-    /// with the next one.
+    /// with the next one. Devices that may have been reached are not sent the image again.
     void goOn();
+    /// True while it may send the present wave again: nobody else should then.
+    bool mayRepeatWave() const;
 
     bool canStop() const;
     bool canGoOn() const;
@@ -86,6 +91,8 @@ public:
     const RolloutPlanPtr &planPtr() const { return m_plan; }
     const Progress &progress() const { return m_progress; }
     State state() const { return m_progress.state; }
+    /// How long the wait between the waves still takes, in ms.
+    qint64 waitLeft() const;
 
 signals:
     /// It is in another state, or knows the task of its wave now: time to keep its progress.
@@ -100,7 +107,10 @@ private:
     void count(const TaskRecord &task);
     void onWaveEnded(const TaskRecord &task);
     void judgeFirstWave();
+    void leaveWave(State wave);
     void repeatWave(State wave);
+    bool isUploading() const;
+    QStringList tasksFor(const QStringList &deviceIds) const;
     void halt(Reason reason, const QString &text = {});
     void setState(State state);
 
@@ -109,5 +119,6 @@ private:
     Progress m_progress;
     TaskRecordPtr m_counted; ///< what the figures were taken from
     TaskListPtr m_followed;  ///< the last list that was looked at
+    qint64 m_waitEnd = 0;    ///< on the steady clock
     int m_lacking = 0;       ///< lists in a row without the wave's task
 };

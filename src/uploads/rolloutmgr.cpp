@@ -6,6 +6,7 @@
 #include "sessionevents.h"
 #include "storewriter.h"
 #include "taskinfopool.h"
+#include "taskrepeats.h"
 #include "tasktargets.h"
 #include "uploadtaskmgr.h"
 
@@ -16,6 +17,7 @@
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
+#include <chrono>
 
 namespace {
 
@@ -48,8 +50,16 @@ RolloutMgr::RolloutMgr() {
             each->onServiceTaskMade(ctid, tid);
     });
     connect(&uploads, &TaskQueue::handOverFailed, this, [this](const FailedHandOver &failure) {
-        for (Rollout *each : rollouts())
-            each->onHandOverFailed(failure.ctid, failure.reason);
+        // What may have begun shows in its task, which is followed.
+        for (Rollout *each : rollouts()) {
+            if (!failure.mayHaveBegun)
+                each->onHandOverFailed(failure.ctid, failure.reason);
+        }
+    });
+    TaskRepeats::instance().setGuard([this](const QString &tid) {
+        return std::any_of(m_rollouts.begin(), m_rollouts.end(), [&tid](const auto &each) {
+            return each->progress().wave.tid == tid && each->mayRepeatWave();
+        });
     });
 }
 
@@ -61,6 +71,10 @@ void RolloutMgr::start(RolloutPlan plan) {
 Rollout *RolloutMgr::add(RolloutPlanPtr plan) {
     Rollout::Surroundings surroundings;
     surroundings.now = [] { return QDateTime::currentMSecsSinceEpoch(); };
+    surroundings.steady = [] {
+        using namespace std::chrono;
+        return qint64{duration_cast<milliseconds>(steady_clock::now().time_since_epoch()).count()};
+    };
     surroundings.tasks = [] { return CTaskInfoPool::instance().taskList(); };
     surroundings.upload = &RolloutMgr::upload;
     m_rollouts.push_back(std::make_unique<Rollout>(std::move(plan), std::move(surroundings)));

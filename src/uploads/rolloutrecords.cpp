@@ -50,6 +50,7 @@ RolloutPlan planOf(const JSON &object) {
 JSON waveJson(const Rollout::Wave &wave) {
     return {{"devices", TaskTargets::ids(wave.deviceIds)},
             {"tid", wave.tid.toStdString()},
+            {"earlier_tids", TaskTargets::ids(wave.earlierTids)},
             {"seen", wave.isSeen},
             {"scheduled_at", wave.scheduledAt},
             {"done", wave.done},
@@ -60,6 +61,7 @@ Rollout::Wave waveOf(const JSON &object) {
     return {idsIn(object, "devices"),
             {},
             stringMember(object, "tid"),
+            object.contains("earlier_tids") ? idsIn(object, "earlier_tids") : QStringList(),
             object.at("seen").get<bool>(),
             object.at("scheduled_at").get<qint64>(),
             object.at("done").get<int>(),

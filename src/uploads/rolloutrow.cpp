@@ -5,7 +5,6 @@
 #include "rolloutmgr.h"
 #include "rollouttexts.h"
 
-#include <QDateTime>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QToolButton>
@@ -82,7 +81,7 @@ void RolloutRow::showStanding() {
     if (!m_rollout)
         return;
     m_icon->setPixmap(Icons::pixmap(iconOf(m_rollout->state()), iconSize, devicePixelRatioF()));
-    const QString standing = RolloutTexts::standing(*m_rollout, QDateTime::currentMSecsSinceEpoch());
+    const QString standing = RolloutTexts::standing(*m_rollout);
     m_standing->setText(standing);
     for (QToolButton *button : {m_goOn, m_stop, m_dismiss})
         button->setAccessibleDescription(standing);

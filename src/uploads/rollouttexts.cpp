@@ -4,8 +4,6 @@
 #include <QDateTime>
 #include <QLocale>
 
-#include <algorithm>
-
 namespace RolloutTexts {
 
 namespace {
@@ -40,9 +38,9 @@ QString waveText(Rollout::State state, const Rollout::Wave &wave) {
     return Texts::tr("%1: %2.").arg(waveName(state), figures(wave.finished(), wave.total(), wave.failed));
 }
 
-QString waitText(const Rollout &rollout, qint64 now) {
-    const qint64 left = std::max<qint64>(rollout.progress().waitUntil - now, 0);
-    return Texts::tr("Waiting %1 min.").arg(QLocale().toString((left + minuteMs - 1) / minuteMs));
+QString waitText(const Rollout &rollout) {
+    return Texts::tr("Waiting %1 min.")
+        .arg(QLocale().toString((rollout.waitLeft() + minuteMs - 1) / minuteMs));
 }
 
 QString reasonText(const Rollout &rollout) {
@@ -54,7 +52,8 @@ QString reasonText(const Rollout &rollout) {
     case Rollout::Reason::Cancelled:
         return Texts::tr("Stopped: the task of this wave was cancelled.");
     case Rollout::Reason::TaskGone:
-        return Texts::tr("Stopped: the task of this wave is no longer in the list.");
+        return Texts::tr(
+            "Stopped: the task of this wave is no longer in the list. The wave is not sent again.");
     case Rollout::Reason::NotBegun:
         return Texts::tr("Stopped: this wave did not begin. %1").arg(progress.reasonText);
     case Rollout::Reason::User:
@@ -75,12 +74,13 @@ QString doneText(const Rollout &rollout) {
     const Rollout::Progress &progress = rollout.progress();
     const int failed = progress.earlierFailed + progress.wave.failed;
     const int done = progress.earlierDone + progress.wave.done;
-    return Texts::tr("Finished: %1.").arg(figures(done + failed, done + failed, failed));
+    return Texts::tr("Finished: %1.")
+        .arg(figures(done + failed, static_cast<int>(rollout.plan().deviceIds.size()), failed));
 }
 
 } // namespace
 
-QString standing(const Rollout &rollout, qint64 now) {
+QString standing(const Rollout &rollout) {
     const Rollout::Progress &progress = rollout.progress();
     QStringList sentences;
     switch (progress.state) {
@@ -89,7 +89,7 @@ QString standing(const Rollout &rollout, qint64 now) {
         sentences = {waveText(progress.state, progress.wave)};
         break;
     case Rollout::State::Waiting:
-        sentences = {waveText(Rollout::State::FirstWave, progress.wave), waitText(rollout, now)};
+        sentences = {waveText(Rollout::State::FirstWave, progress.wave), waitText(rollout)};
         break;
     case Rollout::State::Stopped:
         sentences = {waveText(progress.stoppedIn, progress.wave), reasonText(rollout), restText(rollout)};

@@ -5,7 +5,7 @@
 /// Rollouts in words.
 namespace RolloutTexts {
 
-/// Where it stands, as whole sentences. now: Unix ms.
-QString standing(const Rollout &rollout, qint64 now);
+/// Where it stands, as whole sentences.
+QString standing(const Rollout &rollout);
 
 } // namespace RolloutTexts

@@ -11,6 +11,7 @@
 #include "storewriter.h"
 #include "taskinfopool.h"
 #include "taskstate.h"
+#include "tasktype.h"
 
 #include <QSignalSpy>
 #include <QTest>
@@ -39,7 +40,7 @@ RolloutPlan plan(int mostFailed = 20) {
 struct Bed {
     explicit Bed(const RolloutPlan &given = plan())
         : rollout(std::make_shared<const RolloutPlan>(given),
-                  {[this] { return now; }, [this] { return tasks; },
+                  {[this] { return now + clockStep; }, [this] { return now; }, [this] { return tasks; },
                    [this](Rollout &, const QStringList &ids, const QString &time) {
                        uploads.push_back({ids, time});
                    }}) {}
@@ -57,6 +58,7 @@ struct Bed {
     void list(const QString &tid, const QString &status, const QStringList &states, int firstDevice = 1) {
         auto task = std::make_shared<TaskRecord>();
         task->tid = tid;
+        task->type = TaskType::firmwareUpload;
         task->status = status;
         task->active = TaskState::isFinal(status) == false;
         for (const QString &state : states) {
@@ -68,7 +70,7 @@ struct Bed {
         tasks = std::make_shared<TaskList>(std::vector<TaskRecordPtr>{task});
         rollout.advance();
     }
-    QString text() const { return RolloutTexts::standing(rollout, now); }
+    QString text() const { return RolloutTexts::standing(rollout); }
 
     struct Upload {
         QStringList ids;
@@ -76,6 +78,7 @@ struct Bed {
         bool operator==(const Upload &) const = default;
     };
     qint64 now = 1'000'000;
+    qint64 clockStep = 0; ///< what somebody has done to the machine's clock
     TaskListPtr tasks = std::make_shared<TaskList>();
     std::vector<Upload> uploads;
     Rollout rollout;
@@ -119,6 +122,7 @@ void TestRollout::goesFromWaveToWave() {
     QCOMPARE(bed.text(), "First wave: 2 of 5 done, 1 failed.");
     bed.list("T1", "pTaskFailed", {done, failed, done, done, done});
     bed.now += 2 * minute - 1;
+    bed.clockStep = 1000 * minute;
     bed.rollout.advance();
     QCOMPARE(bed.text(), "First wave: 5 of 5 done, 1 failed. Waiting 29 min.");
     bed.now += 28 * minute;
@@ -171,7 +175,7 @@ void TestRollout::firstWaveIsJudged() {
 void TestRollout::repeatedRestIsJudgedWithItsWave() {
     Bed bed;
     bed.beginFirst();
-    bed.list("T1", "pTaskAborted", {done, done, done, done, busy});
+    bed.list("T1", "pTaskAborted", {done, done, done, done, "pTaskAborted"});
     bed.rollout.goOn();
     QCOMPARE(bed.uploads.back().ids, QStringList{"D5"});
     bed.sent("c2", "T2");
@@ -196,7 +200,7 @@ void TestRollout::goesOnAfterAStop_data() {
         rest.ids);
     row("cancelled",
         [](Bed &bed) {
-            bed.list("T1", "pTaskAborted", {done, failed, done, "pTaskAborted"});
+            bed.list("T1", "pTaskAborted", {done, failed, busy, "pTaskAborted"});
         },
         "was cancelled", {"D2", "D4", "D5"});
     row(
@@ -212,7 +216,7 @@ void TestRollout::goesOnAfterAStop_data() {
             QCOMPARE(bed.rollout.state(), State::FirstWave);
             bed.list("T7", "pTaskDone", {});
         },
-        "no longer in the list", first);
+        "no longer in the list. The wave is not sent again.", rest.ids);
 }
 
 void TestRollout::goesOnAfterAStop() {
@@ -240,7 +244,10 @@ void TestRollout::goesOnAfterAStop() {
         bed.sent("c3", "T3");
         bed.list("T3", "pTaskDone", QStringList(7, done));
     }
-    QVERIFY2(bed.text().startsWith("Finished: 7 of 7 done"), qUtf8Printable(bed.text()));
+    // Of a wave whose task is gone only what it told is known.
+    const bool isKnown = !told.startsWith("no longer");
+    QVERIFY2(bed.text().startsWith(isKnown ? "Finished: 7 of 7 done" : "Finished: 3 of 7 done"),
+             qUtf8Printable(bed.text()));
 }
 
 void TestRollout::stoppedByTheUser() {
@@ -274,6 +281,14 @@ void TestRollout::comesBackFromItsRecord() {
     later.now = waiting.now + 30 * minute;
     later.rollout.resume(kept[0].progress);
     QCOMPARE(later.uploads, std::vector<Bed::Upload>{rest});
+    // The program ended when the task was made and nobody had noted it.
+    Bed found(*kept[0].plan);
+    found.list("T2", "pTaskProcessing", {busy, busy}, 6);
+    found.rollout.resume(again(later).at(0).progress);
+    QCOMPARE(found.rollout.state(), State::SecondWave);
+    found.list("T2", "pTaskDone", {done, done}, 6);
+    QCOMPARE(found.rollout.state(), State::Done);
+    QVERIFY(found.uploads.empty());
     // Queued, and the queue went with the program.
     Bed lost(*kept[0].plan);
     lost.rollout.resume(again(later).at(0).progress);
