@@ -404,6 +404,31 @@
             <numerusform>%n Geräte haben geantwortet, die bereits verwaltet werden.</numerusform>
         </translation>
     </message>
+    <message>
+        <source>The device(s) found there are managed or listed already.</source>
+        <translation>Die dort gefundenen Geräte werden bereits verwaltet oder stehen schon in der Liste.</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) of the file are managed or listed already.</source>
+        <translation>
+            <numerusform>%n Gerät der Datei wird bereits verwaltet oder steht schon in der Liste.</numerusform>
+            <numerusform>%n Geräte der Datei werden bereits verwaltet oder stehen schon in der Liste.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) answered, which are managed already.</source>
+        <translation>
+            <numerusform>%n Gerät hat geantwortet, das bereits verwaltet wird.</numerusform>
+            <numerusform>%n Geräte haben geantwortet, die bereits verwaltet werden.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) were managed already and stay as they are.</source>
+        <translation>
+            <numerusform>%n Gerät war bereits verwaltet und bleibt, wie es ist.</numerusform>
+            <numerusform>%n Geräte waren bereits verwaltet und bleiben, wie sie sind.</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>AddDeviceManualDialog</name>
@@ -814,6 +839,10 @@
         <source>The debug information could not be saved in “%1”, which will be tried again. %2</source>
         <translation>Die Debug-Infos konnten nicht in „%1“ gespeichert werden; es wird erneut versucht. %2</translation>
     </message>
+    <message>
+        <source>There will be no debug information in “%1”: no device delivered any.</source>
+        <translation>In „%1“ wird es keine Debug-Infos geben: Kein Gerät hat welche geliefert.</translation>
+    </message>
 </context>
 <context>
     <name>CaFileField</name>
@@ -1175,6 +1204,10 @@
     <message>
         <source>The file holds neither a certificate nor a private key in PEM or DER form.</source>
         <translation>Die Datei enthält weder ein Zertifikat noch einen privaten Schlüssel im PEM- oder DER-Format.</translation>
+    </message>
+    <message>
+        <source>The private key in the file is larger than any in use, or made to take too long to open.</source>
+        <translation>Der private Schlüssel in der Datei ist größer als jeder gebräuchliche, oder sein Öffnen soll zu lange dauern.</translation>
     </message>
 </context>
 <context>
@@ -1547,6 +1580,10 @@
             <numerusform>Die Zeile hat %n Spalten statt %1.</numerusform>
         </translation>
     </message>
+    <message>
+        <source>The row has %1 column(s) in place of %2.</source>
+        <translation>Die Zeile hat %1 Spalte(n) statt %2.</translation>
+    </message>
 </context>
 <context>
     <name>DBusToasts</name>
@@ -1677,6 +1714,24 @@
             <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
         </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device record(s) could not be read.</source>
+        <translation>
+            <numerusform>%n Gerätedatensatz konnte nicht gelesen werden.</numerusform>
+            <numerusform>%n Gerätedatensätze konnten nicht gelesen werden.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <translation>
+            <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
+            <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>The server has ended the session.</source>
+        <translation>Der Server hat die Sitzung beendet.</translation>
     </message>
 </context>
 <context>
@@ -3046,6 +3101,13 @@
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
         </translation>
     </message>
+    <message numerus="yes">
+        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <translation>
+            <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
+            <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>QuickSetupDialog</name>
@@ -3465,6 +3527,17 @@
             <numerusform>%n Gerät wartet auf die zweite Welle.</numerusform>
             <numerusform>%n Geräte warten auf die zweite Welle.</numerusform>
         </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) wait for the second wave.</source>
+        <translation>
+            <numerusform>%n Gerät wartet auf die zweite Welle.</numerusform>
+            <numerusform>%n Geräte warten auf die zweite Welle.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Stopped: the task of this wave is no longer in the list. The wave is not sent again.</source>
+        <translation>Angehalten: Die Aufgabe dieser Welle steht nicht mehr in der Liste. Die Welle wird nicht noch einmal gesendet.</translation>
     </message>
 </context>
 <context>
@@ -4455,12 +4528,20 @@ Was mit Geräten getan wird, erscheint hier.</translation>
         <source>Retrying asks for the password or key again.</source>
         <translation>Beim Wiederholen wird erneut nach dem Passwort oder Schlüssel gefragt.</translation>
     </message>
+    <message>
+        <source>Its rollout or its repetition sees to the devices that failed.</source>
+        <translation>Um die Geräte, bei denen es fehlschlug, kümmert sich der Rollout oder die Wiederholung.</translation>
+    </message>
 </context>
 <context>
     <name>TaskQueue</name>
     <message>
         <source>Reason: %1.</source>
         <translation>Grund: %1.</translation>
+    </message>
+    <message>
+        <source>The server has ended the session.</source>
+        <translation>Der Server hat die Sitzung beendet.</translation>
     </message>
 </context>
 <context>
@@ -5373,6 +5454,38 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>Norvell Device Manager</source>
         <translation>Norvell Device Manager</translation>
+    </message>
+</context>
+<context>
+    <name>DevicePlacement</name>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
+    </message>
+</context>
+<context>
+    <name>FailedHandOver</name>
+    <message numerus="yes">
+        <source>%1 on %n device(s) did not begin. %2</source>
+        <translation>
+            <numerusform>„%1“ hat auf %n Gerät nicht begonnen. %2</numerusform>
+            <numerusform>„%1“ hat auf %n Geräten nicht begonnen. %2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 on %n device(s) may have begun. %2</source>
+        <translation>
+            <numerusform>„%1“ hat auf %n Gerät vielleicht begonnen. %2</numerusform>
+            <numerusform>„%1“ hat auf %n Geräten vielleicht begonnen. %2</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 Look at the devices before you try again.</source>
+        <translation>%1 Sehen Sie sich die Geräte an, bevor Sie es erneut versuchen.</translation>
+    </message>
+    <message>
+        <source>%1 Its task in the list tells whether it has.</source>
+        <translation>%1 Ob es so ist, zeigt die Aufgabe in der Liste.</translation>
     </message>
 </context>
 </TS>

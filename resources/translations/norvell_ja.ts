@@ -396,6 +396,28 @@
             <numerusform>%n 台のデバイスが応答しましたが、既に管理されています。</numerusform>
         </translation>
     </message>
+    <message>
+        <source>The device(s) found there are managed or listed already.</source>
+        <translation>見つかったデバイスは既に管理されているか、一覧にあります。</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) of the file are managed or listed already.</source>
+        <translation>
+            <numerusform>ファイルの %n 台のデバイスは既に管理されているか、一覧にあります。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) answered, which are managed already.</source>
+        <translation>
+            <numerusform>%n 台のデバイスが応答しましたが、既に管理されています。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) were managed already and stay as they are.</source>
+        <translation>
+            <numerusform>%n 台のデバイスはすでに管理されているため、そのままです。</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>AddDeviceManualDialog</name>
@@ -803,6 +825,10 @@
         <source>The debug information could not be saved in “%1”, which will be tried again. %2</source>
         <translation>「%1」にデバッグ情報を保存できませんでした。再試行します。%2</translation>
     </message>
+    <message>
+        <source>There will be no debug information in “%1”: no device delivered any.</source>
+        <translation>「%1」にデバッグ情報は保存されません。どのデバイスからも届きませんでした。</translation>
+    </message>
 </context>
 <context>
     <name>CaFileField</name>
@@ -1157,6 +1183,10 @@
     <message>
         <source>The file holds neither a certificate nor a private key in PEM or DER form.</source>
         <translation>ファイルに PEM または DER 形式の証明書も秘密鍵もありません。</translation>
+    </message>
+    <message>
+        <source>The private key in the file is larger than any in use, or made to take too long to open.</source>
+        <translation>ファイル内の秘密鍵は、通常使われるものより大きいか、開くのに時間がかかりすぎるように作られています。</translation>
     </message>
 </context>
 <context>
@@ -1525,6 +1555,10 @@
             <numerusform>行の列数が %1 ではなく %n です。</numerusform>
         </translation>
     </message>
+    <message>
+        <source>The row has %1 column(s) in place of %2.</source>
+        <translation>行の列数が %2 ではなく %1 です。</translation>
+    </message>
 </context>
 <context>
     <name>DBusToasts</name>
@@ -1648,6 +1682,22 @@
         <translation>
             <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
         </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device record(s) could not be read.</source>
+        <translation>
+            <numerusform>%n 件のデバイスレコードを読み取れませんでした。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <translation>
+            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>The server has ended the session.</source>
+        <translation>サーバーがセッションを終了しました。</translation>
     </message>
 </context>
 <context>
@@ -3003,6 +3053,12 @@
             <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
         </translation>
     </message>
+    <message numerus="yes">
+        <source>%n device(s) were left out: the server does not manage them any more.</source>
+        <translation>
+            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>QuickSetupDialog</name>
@@ -3416,6 +3472,16 @@
         <translation>
             <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
         </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n device(s) wait for the second wave.</source>
+        <translation>
+            <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Stopped: the task of this wave is no longer in the list. The wave is not sent again.</source>
+        <translation>停止: この段階のタスクは一覧にありません。この段階は再送信されません。</translation>
     </message>
 </context>
 <context>
@@ -4404,12 +4470,20 @@ What is done to devices shows here.</source>
         <source>Retrying asks for the password or key again.</source>
         <translation>再試行時にパスワードまたはキーの再入力が必要です。</translation>
     </message>
+    <message>
+        <source>Its rollout or its repetition sees to the devices that failed.</source>
+        <translation>失敗したデバイスは、ロールアウトまたは再実行で処理されます。</translation>
+    </message>
 </context>
 <context>
     <name>TaskQueue</name>
     <message>
         <source>Reason: %1.</source>
         <translation>理由: %1。</translation>
+    </message>
+    <message>
+        <source>The server has ended the session.</source>
+        <translation>サーバーがセッションを終了しました。</translation>
     </message>
 </context>
 <context>
@@ -5314,6 +5388,36 @@ What is done to devices shows here.</source>
     <message>
         <source>Norvell Device Manager</source>
         <translation>Norvell Device Manager</translation>
+    </message>
+</context>
+<context>
+    <name>DevicePlacement</name>
+    <message>
+        <source>The devices are not managed any more.</source>
+        <translation>デバイスは管理されなくなっています。</translation>
+    </message>
+</context>
+<context>
+    <name>FailedHandOver</name>
+    <message numerus="yes">
+        <source>%1 on %n device(s) did not begin. %2</source>
+        <translation>
+            <numerusform>%n 台のデバイスで「%1」を開始できませんでした。%2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 on %n device(s) may have begun. %2</source>
+        <translation>
+            <numerusform>%n 台のデバイスで「%1」が開始された可能性があります。%2</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 Look at the devices before you try again.</source>
+        <translation>%1 再試行する前にデバイスを確認してください。</translation>
+    </message>
+    <message>
+        <source>%1 Its task in the list tells whether it has.</source>
+        <translation>%1 開始されたかどうかは一覧のタスクで確認できます。</translation>
     </message>
 </context>
 </TS>

@@ -4,12 +4,14 @@
 #include "badgebutton.h"
 #include "confirmdialog.h"
 #include "devicewindow.h"
+#include "failedoperations.h"
 #include "icons.h"
 #include "logwindow.h"
 #include "postwork.h"
 #include "rolloutstrip.h"
 #include "settingwindow.h"
 #include "sidepanel.h"
+#include "transientmessage.h"
 #include "uploaddialogs.h"
 
 #include <QButtonGroup>
@@ -23,6 +25,8 @@
 #include <QToolButton>
 #include <QToolTip>
 #include <QVBoxLayout>
+
+#include <algorithm>
 
 namespace {
 constexpr int railWidth = 56;
@@ -71,6 +75,7 @@ MainWindow::MainWindow(QWidget *parent)
     connectPages();
     connectPanels();
     connectPostWork();
+    connectFailedOperations();
     new UploadDialogs(m_deviceWindow);
     m_deviceWindow->addStrip(new RolloutStrip(m_deviceWindow));
 }
@@ -188,6 +193,24 @@ void MainWindow::connectPostWork() {
     connect(&work, &CPostWork::exportFailed, m_deviceWindow, &DeviceWindow::showError);
 }
 
+/// The panel that tells of them is usually closed.
+void MainWindow::connectFailedOperations() {
+    const auto *operations = &FailedOperations::instance();
+    connect(operations, &FailedOperations::told, this, [this](const QString &message) {
+        if (isTaskPanelOpen())
+            return;
+        m_taskButton->setBadge(m_taskButton->badge() + 1);
+        TransientMessage::show(this, message, TransientMessage::Kind::Error);
+    });
+    connect(operations, &FailedOperations::changed, this, [this, operations] {
+        m_taskButton->setBadge(std::min(m_taskButton->badge(), operations->count()));
+    });
+}
+
+bool MainWindow::isTaskPanelOpen() const {
+    return m_sidePanel->isVisible() && m_sidePanel->current() == SidePanel::Panel::Tasks;
+}
+
 /// A button opens its panel, and closes it when it is the one that is open.
 void MainWindow::togglePanel(QToolButton *button) {
     const auto panel = button == m_alarmButton ? SidePanel::Panel::Alarms : SidePanel::Panel::Tasks;
@@ -201,6 +224,8 @@ void MainWindow::togglePanel(QToolButton *button) {
 void MainWindow::showPanelButtons() {
     const bool open = !m_sidePanel->isHidden();
     m_alarmButton->setChecked(open && m_sidePanel->current() == SidePanel::Panel::Alarms);
+    if (isTaskPanelOpen())
+        m_taskButton->setBadge(0);
     m_taskButton->setChecked(open && m_sidePanel->current() == SidePanel::Panel::Tasks);
 }
 

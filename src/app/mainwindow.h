@@ -47,6 +47,8 @@ private:
     void connectPages();
     void connectPanels();
     void connectPostWork();
+    void connectFailedOperations();
+    bool isTaskPanelOpen() const;
     void navigateTo(int page);
     void askToLeave(const std::function<void()> &discard);
     void showPage(int page);

@@ -50,6 +50,7 @@ unsigned quickSetup(TaskStep &step) {
     unsigned result = step.session.call([&](CApiClient &client) { return client.listSites(0, 1, answer); });
     if (result != ApiOk) {
         qWarning("HTTP API(listSites) failed!");
+        step.hasBegun = false;
         return result;
     }
     const JSON devices = TaskTargets::withTask(step.record.at("devices"), step.tid);

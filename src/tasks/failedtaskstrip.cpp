@@ -1,9 +1,7 @@
 #include "failedtaskstrip.h"
 
+#include "failedoperations.h"
 #include "icons.h"
-#include "taskinfopool.h"
-#include "taskqueue.h"
-#include "tasktype.h"
 
 #include <QGridLayout>
 #include <QHBoxLayout>
@@ -12,7 +10,11 @@
 #include <QToolButton>
 
 FailedTaskStrip::FailedTaskStrip(QWidget *parent)
-    : QFrame(parent), m_text(new QLabel(this)), m_count(new QLabel(this)) {
+    : QFrame(parent),
+      m_text(new QLabel(this)),
+      m_count(new QLabel(this)),
+      m_startAgain(makeButton("startAgainButton", tr("Start again"))),
+      m_dismiss(makeButton("dismissFailedTaskButton", tr("Dismiss"))) {
     setObjectName(QStringLiteral("failedTaskStrip"));
     auto *icon = new QLabel(this);
     icon->setPixmap(Icons::pixmap(QStringLiteral(":/images/icon_general_warning_solid.svg"), {16, 16},
@@ -25,8 +27,8 @@ FailedTaskStrip::FailedTaskStrip(QWidget *parent)
     m_count->setProperty("role", QStringLiteral("quiet"));
     auto *buttons = new QHBoxLayout;
     buttons->setSpacing(6);
-    buttons->addWidget(addButton("startAgainButton", tr("Start again"), &TaskQueue::startAgain));
-    buttons->addWidget(addButton("dismissFailedTaskButton", tr("Dismiss"), &TaskQueue::dismiss));
+    buttons->addWidget(m_startAgain);
+    buttons->addWidget(m_dismiss);
     buttons->addStretch();
     buttons->addWidget(m_count);
     auto *layout = new QGridLayout(this);
@@ -37,48 +39,30 @@ FailedTaskStrip::FailedTaskStrip(QWidget *parent)
     layout->addWidget(m_text, 0, 1);
     layout->addLayout(buttons, 1, 1);
     layout->setColumnStretch(1, 1);
-    connect(&CTaskInfoPool::instance(), &CTaskInfoPool::cleared, this, [this] {
-        m_entries.clear();
-        showFirst();
-    });
+    auto *operations = &FailedOperations::instance();
+    connect(m_startAgain, &QToolButton::clicked, operations, &FailedOperations::startFirstAgain);
+    connect(m_dismiss, &QToolButton::clicked, operations, &FailedOperations::dismissFirst);
+    connect(operations, &FailedOperations::changed, this, &FailedTaskStrip::showFirst);
     showFirst();
 }
 
-QToolButton *FailedTaskStrip::addButton(const char *name, const QString &text,
-                                        void (TaskQueue::*answer)(const QString &)) {
+QToolButton *FailedTaskStrip::makeButton(const char *name, const QString &text) {
     auto *button = new QToolButton(this);
     button->setObjectName(QLatin1String(name));
     button->setProperty("role", QStringLiteral("panel"));
     button->setText(text);
     button->setFocusPolicy(Qt::TabFocus);
-    connect(button, &QToolButton::clicked, this, [this, answer] {
-        if (m_entries.empty())
-            return;
-        const Entry answered = m_entries.front();
-        m_entries.pop_front();
-        showFirst();
-        if (answered.queue)
-            (answered.queue->*answer)(answered.failure.ctid);
-    });
     return button;
 }
 
-void FailedTaskStrip::follow(TaskQueue *queue) {
-    connect(queue, &TaskQueue::handOverFailed, this, [this, queue](const FailedHandOver &failure) {
-        if (failure.isFollowed)
-            return;
-        m_entries.push_back({queue, failure});
-        showFirst();
-    });
-}
-
 void FailedTaskStrip::showFirst() {
-    setVisible(!m_entries.empty());
-    if (m_entries.empty())
+    const FailedOperations &operations = FailedOperations::instance();
+    const FailedOperations::Entry *first = operations.first();
+    setVisible(first != nullptr);
+    if (!first)
         return;
-    const FailedHandOver &failure = m_entries.front().failure;
-    m_text->setText(tr("%1 on %n device(s) did not begin. %2", nullptr, failure.devices)
-                        .arg(TaskType::title(failure.serviceType), failure.reason));
-    m_count->setVisible(m_entries.size() > 1);
-    m_count->setText(tr("1 of %1").arg(QLocale().toString(static_cast<int>(m_entries.size()))));
+    m_text->setText(first->failure.text());
+    m_startAgain->setVisible(static_cast<bool>(first->startAgain));
+    m_count->setVisible(operations.count() > 1);
+    m_count->setText(tr("1 of %1").arg(QLocale().toString(operations.count())));
 }

@@ -10,6 +10,10 @@ namespace {
 constexpr const char *waiting = "init";
 /// The member with the session that a record belongs to.
 constexpr const char *sessionMember = "session";
+/// The members with the server and the account of that session.
+constexpr const char *addressMember = "session_address";
+constexpr const char *portMember = "session_port";
+constexpr const char *accountMember = "session_account";
 constexpr const char *secretMember = "pass";
 
 std::string newId(const char *prefix) {
@@ -32,13 +36,17 @@ QueuedRecords::QueuedRecords() = default;
 
 QueuedRecords::~QueuedRecords() = default;
 
-std::string QueuedRecords::append(JSON record, const char *type, const char *idPrefix, quint64 session) {
+std::string QueuedRecords::append(JSON record, const char *type, const char *idPrefix,
+                                  const LoginInfo &login) {
     if (!record.is_object() || !record.emplace("state", waiting).first->is_string())
         return {};
     std::string id = newId(idPrefix);
     record["ctid"] = id;
     record["type"] = type;
-    record[sessionMember] = session;
+    record[sessionMember] = login.generation;
+    record[addressMember] = login.address.toStdString();
+    record[portMember] = login.port;
+    record[accountMember] = login.account.toStdString();
     const std::lock_guard lock(m_mutex);
     m_places.emplace(id, m_records.size());
     m_records.push_back(std::move(record));
@@ -112,4 +120,13 @@ JSON *QueuedRecords::recordOf(const std::string &ctid) {
 
 quint64 QueuedRecords::sessionOf(const JSON &record) {
     return record.at(sessionMember).get<quint64>();
+}
+
+LoginInfo QueuedRecords::loginOf(const JSON &record) {
+    LoginInfo login;
+    login.address = stringMember(record, addressMember);
+    login.port = record.at(portMember).get<quint32>();
+    login.account = stringMember(record, accountMember);
+    login.generation = sessionOf(record);
+    return login;
 }

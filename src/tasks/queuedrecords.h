@@ -1,6 +1,7 @@
 #pragma once
 
 #include "json.h"
+#include "localstore.h"
 
 #include <QtGlobal>
 
@@ -18,7 +19,7 @@ public:
     /// Appends a record as one that waits for its turn in the session, with an id that begins with the
     /// prefix, and returns the id. Empty, and nothing appended, for a record that would stop every walk: no
     /// object, or with a state that is no text.
-    std::string append(JSON record, const char *type, const char *idPrefix, quint64 session);
+    std::string append(JSON record, const char *type, const char *idPrefix, const LoginInfo &login);
 
     /// Copies the next record that waits, from the place on. False at the end, which counts as a whole walk;
     /// records that were appended meanwhile are reached. Throws for a record without type or state.
@@ -37,6 +38,8 @@ public:
     JSON find(const std::string &ctid) const;
 
     static quint64 sessionOf(const JSON &record);
+    /// The session that a record was inserted in, without its token.
+    static LoginInfo loginOf(const JSON &record);
 
 private:
     JSON *recordOf(const std::string &ctid);

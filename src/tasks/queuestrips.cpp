@@ -9,9 +9,6 @@
 #include <QVBoxLayout>
 
 QueueStrips::QueueStrips(QWidget *parent) : QWidget(parent) {
-    auto *failed = new FailedTaskStrip(this);
-    failed->follow(&UploadTaskMgr::instance());
-    failed->follow(&ExeTaskMgr::instance());
     for (const TaskQueue *queue : {static_cast<TaskQueue *>(&UploadTaskMgr::instance()),
                                    static_cast<TaskQueue *>(&ExeTaskMgr::instance())})
         connect(queue, &TaskQueue::devicesLeftOut, this, [this](const QString &, int count) {
@@ -22,6 +19,6 @@ QueueStrips::QueueStrips(QWidget *parent) : QWidget(parent) {
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(0);
-    layout->addWidget(failed);
+    layout->addWidget(new FailedTaskStrip(this));
     layout->addWidget(new TransferStrip(&UploadTaskMgr::instance(), this));
 }

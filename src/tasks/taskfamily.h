@@ -13,6 +13,7 @@ struct TaskStep {
     const JSON &record;
     std::shared_ptr<Transfer> transfer; ///< to be given to a call that sends files
     std::string tid = {};               ///< the service task's id; empty before it is made
+    bool hasBegun = true;               ///< false when the work ended before its own request was made
 
     /// The text of a member of the record; empty where there is none.
     std::string text(const char *member) const { return std::string(textMember(record, member)); }

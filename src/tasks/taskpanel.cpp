@@ -345,6 +345,9 @@ void TaskPanel::showActions() {
         showHint(tr("The tasks could not be read since %1.")
                      .arg(m_staleSince.toString(QStringLiteral("hh:mm:ss"))),
                  "warning");
+    else if (failures &&
+             any([](const TaskRecord &task) { return TaskRepeats::instance().isTaken(task.tid); }))
+        showHint(tr("Its rollout or its repetition sees to the devices that failed."));
     else if (failures && !repeatable)
         showHint(tr("This client cannot retry the task: it was started elsewhere or before the last log-in, "
                     "so its settings are not known here."));
@@ -396,9 +399,11 @@ void TaskPanel::cancelSelected() {
 void TaskPanel::retrySelected() {
     for (const TaskRecordPtr &task : selectedTasks()) {
         const TaskRepeats::Repeat *repeat = TaskRepeats::instance().find(task->tid);
-        if (repeat && hasFailures(*task))
-            repeat->again(failedDevices(*task));
+        // A copy: who does it again forgets the task.
+        if (const auto again = repeat && hasFailures(*task) ? repeat->again : nullptr)
+            again(failedDevices(*task));
     }
+    showActions();
 }
 
 void TaskPanel::removeSelected() {

@@ -1,10 +1,12 @@
 #include "taskqueue.h"
 
 #include "devicesleft.h"
+#include "failedoperations.h"
 #include "messagelog.h"
 #include "servicesession.h"
 #include "sessionevents.h"
 #include "taskinfopool.h"
+#include "taskmaker.h"
 #include "taskrepeats.h"
 #include "taskstate.h"
 #include "tasktargets.h"
@@ -77,6 +79,18 @@ QString reasonOf(unsigned result, const Transfer &transfer) {
     return !text.isEmpty() ? text : TaskQueue::tr("Reason: %1.").arg(apiResultText(result));
 }
 
+QString sessionEndedText() {
+    return TaskQueue::tr("The server has ended the session.");
+}
+
+FailedHandOver failureOf(const TaskFamily &family, const JSON &record) {
+    FailedHandOver failure;
+    failure.ctid = stringMember(record, "ctid");
+    failure.serviceType = QString::fromLatin1(family.serviceType);
+    failure.devices = static_cast<int>(record.at(family.targets).size());
+    return failure;
+}
+
 /// What is sent, for people.
 QString nameOf(const TaskFamily &family, const TaskStep &step) {
     return family.fileName ? stringMember(step.record, family.fileName)
@@ -88,7 +102,8 @@ QString nameOf(const TaskFamily &family, const TaskStep &step) {
 /// How a step ended.
 struct TaskQueue::Outcome {
     unsigned result = ApiException;
-    bool made = false; ///< there is a task on the service
+    bool made = false;       ///< there is a task on the service
+    bool unanswered = false; ///< the service may be at work under it all the same
 };
 
 TaskQueue::TaskQueue(std::span<const TaskFamily> families, const char *walkError)
@@ -120,8 +135,9 @@ const TaskFamily *TaskQueue::familyOf(std::string_view type) const {
 
 bool TaskQueue::insert(const char *type, JSON record, QString *ctid) {
     const TaskFamily *family = familyOf(type);
-    const std::string id =
-        family ? m_records.append(std::move(record), type, family->idPrefix, presentSession()) : "";
+    const std::string id = family ? m_records.append(std::move(record), type, family->idPrefix,
+                                                     CLocalStore::instance().loginInfo())
+                                  : "";
     if (id.empty()) {
         qWarning("Inserting new task with the invalid parameter.");
         return false;
@@ -164,7 +180,7 @@ void TaskQueue::runStep(const TaskFamily &family, JSON &record) {
     ServiceSession session(CLocalStore::instance().loginInfo());
     // Queued in a session that has ended: it must not run as somebody else, or on another server.
     if (QueuedRecords::sessionOf(record) != session.login().generation) {
-        setState(family, record, family.failureState());
+        leaveBehind(family, record);
         return complete(ApiInvalidArgument);
     }
     TaskStep step{session, record, std::make_shared<Transfer>()};
@@ -204,6 +220,7 @@ TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step, 
     });
     family.announce(step);
     result = family.work(step);
+    const bool unanswered = step.hasBegun && step.session.isUnanswered();
     if (result == ApiOk)
         logLine(QtDebugMsg, family.lines.success, result);
     else
@@ -211,19 +228,14 @@ TaskQueue::Outcome TaskQueue::perform(const TaskFamily &family, TaskStep &step, 
     // The service would wait for the rest of it until it gives up.
     if (result != ApiOk && step.transfer->isCancelled() && step.session.isPresent())
         CTaskInfoPool::instance().updateTaskState(step.session, tid, TaskState::aborted);
-    return {result, true};
+    return {result, true, unanswered};
 }
 
 /// Makes the record's task, if need be without the devices that the service has no more: these leave the
 /// record then.
 unsigned TaskQueue::makeTask(const TaskFamily &family, TaskStep &step, JSON &record) {
     const auto attempt = [&] {
-        const JSON devices = family.devices(record);
-        JSON task;
-        const unsigned result = step.session.call(
-            [&](CApiClient &client) { return client.newTaskState(family.serviceType, devices, task); });
-        step.tid = result == ApiOk ? textMember(task, "tid") : "";
-        return result == ApiOk && step.tid.empty() ? unsigned(ApiMissingData) : result;
+        return TaskMaker::make(step.session, family.serviceType, family.devices(record), step.tid);
     };
     unsigned result = attempt();
     if (result != ApiServerError)
@@ -250,15 +262,48 @@ void TaskQueue::finish(const TaskFamily &family, const TaskStep &step, const Out
         setState(family, step.record, family.successState());
     else if (outcome.made || over)
         setState(family, step.record, family.failureState());
-    if (outcome.result != ApiOk && !over && !step.transfer->isCancelled())
-        tell(step, [this, failure = FailedHandOver{stringMember(step.record, "ctid"),
-                                                   QString::fromLatin1(family.serviceType),
-                                                   static_cast<int>(step.record.at(family.targets).size()),
-                                                   reasonOf(outcome.result, *step.transfer)}]() mutable {
-            failure.isFollowed = m_followed.contains(failure.ctid);
-            emit handOverFailed(failure);
-        });
+    if (outcome.result != ApiOk && (over || !step.transfer->isCancelled())) {
+        FailedHandOver failure = failureOf(family, step.record);
+        failure.reason = over ? sessionEndedText() : reasonOf(outcome.result, *step.transfer);
+        failure.tid = QString::fromStdString(step.tid);
+        failure.mayHaveBegun = outcome.unanswered;
+        report(step.session.login(), std::move(failure));
+    }
     complete(outcome.result);
+}
+
+/// The record's operation ended with the session in which it was queued. Any thread.
+void TaskQueue::leaveBehind(const TaskFamily &family, const JSON &record) {
+    // The worker and the end of the session may both come to it.
+    if (!setState(family, record, family.failureState()))
+        return;
+    FailedHandOver failure = failureOf(family, record);
+    failure.reason = sessionEndedText();
+    report(QueuedRecords::loginOf(record), std::move(failure));
+}
+
+void TaskQueue::report(const LoginInfo &login, FailedHandOver failure) {
+    auto inOwnThread = [this, login, failure = std::move(failure)]() mutable {
+        failure.isFollowed = m_followed.contains(failure.ctid);
+        const bool isLost = SessionEvents::instance().wasLost(login.generation);
+        if (presentSession() == login.generation && !isLost)
+            emit handOverFailed(failure);
+        if (failure.isFollowed)
+            return;
+        const QPointer queue(this);
+        const QString ctid = failure.ctid;
+        FailedOperations::Entry entry{std::move(failure), {}, [queue, ctid] {
+                                          if (queue)
+                                              queue->dismiss(ctid);
+                                      }};
+        if (!entry.failure.mayHaveBegun)
+            entry.startAgain = [queue, ctid] {
+                if (queue)
+                    queue->startAgain(ctid);
+            };
+        FailedOperations::instance().report(login, std::move(entry));
+    };
+    QMetaObject::invokeMethod(this, std::move(inOwnThread), Qt::QueuedConnection);
 }
 
 void TaskQueue::complete(quint32 error) {
@@ -270,13 +315,14 @@ void TaskQueue::complete(quint32 error) {
         completion(context, error);
 }
 
-void TaskQueue::setState(const TaskFamily &family, const JSON &record, const char *state) {
+/// False when it is in that state already.
+bool TaskQueue::setState(const TaskFamily &family, const JSON &record, const char *state) {
     try {
         const auto ctid = record.at("ctid").get<std::string>();
         const bool isOver = state != std::string_view(family.workingState());
         if (!m_records.setState(ctid, state,
                                 isOver ? QueuedRecords::Secret::Wipe : QueuedRecords::Secret::Keep))
-            return;
+            return false;
         // A session that ends is what changes most records at once.
         QMetaObject::invokeMethod(
             this,
@@ -284,11 +330,13 @@ void TaskQueue::setState(const TaskFamily &family, const JSON &record, const cha
                 emit recordChanged(ctid, state);
             },
             Qt::QueuedConnection);
+        return true;
     } catch (const std::exception &error) {
         qWarning("%s%s", family.lines.update, error.what());
     } catch (...) {
         qWarning("%sUnknown exception", family.lines.update);
     }
+    return false;
 }
 
 QString TaskQueue::stateOf(const QString &ctid) const {
@@ -310,6 +358,9 @@ void TaskQueue::repeat(const QString &ctid, const QString &tid, const QStringLis
         return;
     if (family->asksAgain)
         return emit dialogNeeded(QString::fromLatin1(family->serviceType), deviceIds);
+    // From now on it is the new task that may be repeated.
+    TaskRepeats::instance().take(tid);
+    FailedOperations::instance().forget(tid);
     keepOnly(*family, record, deviceIds, macsOf(tid, deviceIds));
     insertAgain(*family, std::move(record));
 }
@@ -344,11 +395,10 @@ void TaskQueue::dismiss(const QString &ctid) {
 }
 
 void TaskQueue::onSessionEnded() {
-    m_followed.clear();
     cancelSending();
     for (const JSON &record : m_records.leaveBehind(presentSession())) {
         const TaskFamily *family = familyOf(textMember(record, "type"));
-        setState(*family, record, family->failureState());
+        leaveBehind(*family, record);
     }
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "failedhandover.h"
+#include "localstore.h"
 #include "nettask.h"
 #include "queuedrecords.h"
 #include "taskfamily.h"
@@ -103,7 +104,9 @@ private:
     void complete(quint32 error);
     void setSending(Sending sending);
     void cancelSending();
-    void setState(const TaskFamily &family, const JSON &record, const char *state);
+    void leaveBehind(const TaskFamily &family, const JSON &record);
+    void report(const LoginInfo &login, FailedHandOver failure);
+    bool setState(const TaskFamily &family, const JSON &record, const char *state);
     void rememberRepeat(const TaskFamily &family, const QString &ctid, const QString &tid);
     void repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds);
     void insertAgain(const TaskFamily &family, JSON record);

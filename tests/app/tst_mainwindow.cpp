@@ -1,7 +1,9 @@
 #include "apiclient.h"
+#include "badgebutton.h"
 #include "confirmdialog.h"
 #include "devicewindow.h"
 #include "emulatorprocess.h"
+#include "exetaskmgr.h"
 #include "form.h"
 #include "isolatedroot.h"
 #include "localstore.h"
@@ -9,6 +11,7 @@
 #include "mainwindow.h"
 #include "nettask.h"
 #include "settingwindow.h"
+#include "taskinfopool.h"
 
 #include <QLabel>
 #include <QSpinBox>
@@ -62,6 +65,21 @@ private slots:
         QTRY_COMPARE(Form::text(m_window->settingWindow(), "statusLabel"), QString());
         go("deviceButton");
         QVERIFY(m_window->deviceWindow()->isVisible());
+    }
+
+    void failedOperationIsToldWhileThePanelIsClosed() {
+        QVERIFY(m_service.command("fault code=3@/v1/task/init,times=2").startsWith("ok"));
+        QVERIFY(ExeTaskMgr::instance().insertNewAutoAssignIpTask({"DV1"}));
+        QVERIFY(ExeTaskMgr::instance().insertNewAutoAssignIpTask({"DV2"}));
+        auto *button = m_window->findChild<BadgeButton *>("taskButton");
+        QTRY_COMPARE_WITH_TIMEOUT(button->badge(), 2, patienceMs);
+        QVERIFY(Form::text(m_window.get(), "transientMessage").contains("did not begin"));
+        QTest::mouseClick(button, Qt::LeftButton);
+        QCOMPARE(button->badge(), 0);
+        QVERIFY(m_window->findChild<QWidget *>("failedTaskStrip")->isVisible());
+        QTest::mouseClick(button, Qt::LeftButton);
+        QCOMPARE(button->badge(), 0);
+        CTaskInfoPool::instance().clear();
     }
 
     void changesAreNotLeftUnasked_data() {

@@ -269,6 +269,13 @@ private slots:
         QVERIFY(!strip->isVisible());
         QTRY_COMPARE_WITH_TIMEOUT(m_service->sentTo("/v1/assip/auto").size(), 1u, 10000);
         QVERIFY(m_service->sentTo("/v1/export/debif").empty());
+
+        m_service->reply("/v1/assip/auto", ScriptedPeer::Reply{});
+        QVERIFY(manager.insertNewAutoAssignIpTask({"DV1"}));
+        QTRY_VERIFY_WITH_TIMEOUT(text->isVisible() && text->text().contains("may have begun"), 10000);
+        QVERIFY(!button("startAgainButton")->isVisible());
+        QTest::mouseClick(button("dismissFailedTaskButton"), Qt::LeftButton);
+        QVERIFY(!strip->isVisible());
     }
 
     void uploadIsShownAndCancelled() {

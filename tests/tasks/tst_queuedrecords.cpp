@@ -8,6 +8,16 @@
 #include <set>
 #include <thread>
 
+namespace {
+
+LoginInfo session(quint64 generation) {
+    LoginInfo login;
+    login.generation = generation;
+    return login;
+}
+
+} // namespace
+
 /// The list that windows insert into while a worker walks it.
 class TestQueuedRecords : public QObject {
     Q_OBJECT
@@ -37,7 +47,7 @@ private slots:
             threads.emplace_back([&, i] {
                 for (int n = 0; n < each; ++n) {
                     const std::string ctid =
-                        records.append({{"pass", "secret"}, {"n", n}}, "type", "id_", quint64(i));
+                        records.append({{"pass", "secret"}, {"n", n}}, "type", "id_", session(quint64(i)));
                     if (n % 100 == 0)
                         records.wipeSecret(ctid);
                     if (n % 1000 == 0)
@@ -56,9 +66,9 @@ private slots:
 
     void secretsOfOtherSessionsAreWiped() {
         QueuedRecords records;
-        const std::string left = records.append({{"pass", "a"}}, "type", "id_", 1);
-        const std::string atWork = records.append({{"pass", "b"}}, "type", "id_", 1);
-        const std::string present = records.append({{"pass", "c"}}, "type", "id_", 2);
+        const std::string left = records.append({{"pass", "a"}}, "type", "id_", session(1));
+        const std::string atWork = records.append({{"pass", "b"}}, "type", "id_", session(1));
+        const std::string present = records.append({{"pass", "c"}}, "type", "id_", session(2));
         QVERIFY(records.setState(atWork, "uploading", QueuedRecords::Secret::Keep));
         QVERIFY(!records.setState(atWork, "uploading", QueuedRecords::Secret::Keep));
         const std::vector<JSON> waiting = records.leaveBehind(2);

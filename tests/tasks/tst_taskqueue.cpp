@@ -1,3 +1,4 @@
+#include "failedoperations.h"
 #include "fakelists.h"
 #include "isolatedroot.h"
 #include "logcapture.h"
@@ -51,6 +52,7 @@ public:
 } // namespace
 
 Q_DECLARE_METATYPE(FailedHandOver)
+Q_DECLARE_METATYPE(ScriptedPeer::Reply)
 
 /// The queue of both task managers, with families of the test's own.
 class TestTaskQueue : public QObject {
@@ -284,6 +286,110 @@ private slots:
         QCOMPARE(failed.count(), 0);
     }
 
+    void unansweredWorkIsNotOfferedAgain_data() {
+        QTest::addColumn<ScriptedPeer::Reply>("reply");
+        QTest::addColumn<bool>("mayHaveBegun");
+        QTest::newRow("refused") << ScriptedPeer::json({{"code", 3}}) << false;
+        QTest::newRow("too large") << ScriptedPeer::Reply{ScriptedPeer::http(413, "")} << false;
+        QTest::newRow("answer lost") << ScriptedPeer::Reply{} << true;
+        QTest::newRow("answer cut") << ScriptedPeer::Reply{"HTTP/1.1 200 OK\r\nContent-Le",
+                                                           ScriptedPeer::End::Reset}
+                                    << true;
+        QTest::newRow("a page") << ScriptedPeer::Reply{ScriptedPeer::http(200, "<html>")} << true;
+    }
+    void unansweredWorkIsNotOfferedAgain() {
+        QFETCH(ScriptedPeer::Reply, reply);
+        QFETCH(bool, mayHaveBegun);
+        m_service->reply("/v1/cgi/custom", reply);
+        json task = taskFor("T1", "pTaskInitState");
+        m_service->setTaskMade(task);
+        m_service->setTasks({task});
+        work = [](TaskStep &step) {
+            return step.session.call([](CApiClient &client) {
+                return client.runCustomCgis(json::array({"/cgi-bin/x"}), json::array({"DV1"}));
+            });
+        };
+        m_queue->add();
+        m_queue->handlingTask();
+        FailedOperations &failures = FailedOperations::instance();
+        QTRY_COMPARE(failures.count(), 1);
+        QCOMPARE(failures.first()->failure.mayHaveBegun, mayHaveBegun);
+        QCOMPARE(failures.first()->failure.tid, "T1");
+        QCOMPARE(static_cast<bool>(failures.first()->startAgain), !mayHaveBegun);
+        QVERIFY(failures.first()->failure.text().contains(mayHaveBegun ? "may have begun" : "did not begin"));
+        QVERIFY(TaskRepeats::instance().find("T1"));
+        // The list tells by itself that it has begun.
+        task["status"] = "pTaskProcessing";
+        m_service->setTasks({task});
+        CTaskInfoPool::instance().loadTaskStatuses();
+        QTRY_COMPARE(CTaskInfoPool::instance().taskList()->find("T1")->status, "pTaskProcessing");
+        QCoreApplication::processEvents();
+        QCOMPARE(failures.count(), mayHaveBegun ? 0 : 1);
+        failures.startFirstAgain();
+        QVERIFY2(mayHaveBegun || !TaskRepeats::instance().find("T1"), "offered in one place only");
+    }
+
+    void taskOfALostAnswerIsLookedUp_data() {
+        QTest::addColumn<QString>("user");
+        QTest::addColumn<int>("works");
+        QTest::newRow("made") << "admin" << 1;
+        QTest::newRow("somebody else's") << "other" << 0;
+    }
+    void taskOfALostAnswerIsLookedUp() {
+        QFETCH(QString, user);
+        QFETCH(int, works);
+        CTaskInfoPool::instance().loadTaskStatuses();
+        QTRY_VERIFY(CTaskInfoPool::instance().isTaskListLoaded());
+        json task = taskFor("T7", "pTaskInitState");
+        task["user"] = user.toStdString();
+        m_service->setTasks({task});
+        m_service->reply("/v1/task/init", ScriptedPeer::Reply{});
+        std::vector<std::string> tids;
+        work = [&](TaskStep &step) { return tids.push_back(step.tid), unsigned(ApiOk); };
+        m_queue->add();
+        m_queue->handlingTask();
+        QCOMPARE(tids, std::vector<std::string>(works, "T7"));
+        QCOMPARE(m_service->sentTo("/v1/task/init").size(), 1u);
+        QTRY_COMPARE(FailedOperations::instance().count(), 1 - works);
+    }
+
+    void endOfTheSessionIsToldAtTheNextLogIn() {
+        m_service->refuse("/v1/task/init", 105);
+        FailedOperations &failures = FailedOperations::instance();
+        m_queue->add();
+        m_queue->add();
+        const QString followed = m_queue->add();
+        m_queue->setFollowed(followed, true);
+        m_queue->handlingTask();
+        const quint64 generation = CLocalStore::instance().loginInfo().generation;
+        QTRY_VERIFY(SessionEvents::instance().wasLost(generation));
+        const auto logInAs = [&](const char *account) {
+            CLocalStore::instance().clearLoginInfo();
+            CTaskInfoPool::instance().clear();
+            m_service->logIn();
+            const LoginInfo login = CLocalStore::instance().loginInfo();
+            CLocalStore::instance().setLoginInfo(login.address, login.port, account, login.token);
+            QSignalSpy listed(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated);
+            CTaskInfoPool::instance().loadTaskStatuses();
+            return listed.wait();
+        };
+        m_service->refuse("/v1/task/init", 0);
+        QVERIFY(logInAs("somebody"));
+        QCOMPARE(failures.count(), 0);
+        QVERIFY(logInAs("admin"));
+        QCOMPARE(failures.count(), 2);
+        QVERIFY(
+            failures.first()->failure.text().contains("did not begin. The server has ended the session."));
+        int worked = 0;
+        work = [&](TaskStep &) { return ++worked, unsigned(ApiOk); };
+        failures.startFirstAgain();
+        failures.dismissFirst();
+        m_queue->handlingTask();
+        QCOMPARE(worked, 1);
+        QVERIFY(logInAs("admin"));
+        QCOMPARE(failures.count(), 0);
+    }
+
     void lostSessionIsReported() {
         m_service->refuse("/v1/task/init", 105);
         QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
@@ -331,6 +437,12 @@ private slots:
     }
 
 private:
+    static json taskFor(const char *tid, const char *status) {
+        return {{"tid", tid},      {"type", "deviceRestart"},
+                {"user", "admin"}, {"status", status},
+                {"active", true},  {"devices", {{{"id", "DV1"}}, {{"id", "DV2"}}}}};
+    }
+
     IsolatedRoot m_root;
     std::unique_ptr<LogCapture> m_log;
     std::unique_ptr<FakeLists> m_service;

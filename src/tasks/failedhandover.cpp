@@ -1,0 +1,21 @@
+#include "failedhandover.h"
+
+#include "tasktype.h"
+
+#include <QCoreApplication>
+
+namespace {
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(FailedHandOver)
+};
+} // namespace
+
+QString FailedHandOver::text() const {
+    const QString name = title.isEmpty() ? TaskType::title(serviceType) : title;
+    if (!mayHaveBegun)
+        return Texts::tr("%1 on %n device(s) did not begin. %2", nullptr, devices).arg(name, reason);
+    const QString told =
+        Texts::tr("%1 on %n device(s) may have begun. %2", nullptr, devices).arg(name, reason);
+    return tid.isEmpty() ? Texts::tr("%1 Look at the devices before you try again.").arg(told)
+                         : Texts::tr("%1 Its task in the list tells whether it has.").arg(told);
+}
