@@ -5487,5 +5487,13 @@ Was mit Geräten getan wird, erscheint hier.</translation>
         <source>%1 Its task in the list tells whether it has.</source>
         <translation>%1 Ob es so ist, zeigt die Aufgabe in der Liste.</translation>
     </message>
+    <message>
+        <source>%1 did not begin. %2</source>
+        <translation>„%1“ hat nicht begonnen. %2</translation>
+    </message>
+    <message>
+        <source>%1 may have begun. %2</source>
+        <translation>„%1“ hat vielleicht begonnen. %2</translation>
+    </message>
 </context>
 </TS>

@@ -5419,5 +5419,13 @@ What is done to devices shows here.</source>
         <source>%1 Its task in the list tells whether it has.</source>
         <translation>%1 開始されたかどうかは一覧のタスクで確認できます。</translation>
     </message>
+    <message>
+        <source>%1 did not begin. %2</source>
+        <translation>「%1」は開始されませんでした。%2</translation>
+    </message>
+    <message>
+        <source>%1 may have begun. %2</source>
+        <translation>「%1」が開始された可能性があります。%2</translation>
+    </message>
 </context>
 </TS>

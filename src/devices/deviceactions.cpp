@@ -2,6 +2,7 @@
 
 #include "devicecommit.h"
 #include "deviceexport.h"
+#include "failedoperations.h"
 #include "jobendtext.h"
 #include "servicerequest.h"
 #include "taskrepeats.h"
@@ -83,9 +84,8 @@ QString failureText(const QString &name, const DeviceOperations::Outcome &outcom
     const QString reason = apiResultText(outcome.result);
     if (outcome.tid.isEmpty())
         return DeviceActions::tr("%1 could not be started: %2.").arg(name, reason);
-    if (outcome.result == ApiServerError)
+    if (!outcome.mayHaveBegun)
         return DeviceActions::tr("%1 failed: %2.").arg(name, reason);
-    // With its task made, only the answer may be lost.
     return DeviceActions::tr("%1 may have begun: %2. Look at its task before you try again.")
         .arg(name, reason);
 }
@@ -97,10 +97,33 @@ QString failureText(const QString &name, JobEnd end) {
     return text.arg(name, jobEndText(end));
 }
 
+/// Keeps for the next log-in what the service did not come to because it ended the session.
+void reportSessionEnd(const LoginInfo &login, const QString &name, qsizetype devices,
+                      const DeviceOperations::Outcome &outcome, std::function<void()> again) {
+    if (outcome.result == ApiOk)
+        return;
+    FailedHandOver failure;
+    failure.title = name;
+    failure.devices = static_cast<int>(devices);
+    failure.reason = DeviceActions::tr("The server has ended the session.");
+    failure.tid = outcome.tid;
+    failure.mayHaveBegun = outcome.mayHaveBegun;
+    if (failure.mayHaveBegun)
+        again = nullptr;
+    FailedOperations::instance().report(login, {failure, std::move(again), {}});
+}
+
+/// What an operation has come to by the time its session ends.
+std::shared_ptr<DeviceOperations::Outcome> notBegun() {
+    auto outcome = std::make_shared<DeviceOperations::Outcome>();
+    outcome->result = ApiInvalidArgument;
+    return outcome;
+}
+
 } // namespace
 
 void DeviceActions::restart(const QStringList &deviceIds) {
-    start({TaskType::title(TaskType::restart), deviceIds, &DeviceOperations::restart, {}});
+    start({TaskType::title(TaskType::restart), deviceIds, &DeviceOperations::restart, {}, {}});
 }
 
 void DeviceActions::restore(const QStringList &deviceIds, const DeviceOperations::RestoreOptions &options) {
@@ -109,16 +132,22 @@ void DeviceActions::restore(const QStringList &deviceIds, const DeviceOperations
            [options](ServiceSession &session, const QStringList &ids) {
                return DeviceOperations::restore(session, ids, options);
            },
+           {},
            {}});
 }
 
 void DeviceActions::changePassword(const QStringList &deviceIds, const QString &name,
                                    const QString &password) {
-    start({TaskType::title(TaskType::changePassword), deviceIds,
+    start({TaskType::title(TaskType::changePassword),
+           deviceIds,
            [name, password](ServiceSession &session, const QStringList &ids) {
                return DeviceOperations::changePassword(session, ids, name, password);
            },
-           [this](const QStringList &ids) { emit passwordWanted(ids); }});
+           [actions = QPointer(this)](const QStringList &ids) {
+               if (actions)
+                   emit actions->passwordWanted(ids);
+           },
+           {}});
 }
 
 void DeviceActions::setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy,
@@ -128,16 +157,18 @@ void DeviceActions::setPasswordPolicy(const QStringList &deviceIds, const Passwo
            [policy](ServiceSession &session, const QStringList &ids) {
                return DeviceOperations::setPasswordPolicy(session, ids, policy);
            },
+           {},
            {}},
           runner, begun);
 }
 
 void DeviceActions::authorize(const QStringList &deviceIds, const QString &name, const QString &password) {
     const QString title = tr("Authorize Device");
+    const auto known = notBegun();
     const bool started = ServiceRequest::post(
         NetJob::createRunner("authorizing devices"), this,
-        [deviceIds, name, password](ServiceSession &session) {
-            return DeviceOperations::authorize(session, deviceIds, name, password);
+        [deviceIds, name, password, known](ServiceSession &session) {
+            return *known = DeviceOperations::authorize(session, deviceIds, name, password);
         },
         [this, title, deviceIds](const DeviceOperations::Outcome &outcome) {
             const QString leftOut = leftOutText(outcome.vanished.size());
@@ -151,7 +182,10 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
                               leftOut}));
             tellAuthorized(asked, leftOut);
         },
-        [this, title](JobEnd end) {
+        [this, title, known, count = deviceIds.size(),
+         login = CLocalStore::instance().loginInfo()](JobEnd end) {
+            if (end == JobEnd::SessionGone)
+                reportSessionEnd(login, title, count, *known, {});
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
                 emit failed(failureText(title, end));
         });
@@ -250,9 +284,15 @@ DeviceActions::CommitResult DeviceActions::rebaseAndSend(ServiceSession &session
 
 void DeviceActions::commit(const QString &name, const QStringList &deviceIds,
                            std::function<Change(const JSON &)> change, std::function<void()> succeeded) {
+    const auto known = notBegun();
     const bool started = ServiceRequest::post(
         NetJob::createRunner(qUtf8Printable(name)), this,
-        [deviceIds, change](ServiceSession &session) { return rebaseAndSend(session, deviceIds, change); },
+        [deviceIds, change, known](ServiceSession &session) {
+            CommitResult result = rebaseAndSend(session, deviceIds, change);
+            known->result = result.code;
+            known->mayHaveBegun = result.isSent && session.isUnanswered();
+            return result;
+        },
         [this, name, succeeded](const CommitResult &result) {
             emit devicesChanged();
             // Only a refusal says for sure that nothing was done; an answer that is lost says nothing.
@@ -268,7 +308,9 @@ void DeviceActions::commit(const QString &name, const QStringList &deviceIds,
             if (succeeded)
                 succeeded();
         },
-        [this, name](JobEnd end) {
+        [this, name, known, login = CLocalStore::instance().loginInfo()](JobEnd end) {
+            if (end == JobEnd::SessionGone)
+                reportSessionEnd(login, name, 0, *known, {});
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
                 emit failed(failureText(name, end));
         });
@@ -301,14 +343,17 @@ void DeviceActions::start(const Errand &errand) {
 }
 
 void DeviceActions::start(const Errand &errand, NetTask *runner, const std::function<void()> &begun) {
+    const auto known = notBegun();
     const bool started = ServiceRequest::post(
         runner, this,
-        [operation = errand.operation, ids = errand.deviceIds](ServiceSession &session) {
-            return operation(session, ids);
+        [operation = errand.operation, ids = errand.deviceIds, known](ServiceSession &session) {
+            return *known = operation(session, ids);
         },
         [this, errand, begun](const DeviceOperations::Outcome &outcome) {
             if (!outcome.tid.isEmpty())
                 remember(outcome.tid, errand);
+            else if (!errand.repeatOf.isEmpty())
+                remember(errand.repeatOf, errand);
             const QString leftOut = leftOutText(outcome.vanished.size());
             if (outcome.result != ApiOk)
                 return emit failed(joined({failureText(errand.name, outcome), leftOut}));
@@ -317,23 +362,37 @@ void DeviceActions::start(const Errand &errand, NetTask *runner, const std::func
             if (begun)
                 begun();
         },
-        [this, name = errand.name](JobEnd end) {
+        [this, errand, known, login = CLocalStore::instance().loginInfo()](JobEnd end) {
+            if (end == JobEnd::SessionGone)
+                reportSessionEnd(login, errand.name, errand.deviceIds.size(), *known,
+                                 [again = againFor(errand), ids = errand.deviceIds] { again(ids, {}); });
+            if (end == JobEnd::NotRun && !errand.repeatOf.isEmpty())
+                remember(errand.repeatOf, errand);
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                emit failed(failureText(name, end));
+                emit failed(failureText(errand.name, end));
         });
     if (!started)
         emit failed(failureText(errand.name, JobEnd::NotRun));
 }
 
-void DeviceActions::remember(const QString &tid, const Errand &errand) {
-    const auto again = [actions = QPointer(this), name = errand.name, operation = errand.operation,
-                        other = errand.again](const QStringList &ids) {
-        if (!actions)
-            return;
-        if (other)
-            other(ids);
-        else
-            actions->start({name, ids, operation, {}});
+/// An operation with a password is not kept: its dialog asks for it again.
+DeviceActions::Again DeviceActions::againFor(const Errand &errand) {
+    if (errand.again)
+        return [other = errand.again](const QStringList &ids, const QString &) { other(ids); };
+    return [actions = QPointer(this), name = errand.name,
+            operation = errand.operation](const QStringList &ids, const QString &repeatOf) {
+        if (actions)
+            actions->start({name, ids, operation, {}, repeatOf});
     };
-    TaskRepeats::instance().remember(tid, {again, static_cast<bool>(errand.again)});
+}
+
+void DeviceActions::remember(const QString &tid, const Errand &errand) {
+    const bool needsDialog = static_cast<bool>(errand.again);
+    const auto again = [tid, needsDialog, again = againFor(errand)](const QStringList &ids) {
+        // The new task is the one to repeat from now on, unless it cannot be made.
+        if (!needsDialog)
+            TaskRepeats::instance().take(tid);
+        again(ids, tid);
+    };
+    TaskRepeats::instance().remember(tid, {again, needsDialog});
 }

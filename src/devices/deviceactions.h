@@ -64,7 +64,10 @@ private:
         Operation operation;
         /// Does the same for other devices, where the operation itself cannot be kept for that.
         std::function<void(const QStringList &deviceIds)> again;
+        QString repeatOf; ///< the task whose failed devices it is for; empty for none
     };
+    /// repeatOf: as above.
+    using Again = std::function<void(const QStringList &deviceIds, const QString &repeatOf)>;
 
     /// The records to commit, made on the runner from the present ones, and what to say when they are.
     struct Change;
@@ -76,6 +79,7 @@ private:
 
     void start(const Errand &errand);
     void start(const Errand &errand, NetTask *runner, const std::function<void()> &begun);
+    Again againFor(const Errand &errand);
     void remember(const QString &tid, const Errand &errand);
     /// leftOut: a sentence about the devices that were not asked; empty for none.
     void tellAuthorized(const QStringList &deviceIds, const QString &leftOut);

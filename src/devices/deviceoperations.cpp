@@ -6,6 +6,7 @@
 #include "pagereader.h"
 #include "servicesession.h"
 #include "taskinfopool.h"
+#include "taskmaker.h"
 #include "tasktype.h"
 
 #include <QDebug>
@@ -32,12 +33,10 @@ JSON idsOf(const QStringList &deviceIds) {
 
 /// Makes a task for the devices; the outcome's task is empty where the service made none.
 Outcome makeTask(ServiceSession &session, const QString &type, const QStringList &deviceIds) {
-    JSON task;
-    const unsigned result = ApiLog::logged("newTaskState", session.call([&](CApiClient &client) {
-        return client.newTaskState(type.toUtf8().constData(), idsOf(deviceIds), task);
-    }));
-    const QString tid = result == ApiOk ? stringMember(task, "tid") : QString();
-    return {result == ApiOk && tid.isEmpty() ? unsigned{ApiMissingData} : result, tid, {}};
+    std::string tid;
+    const unsigned result = ApiLog::logged(
+        "newTaskState", TaskMaker::make(session, type.toUtf8().constData(), idsOf(deviceIds), tid));
+    return {result, QString::fromStdString(tid), {}};
 }
 
 /// Does something for devices, and once more for the rest when the service refuses because some of them are
@@ -63,6 +62,7 @@ Outcome runUnderTask(ServiceSession &session, const QString &type, QStringList d
         return outcome;
     CTaskInfoPool::instance().fetchTaskStatuses(session);
     outcome.result = work(deviceIds, outcome.tid.toStdString());
+    outcome.mayHaveBegun = session.isUnanswered();
     return outcome;
 }
 
@@ -157,12 +157,12 @@ Outcome authorize(ServiceSession &session, const QStringList &deviceIds, const Q
            dumpOf(deviceIds).constData(), qUtf8Printable(name), MessageLog::secret(password).constData());
     QStringList ids = deviceIds;
     const Outcome outcome = withoutVanished(session, ids, [&] {
-        return Outcome{session.call([&](CApiClient &client) {
-                           return client.authDevices(idsOf(ids), name.toUtf8().constData(),
-                                                     password.toUtf8().constData());
-                       }),
-                       {},
-                       {}};
+        Outcome made;
+        made.result = session.call([&](CApiClient &client) {
+            return client.authDevices(idsOf(ids), name.toUtf8().constData(), password.toUtf8().constData());
+        });
+        made.mayHaveBegun = session.isUnanswered();
+        return made;
     });
     qDebug(outcome.result == ApiOk ? "http api(authDevices) successfully!" : "http api(authDevices) failed!");
     return outcome;

@@ -16,8 +16,9 @@ namespace DeviceOperations {
 /// How an operation began; how it goes on shows in its task.
 struct Outcome {
     unsigned result = ApiOk;
-    QString tid;          ///< the operation's task; empty where none could be made
-    QStringList vanished; ///< ids that the service does not know any more; the others went on
+    QString tid;               ///< the operation's task; empty where none could be made
+    QStringList vanished;      ///< ids that the service does not know any more; the others went on
+    bool mayHaveBegun = false; ///< it failed for want of an answer: the service may be at work all the same
 };
 
 /// Has the devices restart.

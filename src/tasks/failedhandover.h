@@ -7,7 +7,7 @@
 struct FailedHandOver {
     QString ctid; ///< of its record
     QString serviceType;
-    int devices = 0;
+    int devices = 0;           ///< 0 where their number is not told
     QString reason;            ///< a whole sentence
     bool isFollowed = false;   ///< whoever inserted the record sees to it
     QString tid;               ///< of its task on the service; empty where none was made

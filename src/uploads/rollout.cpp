@@ -53,10 +53,9 @@ void Rollout::resume(const Progress &progress) {
     m_progress = progress;
     if (isUploading() && m_progress.wave.tid.isEmpty()) {
         // The program may have ended before it noted the task that it had made.
-        for (const QString &tid : tasksFor(m_progress.wave.deviceIds)) {
-            if (!m_progress.wave.earlierTids.contains(tid))
-                m_progress.wave.tid = tid;
-        }
+        QStringList tids = tasksFor(m_progress.wave.deviceIds);
+        tids.removeIf([this](const QString &tid) { return m_progress.wave.earlierTids.contains(tid); });
+        m_progress.wave.tid = tids.value(0);
         // What the queue of that session held is gone with it.
         if (m_progress.wave.tid.isEmpty())
             return halt(Reason::NotBegun, tr("The session ended before it began."));

@@ -3,11 +3,13 @@
 #include "confirmdialog.h"
 #include "deviceoperations.h"
 #include "devicewindow.h"
+#include "failedoperations.h"
 #include "icons.h"
 #include "logcapture.h"
 #include "mainconsoletable.h"
 #include "passwordpolicydialog.h"
 #include "restoredevicedialog.h"
+#include "sessionevents.h"
 #include "setpassworddialog.h"
 #include "signedinservice.h"
 #include "targetlistdialog.h"
@@ -237,6 +239,34 @@ private slots:
         click("restartButton");
         visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
         QTRY_VERIFY_WITH_TIMEOUT(messageHas("Restart Device may have begun: "), patienceMs);
+        // One that is refused has not, and one whose task was made without an answer goes on under it.
+        m_service.tell("fault code=4@/v1/cgi/customx,times=1");
+        click("restartButton");
+        visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
+        QTRY_VERIFY_WITH_TIMEOUT(messageHas("Restart Device failed: "), patienceMs);
+        m_service.tell("fault reset@/v1/task/init,times=1");
+        const int before = tasksOf("deviceRestart");
+        click("restartButton");
+        visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
+        QTRY_VERIFY_WITH_TIMEOUT(ended("deviceRestart"), patienceMs);
+        QCOMPARE(tasksOf("deviceRestart"), before + 1);
+    }
+
+    void endOfTheSessionIsToldLater() {
+        m_service.tell("fault expire@/v1/task/init,times=1");
+        click("restartButton");
+        visible<ConfirmDialog>()->findChild<QPushButton *>("acceptButton")->click();
+        const LoginInfo login = CLocalStore::instance().loginInfo();
+        QTRY_VERIFY_WITH_TIMEOUT(SessionEvents::instance().wasLost(login.generation), patienceMs);
+        FailedOperations &failures = FailedOperations::instance();
+        QCOMPARE(failures.count(), 0);
+        CTaskInfoPool::instance().clear();
+        m_service.logIn();
+        CTaskInfoPool::instance().loadTaskStatuses();
+        QTRY_COMPARE_WITH_TIMEOUT(failures.count(), 1, patienceMs);
+        QVERIFY(failures.first()->failure.text().startsWith("Restart Device on "));
+        failures.startFirstAgain();
+        QTRY_VERIFY_WITH_TIMEOUT(ended("deviceRestart"), patienceMs);
     }
 
     void goesOnWithoutVanishedDevices() {
@@ -338,6 +368,11 @@ private:
                 return task->isFinal() ? task : nullptr;
         }
         return nullptr;
+    }
+    static int tasksOf(const QString &type) {
+        const auto &tasks = CTaskInfoPool::instance().taskList()->records();
+        return static_cast<int>(std::count_if(tasks.begin(), tasks.end(),
+                                              [&](const TaskRecordPtr &task) { return task->type == type; }));
     }
     static int countOfPolicies(int length, int rules) {
         JSON devices;
