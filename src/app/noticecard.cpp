@@ -15,7 +15,7 @@ namespace {
 
 constexpr int maxWidth = 760;
 constexpr int sideDistance = 24;
-constexpr int bottomDistance = 24;
+constexpr int bottomDistance = 56;
 constexpr QSize markSize{16, 16};
 
 } // namespace

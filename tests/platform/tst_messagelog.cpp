@@ -1,6 +1,7 @@
 #include "apppaths.h"
 #include "isolatedroot.h"
 #include "messagelog.h"
+#include "repeatedlines.h"
 #include "secondlife.h"
 
 #include <QCoreApplication>
@@ -116,6 +117,7 @@ private slots:
     void unusableFolder();
     void linesOfThreadsStayWhole();
     void repeatedLinesOfPollsAreCounted();
+    void countsEndWithTheirMinute();
     void dayHasABound();
     void oldFilesAreRemoved();
     void secretsAreMaskedOnDemand();
@@ -209,6 +211,26 @@ void TestMessageLog::repeatedLinesOfPollsAreCounted() {
     QCOMPARE(output.count("the same [repeated 499 times within a minute]\n"), 1);
     QCOMPARE(output.count("answer "), 5);
     QCOMPARE(logged().count("DEBUG: the same"), 3);
+}
+
+void TestMessageLog::countsEndWithTheirMinute() {
+    QByteArrayList written;
+    RepeatedLines lines([&](const RepeatedLines::Line &line) { written += line.text; });
+    const auto count = [&](const char *text, qint64 nowMs) {
+        return lines.count({QtDebugMsg, "main.cpp", 7, "start", text}, nowMs);
+    };
+    QVERIFY(!count("poll", 1000));
+    QVERIFY(count("poll", 2000) && count("poll", 60999));
+    QVERIFY(!count("other", 60999));
+    QCOMPARE(written, QByteArrayList());
+    QVERIFY(!count("poll", 61000));
+    QCOMPARE(written, QByteArrayList{"poll [repeated 2 times within a minute]"});
+    QVERIFY(count("other", 62000));
+    // A clock that was set back by an hour.
+    lines.writeEnded(62000 - 3600000);
+    QCOMPARE(written.mid(1), QByteArrayList{"other [repeated 1 times within a minute]"});
+    QVERIFY(!count(QByteArray(5000, 'x').constData(), 70000) &&
+            !count(QByteArray(5000, 'x').constData(), 70001));
 }
 
 void TestMessageLog::dayHasABound() {
