@@ -96,6 +96,26 @@ private slots:
         QCOMPARE(m_pool.taskList()->records().size(), 2u);
     }
 
+    /// An operation that waits may hold up all other requests: it does not wait for all pages of a poll.
+    void pollGivesUpForAFetch() {
+        ScriptedPeer::Reply slow = ScriptedPeer::sealed(tasks(300));
+        slow.pause = std::chrono::milliseconds(500);
+        m_service->reply("/v1/task/list", slow);
+        load();
+        QTRY_COMPARE(m_service->rawSentTo("/v1/task/list").size(), std::size_t(1));
+        QTest::qWait(50);
+        m_service->reply("/v1/task/list", ScriptedPeer::sealed(tasks(7)));
+        NetTask::runAndWait([&] {
+            ServiceSession session(CLocalStore::instance().loginInfo());
+            m_pool.fetchTaskStatuses(session);
+        });
+        QVERIFY(NetTask::waitForAll(5000));
+        const auto bodies = m_service->sentTo("/v1/task/list");
+        QCOMPARE(bodies.size(), std::size_t(2));
+        QVERIFY(bodies[1]["start"] == 0);
+        QCOMPARE(m_pool.taskList()->records().size(), std::size_t(7));
+    }
+
     void taskListOfAnEndedSessionIsNobodys() {
         m_service->setTasks(tasks(2));
         QSignalSpy updated(&m_pool, &CTaskInfoPool::taskListUpdated);
