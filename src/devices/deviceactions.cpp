@@ -308,9 +308,10 @@ void DeviceActions::commit(const QString &name, const QStringList &deviceIds,
             if (succeeded)
                 succeeded();
         },
-        [this, name, known, login = CLocalStore::instance().loginInfo()](JobEnd end) {
+        [this, name, known, count = deviceIds.size(),
+         login = CLocalStore::instance().loginInfo()](JobEnd end) {
             if (end == JobEnd::SessionGone)
-                reportSessionEnd(login, name, 0, *known, {});
+                reportSessionEnd(login, name, count, *known, {});
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
                 emit failed(failureText(name, end));
         });

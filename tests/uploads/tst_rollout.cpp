@@ -196,7 +196,7 @@ void TestRollout::goesOnAfterAStop_data() {
         [](Bed &bed) {
             bed.list("T1", "pTaskFailed", {failed, failed, done, done, done});
         },
-        "5 of 5 done, 2 failed. Stopped: more than 20 % of the first wave failed. 2 device(s) wait",
+        "5 of 5 done, 2 failed. Stopped: more than 20 % of the first wave failed. Waiting for the second",
         rest.ids);
     row("cancelled",
         [](Bed &bed) {
