@@ -22,6 +22,7 @@ private slots:
         m_tree = new SiteTree(m_frame.get());
         m_tree->resize(250, 500);
         m_frame->show();
+        m_frame->activateWindow();
         QVERIFY(QTest::qWaitForWindowActive(m_frame.get()));
         m_tree->setSites({{"SR1", Sites::rootId, "Campus", {}}});
         m_reconnecting = new ReconnectingDialog(m_frame.get());
@@ -73,7 +74,7 @@ private slots:
         press("disconnectButton");
         QCOMPARE(disconnects.size(), 1);
         QVERIFY(!m_reconnecting->geometry().intersects(question->geometry()));
-        QVERIFY(question->isActiveWindow());
+        QTRY_VERIFY(question->isActiveWindow());
         type("typed");
         QCOMPARE(question->findChild<QLineEdit *>()->text(), QStringLiteral("typed"));
         // It outlives the dialog that it stood on.

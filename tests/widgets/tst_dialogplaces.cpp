@@ -41,6 +41,7 @@ private slots:
         QWidget frame(nullptr, Qt::Window | Qt::FramelessWindowHint);
         frame.setGeometry(300, 200, 600, 400);
         frame.show();
+        frame.activateWindow();
         QVERIFY(QTest::qWaitForWindowActive(&frame));
         std::unique_ptr<SmallDialog> dialog;
         for (int opening = 0; opening < 20; ++opening) {
