@@ -39,7 +39,8 @@ void ReconnectingDialog::prepareToShow() {
     if (m_ownerWindow)
         m_ownerWindow->disconnect(this);
     m_ownerWindow = m_owner->windowHandle();
-    winId();
+    // Not winId(), which would make native windows of all the widgets beside this one.
+    create();
     windowHandle()->setTransientParent(m_ownerWindow);
     if (m_ownerWindow)
         connect(m_ownerWindow, &QWindow::visibleChanged, this, &ReconnectingDialog::followOwner,

@@ -38,6 +38,8 @@ private slots:
         QVERIFY(QTest::qWaitForWindowExposed(m_reconnecting));
         QTest::qWait(200);
         QVERIFY(m_frame->isActiveWindow());
+        // With a native window of its own, the tree would be painted no more.
+        QVERIFY(!m_tree->testAttribute(Qt::WA_NativeWindow));
         type(" numb");
         m_reconnecting->close();
         for (int opening = 0; opening < 5; ++opening) {
