@@ -2343,6 +2343,10 @@
         <source>The new key is not trusted. Nothing is sent to the server.</source>
         <translation>Dem neuen Schlüssel wird nicht vertraut. Es wird nichts an den Server gesendet.</translation>
     </message>
+    <message>
+        <source>You are logged in, but what you entered could not be saved for the next login. Look at whether the disk is full.</source>
+        <translation>Sie sind angemeldet, aber Ihre Eingaben konnten nicht für die nächste Anmeldung gespeichert werden. Prüfen Sie, ob der Datenträger voll ist.</translation>
+    </message>
 </context>
 <context>
     <name>InvalidDeviceDialog</name>
@@ -3643,6 +3647,10 @@
     <message>
         <source>Enter an address or a name, with a port from 1 to 65535 behind a colon if need be.</source>
         <translation>Eine Adresse oder einen Namen eingeben, bei Bedarf mit einem Port von 1 bis 65535 hinter einem Doppelpunkt.</translation>
+    </message>
+    <message>
+        <source>The password is kept only with “Remember Me”.</source>
+        <translation>Das Passwort wird nur mit „Zugangsdaten merken“ gespeichert.</translation>
     </message>
 </context>
 <context>
@@ -5447,6 +5455,10 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>Log in</source>
         <translation>Anmelden</translation>
+    </message>
+    <message>
+        <source>Checking the service on this computer...</source>
+        <translation>Der Dienst auf diesem Computer wird geprüft...</translation>
     </message>
 </context>
 <context>

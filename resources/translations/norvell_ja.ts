@@ -2304,6 +2304,10 @@
         <source>The new key is not trusted. Nothing is sent to the server.</source>
         <translation>新しい鍵は信頼されていません。サーバーには何も送信されません。</translation>
     </message>
+    <message>
+        <source>You are logged in, but what you entered could not be saved for the next login. Look at whether the disk is full.</source>
+        <translation>ログインしましたが、入力内容を次回のログイン用に保存できませんでした。ディスクの空き容量を確認してください。</translation>
+    </message>
 </context>
 <context>
     <name>InvalidDeviceDialog</name>
@@ -3587,6 +3591,10 @@
     <message>
         <source>Enter an address or a name, with a port from 1 to 65535 behind a colon if need be.</source>
         <translation>アドレスまたは名前を入力してください。必要に応じてコロンの後に 1～65535 のポートを付けてください。</translation>
+    </message>
+    <message>
+        <source>The password is kept only with “Remember Me”.</source>
+        <translation>パスワードは「ログイン情報を保存」を選択した場合のみ保存されます。</translation>
     </message>
 </context>
 <context>
@@ -5381,6 +5389,10 @@ What is done to devices shows here.</source>
     <message>
         <source>Log in</source>
         <translation>ログイン</translation>
+    </message>
+    <message>
+        <source>Checking the service on this computer...</source>
+        <translation>このコンピューターのサービスを確認しています...</translation>
     </message>
 </context>
 <context>

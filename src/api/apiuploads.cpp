@@ -5,6 +5,7 @@
 #include "clientstore.h"
 #include "downloadtarget.h"
 #include "httpexchange.h"
+#include "localstore.h"
 #include "multipartbody.h"
 #include "transfererror.h"
 
@@ -131,7 +132,9 @@ unsigned CApiClient::uploadConfigFile(const char *szTaskId, const char *szPath, 
 unsigned CApiClient::uploadFWFile(const char *szTaskId, const char *szPath, const char *szFileName) {
     if (isEmpty(szPath) || isEmpty(szFileName))
         return ApiInvalidArgument;
-    const bool isLocal = CClientStore::instance().isThisComputer();
+    // The flag alone may be that of an earlier login whose successor could not be written down.
+    const bool isLocal =
+        CClientStore::instance().isThisComputer() && CLocalStore::instance().loginInfo().thisComputer;
     Call call = uploadCall("uploadFWFile", isLocal ? "/v1/fwuplex" : "/v1/fwupl");
     call.logAnswer = [](const Call &, const HttpAnswer &answer) { logFirmwareAnswer(answer); };
     if (isLocal)

@@ -1,12 +1,14 @@
 #include "requestdeadline.h"
 
 #include "crashcatcher.h"
+#include "requestgroup.h"
 #include "socketlifeline.h"
 
 #include <algorithm>
 #include <condition_variable>
 #include <map>
 #include <mutex>
+#include <optional>
 #include <thread>
 
 namespace {
@@ -17,6 +19,7 @@ struct Watched {
     Clock::time_point end;
     SocketLifeline connection;
     bool over = false;
+    std::optional<RequestGroup> group;
 };
 
 /// The one watchdog thread. It is never joined with: the object lives until the process ends.
@@ -29,7 +32,12 @@ public:
 
     std::uint64_t add(Clock::time_point end) {
         const std::lock_guard lock(m_mutex);
-        m_watched.emplace(++m_lastId, Watched{m_cutAll ? Clock::now() : end, {}, m_cutAll});
+        Watched watched{end, {}, m_cutAll, {}};
+        if (const RequestGroup *group = RequestGroup::current()) {
+            watched.group = *group;
+            watched.over = watched.over || group->isCut();
+        }
+        m_watched.emplace(++m_lastId, std::move(watched));
         m_changed.notify_one();
         return m_lastId;
     }
@@ -61,6 +69,14 @@ public:
     bool isOver(std::uint64_t id) {
         const std::lock_guard lock(m_mutex);
         return m_watched.at(id).over;
+    }
+
+    void cut(const RequestGroup &group) {
+        const std::lock_guard lock(m_mutex);
+        for (auto &[id, watched] : m_watched) {
+            if (watched.group == group)
+                cut(watched);
+        }
     }
 
     void cutAll() {
@@ -132,6 +148,10 @@ void RequestDeadline::cut() {
 
 bool RequestDeadline::isOver() const {
     return Watchdog::instance().isOver(m_id);
+}
+
+void RequestDeadline::cut(const RequestGroup &group) {
+    Watchdog::instance().cut(group);
 }
 
 void RequestDeadline::cutAll() {

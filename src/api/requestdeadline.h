@@ -3,11 +3,14 @@
 #include <chrono>
 #include <cstdint>
 
+class RequestGroup;
+
 /// The time that one request may take: altogether, or for a transfer of files without progress.
 ///
 /// The transport's own time-outs are for each wait, so a peer that sends a byte now and then could hold a
 /// request for ever. A watchdog thread cuts the request's connection when its time is over; the request then
-/// returns with a transport error. Unless something else is said, used by the thread of the request.
+/// returns with a transport error. The same happens when the group is cut to which the thread's requests
+/// belong. Unless something else is said, used by the thread of the request.
 class RequestDeadline {
 public:
     explicit RequestDeadline(std::chrono::milliseconds time);
@@ -26,6 +29,9 @@ public:
 
     /// True when the connection has been cut.
     bool isOver() const;
+
+    /// Cuts the requests of a group that are under way; the group itself ends the later ones. Any thread.
+    static void cut(const RequestGroup &group);
 
     /// Cuts every request under way and every later one at once: the program is about to end. Any thread.
     static void cutAll();

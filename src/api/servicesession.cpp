@@ -5,6 +5,42 @@
 
 #include <QDebug>
 
+#include <mutex>
+
+namespace {
+
+/// The requests of the latest session that made any.
+class LatestRequests {
+public:
+    static LatestRequests &instance() {
+        static LatestRequests latest;
+        return latest;
+    }
+
+    /// A later session than the one before ends that one's requests; an earlier one has none any more.
+    RequestGroup of(quint64 generation) {
+        const std::lock_guard lock(m_mutex);
+        if (generation == m_generation)
+            return m_group;
+        if (generation > m_generation) {
+            m_group.cut();
+            m_generation = generation;
+            m_group = RequestGroup();
+            return m_group;
+        }
+        const RequestGroup ended;
+        ended.cut();
+        return ended;
+    }
+
+private:
+    std::mutex m_mutex;
+    quint64 m_generation = 0;
+    RequestGroup m_group;
+};
+
+} // namespace
+
 ServiceSession::ServiceSession(LoginInfo login) : m_login(std::move(login)) {}
 
 bool ServiceSession::isPresent() const {
@@ -33,6 +69,17 @@ unsigned ServiceSession::callWithSignIn(const std::function<unsigned(CApiClient 
     return m_lost || m_carried == carried ? result : send(endpoint);
 }
 
+RequestGroup ServiceSession::requests() const {
+    return LatestRequests::instance().of(m_login.generation);
+}
+
+void ServiceSession::end() {
+    CLocalStore &store = CLocalStore::instance();
+    store.clearLoginInfo();
+    // To be logged off is a generation of its own.
+    LatestRequests::instance().of(store.loginInfo().generation);
+}
+
 void ServiceSession::log(const LoginInfo &login) {
     qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
            static_cast<int>(login.port), qUtf8Printable(login.account),
@@ -51,6 +98,7 @@ unsigned ServiceSession::send(const std::function<unsigned(CApiClient &)> &endpo
     client.setAccessToken(present.token.constData());
     client.expectServerKey(present.serverKey);
     const std::string before = client.accessToken();
+    const RequestGroup::Scope scope(requests());
     const unsigned result = endpoint(client);
     if (result == ApiKeyChanged)
         SessionEvents::instance().reportKeyChanged(m_login.generation, client.serverKey());

@@ -2,6 +2,7 @@
 
 #include "apiclient.h"
 #include "localstore.h"
+#include "requestgroup.h"
 
 #include <functional>
 
@@ -30,6 +31,12 @@ public:
     bool isPresent() const;
 
     const LoginInfo &login() const { return m_login; }
+
+    /// The requests of this session; cut when it has ended.
+    RequestGroup requests() const;
+
+    /// Ends the stored session: its requests are cut, answers that are still on their way belong to nobody.
+    static void end();
 
     /// Writes the log line of a session that a request is about to use.
     static void log(const LoginInfo &login);

@@ -37,7 +37,7 @@ AccountSetupDialog::AccountSetupDialog(QWidget *parent)
     : FramelessDialog(parent),
       m_ui(formIn<Ui::AccountSetupDialog>(content())),
       m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
-      m_runner(new NetTask) {
+      m_runner(new NetTask(NetTask::Turn::Beside)) {
     setObjectName(QStringLiteral("AccountSetupDialog"));
     setWindowTitle(tr("Account setup"));
     connect(m_ui->nextButton, &QPushButton::clicked, this, &AccountSetupDialog::onNext);

@@ -160,7 +160,8 @@ void FramelessWindow::connectParts() {
     connect(m_startCheck, &StartCheck::accountSetupNeeded, this, &FramelessWindow::openAccountSetupDialog);
     connect(m_startCheck, &StartCheck::loginNeeded, this, &FramelessWindow::openLoginDialog);
     connect(m_startCheck, &StartCheck::keyChanged, this, &FramelessWindow::onLocalKeyChanged);
-    connect(m_welcome, &WelcomePage::loginRequested, this, &FramelessWindow::checkLoginDialog);
+    connect(m_startCheck, &StartCheck::runningChanged, m_welcome, &WelcomePage::setChecking);
+    connect(m_welcome, &WelcomePage::loginRequested, this, &FramelessWindow::onLoginRequested);
     connect(m_idle, &IdleWatch::idle, this, &FramelessWindow::logoutIfIdle);
     connect(&Notifier::instance(), &Notifier::notificationClicked, this,
             &FramelessWindow::onNotificationClicked);
@@ -196,6 +197,14 @@ void FramelessWindow::setContent(MainWindow *content) {
     connect(content->deviceWindow(), &DeviceWindow::remoteServerChosen, this,
             &FramelessWindow::onRemoteServerChosen);
     connect(content->deviceWindow(), &DeviceWindow::allTasksDone, this, &FramelessWindow::logoutIfIdle);
+    // The frame is shown before, and somebody may have been quicker to log in.
+    if (m_loggedIn)
+        startContent();
+}
+
+void FramelessWindow::startContent() {
+    m_stack->setCurrentWidget(m_content);
+    m_content->startWork();
 }
 
 /// What the last run has left to say comes before the login.
@@ -213,7 +222,17 @@ void FramelessWindow::begin() {
 
 void FramelessWindow::checkLoginDialog() {
     if (!m_dialog)
-        m_startCheck->start();
+        return m_startCheck->start();
+    m_dialog->raise();
+    m_dialog->activateWindow();
+}
+
+/// Somebody who asks a second time does not want to wait for what is being found out.
+void FramelessWindow::onLoginRequested() {
+    if (!m_startCheck->isRunning())
+        return checkLoginDialog();
+    m_startCheck->abandon();
+    openLoginDialog({});
 }
 
 void FramelessWindow::openLoginDialog(const QString &loginTip) {
@@ -222,6 +241,12 @@ void FramelessWindow::openLoginDialog(const QString &loginTip) {
     auto *dialog = new LoginDialog(loginTip, this);
     connect(dialog, &LoginDialog::loginSuccess, this, &FramelessWindow::onLoginSuccess);
     connect(dialog, &LoginDialog::serverKeyKept, this, &FramelessWindow::onServerKeyKept);
+    connect(dialog, &LoginDialog::notRemembered, this, [this] {
+        TransientMessage::show(this,
+                               tr("You are logged in, but what you entered could not be saved for the next "
+                                  "login. Look at whether the disk is full."),
+                               TransientMessage::Kind::Error);
+    });
     showDialog(dialog);
 }
 
@@ -250,10 +275,8 @@ void FramelessWindow::onLoginSuccess() {
     m_loggedIn = true;
     m_titleBar->accountButton()->show();
     m_titleBar->helpButton()->show();
-    if (m_content) {
-        m_stack->setCurrentWidget(m_content);
-        m_content->startWork();
-    }
+    if (m_content)
+        startContent();
     if (m_dialog)
         m_dialog->close();
     m_dialog = nullptr;
@@ -432,13 +455,14 @@ void FramelessWindow::endSession(Notice notice) {
         dialog->close();
     if (notice == Notice::TellService)
         tellLogOff();
-    CLocalStore::instance().clearLoginInfo();
+    ServiceSession::end();
     CTaskInfoPool::instance().clear();
     m_loggedIn = false;
     m_idle->stop();
     m_titleBar->accountButton()->hide();
     m_titleBar->helpButton()->hide();
-    m_titleBar->setServiceAdded(false);
+    m_serviceManagement->reset();
+    TransientMessage::clear(this);
     m_stack->setCurrentWidget(m_welcome);
     emit didLogOff();
 }
@@ -447,7 +471,7 @@ void FramelessWindow::tellLogOff() {
     // The stored session is cleared right after this, so the request takes its own copy along.
     const LoginInfo login = CLocalStore::instance().loginInfo();
     NetJob::post(
-        NetJob::createRunner("onLogOff() in FramelessWindow"), this,
+        NetJob::createRunner("onLogOff() in FramelessWindow", NetTask::Turn::Beside), this,
         [login] {
             ServiceSession::log(login);
             CApiClient client(login.address.toUtf8().constData(), login.port);

@@ -99,7 +99,9 @@ private:
     void onNotificationClicked(int type);
     void onRemoteServerChosen(const QString &serverId);
     void showDialog(FramelessDialog *dialog);
+    void startContent();
     void begin();
+    void onLoginRequested();
     void openGuide(const QWidget *place);
     Qt::Edges edgesAt(const QPoint &position) const;
 

@@ -38,7 +38,18 @@ struct LoginDialog::Outcome {
     QByteArray token;      ///< in cipher form
     std::string serverKey; ///< fingerprint that the server has shown
     bool isKeyNew = false; ///< it was not remembered before
+    bool thisComputer = false;
+    bool remembered = true;
 };
+
+namespace {
+
+QString offeredPassword(const JSON &server) {
+    return stringMember(server, "remember") == QLatin1String("YES") ? stringMember(server, "pass")
+                                                                    : QString();
+}
+
+} // namespace
 
 QString LoginDialog::unusableKeyText() {
     return tr("The key file %1 cannot be used. Correct or remove it, then try again.")
@@ -49,9 +60,8 @@ LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
     : FramelessDialog(parent),
       m_ui(formIn<Ui::LoginDialog>(content())),
       m_tip(m_ui->msgWarningIcon, m_ui->tipLabel),
-      m_runner(new NetTask),
-      m_servers(std::make_unique<JSON>(JSON::array())),
-      m_closed(std::make_shared<std::atomic_bool>(false)) {
+      m_runner(new NetTask(NetTask::Turn::Beside)),
+      m_servers(std::make_unique<JSON>(JSON::array())) {
     setObjectName(QStringLiteral("LoginDialog"));
     setWindowTitle(tr("Login"));
     m_ui->remoteComboBox->lineEdit()->setPlaceholderText(tr("IP:Port/Domain Name"));
@@ -60,6 +70,8 @@ LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
     connect(m_ui->loginButton, &QPushButton::clicked, this, &LoginDialog::on_loginButton_clicked);
     connect(m_ui->remoteComboBox, &QComboBox::currentIndexChanged, this,
             &LoginDialog::on_remoteComboBox_currentIndexChanged);
+    // An entry that is the current one already changes no index when it is chosen.
+    connect(m_ui->remoteComboBox, &QComboBox::activated, this, &LoginDialog::fillFrom);
     connect(m_ui->localRadio, &QRadioButton::toggled, this, &LoginDialog::showChosenFields);
     connect(m_ui->manageServersButton, &QToolButton::clicked, this, &LoginDialog::manageServers);
     connect(this, &LoginDialog::loginFail, this, [this](const QString &reason) { m_tip.setText(reason); });
@@ -69,7 +81,7 @@ LoginDialog::LoginDialog(const QString &tip, QWidget *parent)
 }
 
 LoginDialog::~LoginDialog() {
-    *m_closed = true;
+    m_requests.cut();
 }
 
 void LoginDialog::offerKnownAccounts() {
@@ -142,14 +154,13 @@ void LoginDialog::on_loginButton_clicked() {
 }
 
 void LoginDialog::startLogin(const Credentials &credentials) {
-    // Looked up before the job takes its turn: a slow name server must not hold up other requests.
     auto address = std::make_shared<QString>(QStringLiteral("127.0.0.1"));
     NetTask::Preparation lookUp;
     if (!credentials.thisComputer)
         lookUp = [address, server = credentials.server] { *address = server.resolved(); };
     const bool started = NetJob::post(
         m_runner.get(), this,
-        [credentials, address, closed = m_closed] { return logIn(credentials, *address, *closed); },
+        [credentials, address, requests = m_requests] { return logIn(credentials, *address, requests); },
         [this, credentials](const Outcome &outcome) { onOutcome(credentials, outcome); },
         [this](JobEnd end) {
             setBusy(false);
@@ -164,8 +175,12 @@ void LoginDialog::startLogin(const Credentials &credentials) {
 }
 
 LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QString &address,
-                                        const std::atomic_bool &closed) {
-    Outcome outcome{ApiException, address, credentials.server.port, credentials.account, {}, {}};
+                                        const RequestGroup &requests) {
+    Outcome outcome;
+    outcome.address = address;
+    outcome.port = credentials.server.port;
+    outcome.account = credentials.account;
+    outcome.thisComputer = credentials.thisComputer;
     if (credentials.thisComputer) {
         outcome.port = CConfigStore().serverPort();
         qDebug("get local server port: %d", static_cast<int>(outcome.port));
@@ -178,28 +193,35 @@ LoginDialog::Outcome LoginDialog::logIn(const Credentials &credentials, const QS
     }
     CApiClient client(address.toUtf8().constData(), outcome.port);
     client.expectServerKey(ServerKeys::instance().fingerprint(credentials.keyName()));
-    outcome.result = client.loginServer(credentials.account.toUtf8().constData(),
-                                        credentials.password.toUtf8().constData());
+    {
+        const RequestGroup::Scope scope(requests);
+        outcome.result = client.loginServer(credentials.account.toUtf8().constData(),
+                                            credentials.password.toUtf8().constData());
+    }
     outcome.serverKey = client.serverKey();
     if (outcome.result != ApiOk || client.accessToken().empty())
         return outcome;
     client.expectServerKey(outcome.serverKey);
-    if (closed) {
+    if (requests.isCut()) {
         // Nobody waits for this session any more, and the service counts it.
         client.logoutServer(client.accessToken().c_str());
         return outcome;
     }
     outcome.token = CLocalStore::instance().access();
     outcome.isKeyNew = ServerKeys::instance().keep(credentials.keyName(), outcome.serverKey);
+    outcome.remembered = remember(credentials);
+    return outcome;
+}
+
+/// Keeps for the next login what this one has shown to be right. False when not all of it could be written.
+bool LoginDialog::remember(const Credentials &credentials) {
     CClientStore &store = CClientStore::instance();
-    store.setThisComputer(credentials.thisComputer);
+    const bool kept = store.setThisComputer(credentials.thisComputer);
     const AccountInfo account{credentials.serverText, credentials.account,
                               store.isLoginRememberMe() ? credentials.password : QString()};
-    if (credentials.thisComputer)
-        store.setThisComputerAccount(account);
-    else
-        store.setRemoteComputerAccount(account);
-    return outcome;
+    return (credentials.thisComputer ? store.setThisComputerAccount(account)
+                                     : store.setRemoteComputerAccount(account)) &&
+           kept;
 }
 
 void LoginDialog::onOutcome(const Credentials &credentials, const Outcome &outcome) {
@@ -218,7 +240,8 @@ void LoginDialog::onOutcome(const Credentials &credentials, const Outcome &outco
                            : tr("Incorrect email or password. Try again."));
         return;
     }
-    CLocalStore::instance().setLoginInfo(outcome.address, outcome.port, outcome.account, outcome.token);
+    CLocalStore::instance().setLoginInfo(outcome.address, outcome.port, outcome.account, outcome.token,
+                                         outcome.thisComputer);
     qDebug("login successfully! ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(outcome.address),
            static_cast<int>(outcome.port), qUtf8Printable(outcome.account),
            MessageLog::secret(outcome.token).constData());
@@ -226,6 +249,8 @@ void LoginDialog::onOutcome(const Credentials &credentials, const Outcome &outco
     emit loginSuccess();
     if (outcome.isKeyNew)
         emit serverKeyKept(credentials.keyName());
+    if (!outcome.remembered)
+        emit notRemembered();
 }
 
 void LoginDialog::askAboutKey(const Credentials &credentials, const Outcome &outcome) {
@@ -247,12 +272,41 @@ void LoginDialog::setBusy(bool busy) {
 
 void LoginDialog::onUpdateSvr() {
     const QString typed = m_ui->remoteComboBox->currentText();
+    const JSON before = shownServer();
     CClientStore::instance().loadServerList(*m_servers);
     const QSignalBlocker blocker(m_ui->remoteComboBox);
     m_ui->remoteComboBox->clear();
     for (const JSON &server : *m_servers)
         m_ui->remoteComboBox->addItem(stringMember(server, "info"));
     showServer(typed);
+    for (const JSON &server : *m_servers) {
+        if (before.is_object() && stringMember(server, "id") == stringMember(before, "id"))
+            refill(before, server);
+    }
+}
+
+/// The saved server whose text the combo box shows, or null.
+JSON LoginDialog::shownServer() const {
+    const int index = m_ui->remoteComboBox->currentIndex();
+    if (index < 0 || static_cast<std::size_t>(index) >= m_servers->size())
+        return {};
+    const JSON &server = (*m_servers)[static_cast<std::size_t>(index)];
+    return stringMember(server, "info") == m_ui->remoteComboBox->currentText() ? server : JSON();
+}
+
+/// The server that is shown was edited: what the user has typed stays, the rest follows.
+void LoginDialog::refill(const JSON &before, const JSON &server) {
+    const auto changed = [&](const char *member) {
+        return stringMember(before, member) != stringMember(server, member);
+    };
+    if (changed("info"))
+        showServer(stringMember(server, "info"));
+    if (!changed("acc") && !changed("pass") && !changed("remember"))
+        return;
+    if (!m_ui->remoteEmailEdit->isModified())
+        m_ui->remoteEmailEdit->setText(stringMember(server, "acc"));
+    if (!m_ui->remotePassEdit->isModified())
+        m_ui->remotePassEdit->setText(offeredPassword(server));
 }
 
 /// Leaves the other fields as they are. An entry of that very text becomes the current one: the combo box
@@ -266,12 +320,15 @@ void LoginDialog::showServer(const QString &text) {
 
 void LoginDialog::on_remoteComboBox_currentIndexChanged(int index) {
     qDebug("LoginDialog::on_remoteComboBox_currentIndexChanged");
+    fillFrom(index);
+}
+
+void LoginDialog::fillFrom(int index) {
     if (index < 0 || static_cast<std::size_t>(index) >= m_servers->size())
         return;
     const JSON &server = (*m_servers)[static_cast<std::size_t>(index)];
     m_ui->remoteEmailEdit->setText(stringMember(server, "acc"));
-    m_ui->remotePassEdit->setText(
-        stringMember(server, "remember") == QLatin1String("YES") ? stringMember(server, "pass") : QString());
+    m_ui->remotePassEdit->setText(offeredPassword(server));
 }
 
 void LoginDialog::manageServers() {

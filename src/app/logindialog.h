@@ -3,10 +3,10 @@
 #include "framelessdialog.h"
 #include "json.h"
 #include "nettask.h"
+#include "requestgroup.h"
 #include "serveraddress.h"
 #include "warningline.h"
 
-#include <atomic>
 #include <memory>
 
 namespace Ui {
@@ -31,6 +31,8 @@ signals:
     void loginFail(const QString &reason);
     /// After the first login to a server, as ServerKeys names it: its key is remembered from now on.
     void serverKeyKept(const QString &server);
+    /// The session began, but what was entered could not be kept for the next login.
+    void notRemembered();
 
 public slots:
     void on_loginButton_clicked();
@@ -44,6 +46,9 @@ private:
 
     void offerKnownAccounts();
     void showServer(const QString &text);
+    void fillFrom(int index);
+    JSON shownServer() const;
+    void refill(const JSON &before, const JSON &server);
     void showChosenFields();
     void startLogin(const Credentials &credentials);
     void onOutcome(const Credentials &credentials, const Outcome &outcome);
@@ -53,12 +58,12 @@ private:
 
     static QString unusableKeyText();
     static Outcome logIn(const Credentials &credentials, const QString &address,
-                         const std::atomic_bool &closed);
+                         const RequestGroup &requests);
+    static bool remember(const Credentials &credentials);
 
     std::unique_ptr<Ui::LoginDialog> m_ui;
     WarningLine m_tip;
     NetTask::Owner m_runner;
     std::unique_ptr<JSON> m_servers;
-    /// Outlives the dialog with a login that is under way.
-    std::shared_ptr<std::atomic_bool> m_closed;
+    RequestGroup m_requests; ///< cut when the dialog goes: nobody waits for its login any more
 };

@@ -1,6 +1,5 @@
 #include "servicemanagement.h"
 
-#include "clientstore.h"
 #include "orbtexts.h"
 #include "servicemanagementaddservicedialog.h"
 #include "servicemanagementstatusdialog.h"
@@ -31,7 +30,9 @@ QWidget *ServiceManagement::frame() const {
 void ServiceManagement::validateOrbServiceAdded() {
     if (m_asking)
         return;
-    if (m_dialog && m_dialog->isVisible()) {
+    if (m_dialog && (m_dialog->isVisible() || m_dialog->isChanging())) {
+        if (!m_dialog->isVisible())
+            m_dialog->comeBack();
         m_dialog->raise();
         return m_dialog->activateWindow();
     }
@@ -40,7 +41,8 @@ void ServiceManagement::validateOrbServiceAdded() {
     const auto work = [](ServiceSession &session) {
         Answer answer;
         answer.result = askWhetherAdded(session, answer.added);
-        if (answer.result == ApiOk && CClientStore::instance().isThisComputer())
+        const RequestGroup::Scope scope(session.requests());
+        if (answer.result == ApiOk && session.login().thisComputer)
             answer.permission = permissionOnThisComputer(session.login().account);
         return answer;
     };
@@ -52,14 +54,26 @@ void ServiceManagement::validateOrbServiceAdded() {
             onAnswer(answer);
         },
         [this](JobEnd end) {
-            if (end == JobEnd::Delivered)
+            // A session that is over has taken its state along; another one may have begun to ask.
+            if (end == JobEnd::Delivered || end == JobEnd::SessionGone)
                 return;
             finishAsking();
-            if (end != JobEnd::SessionGone)
-                showError(OrbTexts::unknownError());
+            showError(OrbTexts::unknownError());
         });
     if (!started)
         finishAsking();
+}
+
+void ServiceManagement::reset() {
+    m_permission = AccountPermission::Unknown;
+    if (m_dialog) {
+        // It may be out of sight, waiting for a request that was cut.
+        m_dialog->deleteLater();
+        m_dialog = nullptr;
+    }
+    if (m_asking)
+        finishAsking();
+    emit serviceAdded(false);
 }
 
 void ServiceManagement::finishAsking() {
@@ -96,21 +110,18 @@ void ServiceManagement::lookUp() {
 
 void ServiceManagement::openAddDialog() {
     auto *dialog = new ServiceManagementAddServiceDialog(frame());
-    connect(dialog, &QDialog::accepted, this, [this] {
-        emit serviceAdded(true);
-        openStatusDialog();
-    });
+    connect(dialog, &QDialog::accepted, this, &ServiceManagement::openStatusDialog);
     open(dialog);
 }
 
 void ServiceManagement::openStatusDialog() {
     auto *dialog = new ServiceManagementStatusDialog(m_permission, frame());
-    connect(dialog, &ServiceManagementStatusDialog::statusChanged, this, &ServiceManagement::serviceAdded);
     connect(dialog, &QDialog::accepted, this, &ServiceManagement::openAddDialog);
     open(dialog);
 }
 
-void ServiceManagement::open(FramelessDialog *dialog) {
+void ServiceManagement::open(ServiceDialog *dialog) {
+    connect(dialog, &ServiceDialog::statusChanged, this, &ServiceManagement::serviceAdded);
     dialog->setAttribute(Qt::WA_DeleteOnClose);
     m_dialog = dialog;
     dialog->open();

@@ -5,7 +5,7 @@
 #include <QObject>
 #include <QPointer>
 
-class FramelessDialog;
+class ServiceDialog;
 
 /// Leads the user to the dialog about the remote-access service that fits: to link the service with it, or to
 /// look after the link.
@@ -22,6 +22,8 @@ public slots:
     void validateOrbServiceAdded();
     /// Asks as well, but only tells the answer.
     void lookUp();
+    /// The session is over, and what was asked on it.
+    void reset();
 
 signals:
     /// A transient message to be shown until connectToOrbFinished; 0 stands for the usual time and width.
@@ -38,11 +40,11 @@ private:
     void onAnswer(const Answer &answer);
     void openAddDialog();
     void openStatusDialog();
-    void open(FramelessDialog *dialog);
+    void open(ServiceDialog *dialog);
     void showError(const QString &text);
     QWidget *frame() const;
 
     bool m_asking = false;
     AccountPermission m_permission = AccountPermission::Unknown;
-    QPointer<FramelessDialog> m_dialog;
+    QPointer<ServiceDialog> m_dialog;
 };

@@ -12,6 +12,9 @@
 
 namespace {
 
+/// Somebody looks at the welcome page meanwhile.
+constexpr std::chrono::seconds memberListTime{10};
+
 struct LocalService {
     enum class State { Silent, Fresh, HasAccounts, OtherKey };
     State state = State::Silent;
@@ -44,6 +47,7 @@ LocalService askLocalService() {
     }
     qDebug("Local server online!");
     JSON members;
+    client.setTotalTimeout(memberListTime);
     const unsigned result = client.memberList(0, 10, members);
     if (result == ApiKeyChanged)
         return {LocalService::State::OtherKey, client.serverKey()};
@@ -57,21 +61,45 @@ LocalService askLocalService() {
 
 } // namespace
 
-StartCheck::StartCheck(QObject *parent) : QObject(parent), m_runner(new NetTask) {}
+StartCheck::StartCheck(QObject *parent) : QObject(parent) {}
 
 void StartCheck::start() {
-    if (!CLocalStore::instance().isLocalServiceInstalled()) {
-        emit loginNeeded(
-            tr("Norvell Device Manager Service Control is not installed on this computer. Please "
-               "connect to a remote server."));
+    if (m_running)
         return;
-    }
+    if (CLocalStore::instance().isLocalServiceInstalled())
+        return askService();
+    emit loginNeeded(tr("Norvell Device Manager Service Control is not installed on this computer. Please "
+                        "connect to a remote server."));
+}
+
+void StartCheck::abandon() {
+    m_requests.cut();
+    setRunning(false);
+}
+
+void StartCheck::setRunning(bool running) {
+    if (m_running == running)
+        return;
+    m_running = running;
+    emit runningChanged(running);
+}
+
+void StartCheck::askService() {
+    m_requests = RequestGroup();
+    setRunning(true);
     const QString silent =
         tr("Norvell Device Manager Service Control is not running on this computer. Please "
            "check the status of local server or connect to a remote server.");
-    NetJob::post(
-        m_runner.get(), this, askLocalService,
-        [this, silent](const LocalService &service) {
+    const bool started = NetJob::post(
+        NetJob::createRunner("checkLoginDialog in FramelessWindow", NetTask::Turn::Beside), this,
+        [requests = m_requests] {
+            const RequestGroup::Scope scope(requests);
+            return askLocalService();
+        },
+        [this, silent, requests = m_requests](const LocalService &service) {
+            if (requests.isCut())
+                return;
+            setRunning(false);
             if (service.state == LocalService::State::Fresh)
                 emit accountSetupNeeded();
             else if (service.state == LocalService::State::OtherKey)
@@ -79,8 +107,16 @@ void StartCheck::start() {
             else
                 emit loginNeeded(service.state == LocalService::State::Silent ? silent : QString());
         },
-        [this, silent](JobEnd end) {
-            if (end != JobEnd::Delivered)
-                emit loginNeeded(silent);
+        [this, requests = m_requests](JobEnd end) {
+            if (end != JobEnd::Delivered && !requests.isCut())
+                emitUnchecked();
         });
+    if (!started)
+        emitUnchecked();
+}
+
+/// Nothing is known of the service then, so nothing is said of it.
+void StartCheck::emitUnchecked() {
+    setRunning(false);
+    emit loginNeeded({});
 }

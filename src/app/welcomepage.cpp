@@ -1,13 +1,30 @@
 #include "welcomepage.h"
 
 #include "icons.h"
+#include "waitingspinner.h"
 
 #include <QCoreApplication>
+#include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
 #include <QVBoxLayout>
 
-WelcomePage::WelcomePage(QWidget *parent) : QWidget(parent) {
+namespace {
+
+/// A part that comes and goes without moving the others.
+void keepRoom(QWidget *part) {
+    QSizePolicy policy = part->sizePolicy();
+    policy.setRetainSizeWhenHidden(true);
+    part->setSizePolicy(policy);
+    part->hide();
+}
+
+} // namespace
+
+WelcomePage::WelcomePage(QWidget *parent)
+    : QWidget(parent),
+      m_spinner(new WaitingSpinner),
+      m_checking(new QLabel(tr("Checking the service on this computer..."))) {
     setObjectName(QStringLiteral("welcomePage"));
     setAttribute(Qt::WA_StyledBackground);
     auto *mark = new QLabel;
@@ -19,11 +36,27 @@ WelcomePage::WelcomePage(QWidget *parent) : QWidget(parent) {
     auto *login = new QPushButton(tr("Log in"));
     login->setObjectName(QStringLiteral("welcomeLoginButton"));
     connect(login, &QPushButton::clicked, this, &WelcomePage::loginRequested);
+    m_checking->setObjectName(QStringLiteral("welcomeCheckLabel"));
+    m_checking->setProperty("role", QStringLiteral("quiet"));
+    auto *checkLayout = new QHBoxLayout;
+    checkLayout->setSpacing(8);
+    checkLayout->addStretch();
+    checkLayout->addWidget(m_spinner);
+    checkLayout->addWidget(m_checking);
+    checkLayout->addStretch();
+    keepRoom(m_spinner);
+    keepRoom(m_checking);
     auto *layout = new QVBoxLayout(this);
     layout->setSpacing(16);
     layout->addStretch();
     layout->addWidget(mark);
     layout->addWidget(name);
     layout->addWidget(login, 0, Qt::AlignHCenter);
+    layout->addLayout(checkLayout);
     layout->addStretch();
+}
+
+void WelcomePage::setChecking(bool checking) {
+    m_spinner->setVisible(checking);
+    m_checking->setVisible(checking);
 }

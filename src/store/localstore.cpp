@@ -48,10 +48,10 @@ void CLocalStore::setLocalServiceInstalled(bool installed) {
 }
 
 void CLocalStore::setLoginInfo(const QString &address, quint32 port, const QString &account,
-                               const QByteArray &token) {
+                               const QByteArray &token, bool thisComputer) {
     qDebug("CLocalStore::setLoginInfo > strToken: %s", MessageLog::secret(token).constData());
     const std::lock_guard lock(m_mutex);
-    m_login = {address, port, account, token, m_login.generation + 1, {}, {}};
+    m_login = {address, port, account, token, thisComputer, m_login.generation + 1, {}, {}};
     m_access = token;
     m_spares.clear();
 }
@@ -78,7 +78,7 @@ LoginInfo CLocalStore::loginInfo() const {
 
 void CLocalStore::clearLoginInfo() {
     const std::lock_guard lock(m_mutex);
-    m_login = {{}, 0, {}, {}, m_login.generation + 1, {}, {}};
+    m_login = {{}, 0, {}, {}, false, m_login.generation + 1, {}, {}};
     m_access.clear();
     m_spares.clear();
 }

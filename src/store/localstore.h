@@ -13,7 +13,8 @@ struct LoginInfo {
     QString address;
     quint32 port = 0;
     QString account;
-    QByteArray token;       ///< the access token in cipher form
+    QByteArray token;          ///< the access token in cipher form
+    bool thisComputer = false; ///< the service runs on this computer and reads its files
     quint64 generation = 0; ///< raised by every log-in and log-off; tells an old session from the present one
     QString server;         ///< under which ServerKeys remembers the server
     std::string serverKey;  ///< fingerprint of the only key that the session's requests go to; empty for any
@@ -31,7 +32,8 @@ public:
     void setLocalServiceInstalled(bool installed);
 
     /// Begins a session; the token is in cipher form, as access() gives it.
-    void setLoginInfo(const QString &address, quint32 port, const QString &account, const QByteArray &token);
+    void setLoginInfo(const QString &address, quint32 port, const QString &account, const QByteArray &token,
+                      bool thisComputer = false);
     /// Names the server of the session and the key that it has shown at the log-in.
     void setServerKey(const QString &server, const std::string &fingerprint);
     /// Lets the session go on with another key, in the client store too, unless it was ended meanwhile.

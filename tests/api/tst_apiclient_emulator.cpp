@@ -225,6 +225,8 @@ void TestApiClientEmulator::uploads() {
              unsigned(ApiOk));
     for (const bool isHere : {false, true}) {
         QVERIFY(CClientStore::instance().setThisComputer(isHere));
+        const LoginInfo login = CLocalStore::instance().loginInfo();
+        CLocalStore::instance().setLoginInfo(login.address, login.port, login.account, login.token, isHere);
         QCOMPARE(client()->uploadFWFile(taskOf("deviceFWUpgrade").c_str(), path, "a.bin"), unsigned(ApiOk));
     }
     QCOMPARE(client()->exportFile(config.c_str(), m_root.filePath("a.zip").toUtf8()),

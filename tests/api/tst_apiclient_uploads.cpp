@@ -1,5 +1,6 @@
 #include "clientstore.h"
 #include "isolatedroot.h"
+#include "localstore.h"
 #include "logcapture.h"
 #include "scriptedpeer.h"
 #include "testsession.h"
@@ -155,6 +156,7 @@ void TestApiClientUploads::whatIsSent() {
 void TestApiClientUploads::imageOnThisComputer() {
     const LogCapture log;
     QVERIFY(CClientStore::instance().setThisComputer(true));
+    CLocalStore::instance().setLoginInfo("127.0.0.1", m_peer.port(), TestSession::account, "token", true);
     m_peer.answer({ScriptedPeer::http(200, R"({"code":3,"msg":"%s"})")});
     QCOMPARE(client()->uploadFWFile("T1", "/images/a b.bin", "a b.bin"), unsigned(ApiServerError));
     const ScriptedPeer::Request request = m_peer.takeRequests().at(0);

@@ -5,9 +5,15 @@
 #include "servicerequest.h"
 #include "testsession.h"
 
+#include <QElapsedTimer>
 #include <QSemaphore>
 #include <QSignalSpy>
 #include <QTest>
+
+#include <array>
+#include <netinet/in.h>
+#include <sys/socket.h>
+#include <unistd.h>
 
 namespace {
 
@@ -21,6 +27,36 @@ QString storedToken() {
     const std::string cipher = CLocalStore::instance().loginInfo().token.toStdString();
     return QString::fromStdString(Ciphers::openSecret(cipher).value_or(""));
 }
+
+/// A port where a connection is neither made nor refused: nobody takes those that fill its queue.
+class FullPort {
+public:
+    FullPort() {
+        sockaddr_in address{};
+        address.sin_family = AF_INET;
+        address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
+        socklen_t size = sizeof address;
+        auto *const raw = reinterpret_cast<sockaddr *>(&address);
+        const bool listens = ::bind(m_sockets[0], raw, size) == 0 && ::listen(m_sockets[0], 0) == 0 &&
+                             ::getsockname(m_sockets[0], raw, &size) == 0;
+        m_port = listens ? ntohs(address.sin_port) : 0;
+        for (std::size_t i = 1; i < m_sockets.size(); ++i)
+            (void)::connect(m_sockets[i], raw, size);
+    }
+    ~FullPort() {
+        for (const int socket : m_sockets)
+            ::close(socket);
+    }
+    FullPort(const FullPort &) = delete;
+    FullPort &operator=(const FullPort &) = delete;
+    std::uint32_t port() const { return m_port; }
+
+private:
+    static int made(int flags) { return ::socket(AF_INET, SOCK_STREAM | flags, 0); }
+
+    std::array<int, 3> m_sockets{made(0), made(SOCK_NONBLOCK), made(SOCK_NONBLOCK)};
+    std::uint32_t m_port = 0;
+};
 
 } // namespace
 
@@ -36,6 +72,8 @@ private slots:
     void answerAfterTheLogOff_data();
     void answerAfterTheLogOff();
     void nothingIsSentAfterTheLogOff();
+    void endOfTheSessionCutsItsRequests_data();
+    void endOfTheSessionCutsItsRequests();
     void lostSessionIsReportedOnce();
     void changedServerKeyIsAskedAboutOnce_data();
     void changedServerKeyIsAskedAboutOnce();
@@ -44,10 +82,10 @@ private slots:
     void failureIsAResult();
 
 private:
-    void logIn() {
+    void logIn(std::uint32_t port = 0) {
         const std::string cipher = Ciphers::sealSecret(TestSession::token).value_or("");
-        CLocalStore::instance().setLoginInfo("127.0.0.1", m_peer.port(), TestSession::account,
-                                             QByteArray::fromStdString(cipher));
+        CLocalStore::instance().setLoginInfo("127.0.0.1", port != 0 ? port : m_peer.port(),
+                                             TestSession::account, QByteArray::fromStdString(cipher));
     }
     bool post() {
         return ServiceRequest::post(
@@ -139,6 +177,43 @@ void TestServiceRequest::nothingIsSentAfterTheLogOff() {
     QTRY_COMPARE(m_ends, QList<JobEnd>{JobEnd::Delivered});
     QCOMPARE(m_results, QList<unsigned>{ApiInvalidArgument});
     QCOMPARE(m_peer.connections(), before);
+}
+
+void TestServiceRequest::endOfTheSessionCutsItsRequests_data() {
+    QTest::addColumn<ScriptedPeer::Greeting>("greeting");
+    QTest::addColumn<bool>("isFull");
+    QTest::newRow("no answer") << ScriptedPeer::Greeting::Handshake << false;
+    QTest::newRow("no handshake") << ScriptedPeer::Greeting::Silence << false;
+    QTest::newRow("no connection") << ScriptedPeer::Greeting::Handshake << true;
+}
+
+void TestServiceRequest::endOfTheSessionCutsItsRequests() {
+    QFETCH(ScriptedPeer::Greeting, greeting);
+    QFETCH(bool, isFull);
+    const FullPort full;
+    ScriptedPeer peer;
+    peer.greet(greeting);
+    peer.answer({"", ScriptedPeer::End::Hold});
+    logIn(isFull ? full.port() : peer.port());
+    QVERIFY(post() && post());
+    // Nothing of a session ends a login that is under way.
+    unsigned other = ApiOk;
+    auto *runner = NetJob::createRunner("test", NetTask::Turn::Beside);
+    const RequestGroup login;
+    const auto work = [&] {
+        const RequestGroup::Scope scope(login);
+        return CApiClient("127.0.0.1", peer.port()).loginServer("a", "b");
+    };
+    QVERIFY(NetJob::post(runner, this, work, [&](unsigned result) { other = result; }));
+    QTest::qWait(300);
+    QElapsedTimer clock;
+    clock.start();
+    ServiceSession::end();
+    QTRY_COMPARE(m_ends, QList<JobEnd>(2, JobEnd::SessionGone));
+    QVERIFY2(clock.elapsed() < 1000, "the end of the session was waited for");
+    QCOMPARE(other, unsigned(ApiOk));
+    login.cut();
+    QTRY_COMPARE_WITH_TIMEOUT(other, unsigned(ApiTransportError), 1000);
 }
 
 void TestServiceRequest::lostSessionIsReportedOnce() {

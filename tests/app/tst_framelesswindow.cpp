@@ -25,6 +25,7 @@
 #include "storewriter.h"
 #include "taskinfopool.h"
 #include "titlebar.h"
+#include "transientmessage.h"
 #include "welcomepage.h"
 
 #include <QClipboard>
@@ -241,6 +242,58 @@ private slots:
         emit m_window->findChild<DeviceWindow *>()->disconnectRequested();
         QVERIFY(!m_window->isLoggedIn());
         QCOMPARE(loggedOff.size(), 2);
+    }
+
+    void logOffPastAServiceThatHangs() {
+        logIn();
+        const auto message = [this] {
+            const auto *shown = m_window->findChild<TransientMessage *>();
+            return shown && shown->isVisible() ? shown->text() : QString();
+        };
+        QCOMPARE(m_service.command("fault no-answer@/v1/orb"), QStringLiteral("ok"));
+        titleBar()->serviceManagementAction()->trigger();
+        QCOMPARE(message(), QStringLiteral("connecting to ORB..."));
+        QTest::qWait(300);
+        QElapsedTimer clock;
+        clock.start();
+        titleBar()->logOffAction()->trigger();
+        QCOMPARE(message(), QString());
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "tipLabel"), QString());
+        QTRY_COMPARE_WITH_TIMEOUT(sessions(), 0, patienceMs);
+        QVERIFY2(clock.elapsed() < 8000, "the request that hangs was waited for");
+        QCOMPARE(m_service.command("faults clear"), QStringLiteral("ok"));
+        Form::type(Form::visible<LoginDialog>(), "localPassEdit", password);
+        Form::click(Form::visible<LoginDialog>(), "loginButton");
+        QTRY_COMPARE_WITH_TIMEOUT(shownRows(), 20, patienceMs);
+        titleBar()->serviceManagementAction()->trigger();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<ServiceManagementAddServiceDialog>(), patienceMs);
+    }
+
+    void checkThatHangsIsNotWaitedFor() {
+        QVERIFY(m_service.start({"--fresh", "--fault", "no-answer@/v1/accm/list"}));
+        openWindow();
+        auto *checking = Form::part(m_window.get(), "welcomeCheckLabel");
+        QTRY_VERIFY(checking->isVisible());
+        QTest::mouseClick(Form::part(m_window.get(), "welcomeLoginButton"), Qt::LeftButton);
+        QVERIFY(Form::visible<LoginDialog>());
+        QCOMPARE(Form::text(Form::visible<LoginDialog>(), "tipLabel"), QString());
+        QVERIFY(!checking->isVisible());
+        QVERIFY2(NetTask::waitForAll(2000), "the check goes on");
+    }
+
+    void loginBeforeTheContentIsThere() {
+        startService();
+        m_window = std::make_unique<FramelessWindow>();
+        m_window->show();
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<LoginDialog>(), patienceMs);
+        Form::type(Form::visible<LoginDialog>(), "localEmailEdit", email);
+        Form::type(Form::visible<LoginDialog>(), "localPassEdit", password);
+        Form::click(Form::visible<LoginDialog>(), "loginButton");
+        QTRY_VERIFY_WITH_TIMEOUT(m_window->isLoggedIn(), patienceMs);
+        m_window->setContent(new MainWindow);
+        QVERIFY(!showsWelcome());
+        QTRY_COMPARE_WITH_TIMEOUT(shownRows(), 20, patienceMs);
     }
 
     void accountMenuLeadsToItsDialogs() {

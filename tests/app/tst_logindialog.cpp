@@ -10,10 +10,13 @@
 #include "scriptedpeer.h"
 #include "serverkeydialog.h"
 
+#include <QAbstractItemView>
 #include <QComboBox>
+#include <QDir>
 #include <QFile>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QSemaphore>
 #include <QSignalSpy>
 
 #include <nlohmann/json.hpp>
@@ -178,6 +181,79 @@ private slots:
         QCOMPARE(Form::text(m_dialog.get(), "remotePassEdit"), QString());
         m_dialog->chooseServer("SVRnorth");
         QCOMPARE(combo->currentText(), QStringLiteral("north.example:443"));
+        // Chosen from the list again, it is filled in again.
+        Form::type(m_dialog.get(), "remoteEmailEdit", "you@north");
+        combo->showPopup();
+        QTest::keyClick(combo->view(), Qt::Key_Return);
+        QCOMPARE(Form::text(m_dialog.get(), "remoteEmailEdit"), QStringLiteral("me@north"));
+    }
+
+    void editedServerIsFilledInAgain_data() {
+        QTest::addColumn<QString>("typed");
+        QTest::addColumn<QStringList>("expected"); // server, email, password
+        const QString moved = QStringLiteral("north.example:444");
+        QTest::newRow("nothing typed") << "" << QStringList{moved, "new@north", "New1!"};
+        QTest::newRow("email typed") << "remoteEmailEdit" << QStringList{moved, "typed", "New1!"};
+        QTest::newRow("password typed") << "remotePassEdit" << QStringList{moved, "new@north", "typed"};
+    }
+    void editedServerIsFilledInAgain() {
+        QFETCH(QString, typed);
+        JSON servers = savedServers;
+        QVERIFY(CClientStore::instance().saveServerList(servers));
+        open();
+        m_dialog->chooseServer("SVRnorth");
+        if (!typed.isEmpty())
+            Form::type(m_dialog.get(), qPrintable(typed), "typed");
+        servers[0].update({{"info", "north.example:444"}, {"acc", "new@north"}, {"pass", "New1!"}});
+        QVERIFY(CClientStore::instance().saveServerList(servers));
+        m_dialog->onUpdateSvr();
+        const QStringList shown = {Form::part<QComboBox>(m_dialog.get(), "remoteComboBox")->currentText(),
+                                   Form::text(m_dialog.get(), "remoteEmailEdit"),
+                                   Form::text(m_dialog.get(), "remotePassEdit")};
+        QTEST(shown, "expected");
+    }
+
+    void loginWaitsForNoOtherRequest() {
+        QSemaphore hanging;
+        QSemaphore released;
+        NetTask other;
+        other.setUp(0, [&](quintptr) {
+            hanging.release();
+            released.acquire();
+        });
+        other.start();
+        QVERIFY(hanging.tryAcquire(1, patienceMs));
+        fillLocal(email, password);
+        Form::click(m_dialog.get(), "loginButton");
+        const bool loggedIn = QTest::qWaitFor([this] { return m_success->size() == 1; }, patienceMs);
+        released.release();
+        QVERIFY(loggedIn);
+        QVERIFY(CLocalStore::instance().loginInfo().thisComputer);
+    }
+
+    void closedDialogCutsItsLogin() {
+        ScriptedPeer peer;
+        peer.answer({"", ScriptedPeer::End::Hold});
+        fillRemote("127.0.0.1:" + QString::number(peer.port()));
+        Form::click(m_dialog.get(), "loginButton");
+        QTRY_COMPARE(peer.connections(), 1);
+        m_success.reset();
+        m_dialog.reset();
+        QVERIFY(NetTask::waitForAll(1000));
+    }
+
+    void loginThatCannotBeKeptIsTold() {
+        QSignalSpy told(m_dialog.get(), &LoginDialog::notRemembered);
+        const QString file = m_root.filePath("nvldmgr.sdb");
+        QVERIFY(CClientStore::instance().setThisComputer(true));
+        QVERIFY(QFile::rename(file, file + ".kept") && QDir().mkpath(file));
+        fillRemote("127.0.0.1:" + QString::number(m_service.port()));
+        Form::click(m_dialog.get(), "loginButton");
+        QTRY_COMPARE_WITH_TIMEOUT(m_success->size(), 1, patienceMs);
+        QVERIFY(QDir().rmdir(file) && QFile::rename(file + ".kept", file));
+        QCOMPARE(told.size(), 1);
+        QVERIFY(CClientStore::instance().isThisComputer());
+        QVERIFY2(!CLocalStore::instance().loginInfo().thisComputer, "a file here would be named to a server");
     }
 
     void savedListIsReadAgain() {

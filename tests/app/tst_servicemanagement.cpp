@@ -72,7 +72,6 @@ private slots:
     void initTestCase() {
         QVERIFY(m_service.start(
             {"--account", "boss@x:" + password, "--account", "op@x:" + password + ":operator"}));
-        CClientStore::instance().setThisComputer(true);
     }
 
     void init() {
@@ -350,6 +349,45 @@ private slots:
         openAddDialog();
     }
 
+    void closedWhileAChangeIsUnderWay_data() {
+        rows({{"linked", "fault late=700@/v1/orb/add_service", "Applying...", "Applied successfully"},
+              {"not linked", "fault reset@/v1/orb/add_service", "Applying...", unable},
+              {"unlinked", "fault late=700@/v1/orb/logout_service", "Disconnecting...",
+               "Disconnected successfully!"}});
+    }
+    void closedWhileAChangeIsUnderWay() {
+        QFETCH(QStringList, texts);
+        const bool unlinks = texts[1] == "Disconnecting...";
+        QSignalSpy added(m_management, &ServiceManagement::serviceAdded);
+        ServiceDialog *dialog = unlinks ? static_cast<ServiceDialog *>(openStatusDialog()) : openAddDialog();
+        tell(texts[0] + ",times=1");
+        if (unlinks) {
+            Form::click(dialog, "disconnectButton");
+            QTRY_VERIFY(Form::visible<ConfirmDialog>());
+            Form::click(Form::visible<ConfirmDialog>(), "acceptButton");
+        } else {
+            auto *add = static_cast<AddDialog *>(dialog);
+            signIn(add, partner, partnerPassword);
+            QTRY_VERIFY_WITH_TIMEOUT(atLocation(add), patienceMs);
+            Form::part<QComboBox>(add, "organizationComboBox")->setCurrentIndex(1);
+            Form::part<QComboBox>(add, "siteComboBox")->setCurrentIndex(0);
+            Form::click(add, "applyButton");
+        }
+        QPointer<ServiceDialog> closed = dialog;
+        QTest::keyClick(dialog, Qt::Key_Escape);
+        QVERIFY(!dialog->isVisible());
+        QCOMPARE(message(m_frame.get()), texts[1]);
+        // Asked for again, it is there again, and may be closed again.
+        m_management->validateOrbServiceAdded();
+        QVERIFY(dialog->isVisible());
+        QTest::keyClick(dialog, Qt::Key_Escape);
+        QTRY_COMPARE_WITH_TIMEOUT(message(m_frame.get()), texts[2], patienceMs);
+        QTRY_VERIFY(!closed);
+        QVERIFY(!Form::visible<AddDialog>() && !Form::visible<StatusDialog>());
+        QCOMPARE(added.last()[0].toBool(), texts[2] == "Applied successfully");
+        QCOMPARE(m_service.command("orb status").contains("added=1"), added.last()[0].toBool());
+    }
+
     void unansweredQuestionEndsOnce() {
         QSignalSpy answered(m_management, &ServiceManagement::connectToOrbFinished);
         tell("fault reset@/v1/orb/cache,times=1");
@@ -358,6 +396,8 @@ private slots:
         QCOMPARE(answered.size(), 1);
         // The session may end as well; then there is nothing to be told.
         QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
+        connect(&SessionEvents::instance(), &SessionEvents::sessionLost, m_management,
+                &ServiceManagement::reset);
         tell("expire-sessions");
         m_management->validateOrbServiceAdded();
         QTRY_COMPARE_WITH_TIMEOUT(answered.size(), 2, patienceMs);
@@ -383,7 +423,7 @@ private:
         CApiClient client("127.0.0.1", m_service.port());
         QCOMPARE(client.loginServer(account, qPrintable(password)), unsigned(ApiOk));
         CLocalStore &store = CLocalStore::instance();
-        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access());
+        store.setLoginInfo("127.0.0.1", m_service.port(), account, store.access(), true);
     }
 
     /// Links the service as its dialog would.
