@@ -278,7 +278,6 @@ private:
     std::string m_strHost;
     std::uint32_t m_uPort;
     std::string m_strAccess;
-    std::string m_strPassCipher;
     std::string m_strAccount;
     std::string m_strExpectedKey;
     std::string m_strServerKey;

@@ -82,7 +82,6 @@ unsigned CApiClient::loginServer(const char *szAccount, const char *szPassword) 
     if (result != ApiOk)
         return result;
     m_strAccount = szAccount;
-    m_strPassCipher = *cipher;
     if (!m_strAccess.empty())
         CLocalStore::instance().setAccess(QByteArray::fromStdString(m_strAccess));
     return ApiOk;

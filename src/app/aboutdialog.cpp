@@ -25,7 +25,6 @@ constexpr ShippedPart parts[] = {
     {"SQLiteCpp", NVLDM_SQLITECPP_VERSION, "MIT"},
     {"JSON for Modern C++", NVLDM_JSON_VERSION, "MIT"},
     {"cpp-httplib", NVLDM_HTTPLIB_VERSION, "MIT"},
-    {"yaml-cpp", NVLDM_YAMLCPP_VERSION, "MIT"},
     {"Inter", "", "SIL Open Font License 1.1"},
     {"Symbola", "", "Free for any use"},
 };

@@ -189,7 +189,6 @@ void SettingWindow::takeOver(const QVariantMap &values) {
         if (store.uiLanguage() != language)
             store.setUiLanguage(language);
     });
-    emit uiLanguageChanged(language);
 }
 
 void SettingWindow::onEdited(const QString &key) {

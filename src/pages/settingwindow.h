@@ -34,11 +34,6 @@ public slots:
     /// Saves the controls' values, unless somebody else has changed something: then the user is asked.
     void saveConfig();
 
-signals:
-    /// The language that the windows are to speak, whenever it becomes known or another one; empty for that
-    /// of the system.
-    void uiLanguageChanged(const QString &language);
-
 private:
     struct Loaded {
         unsigned result = 0;

@@ -320,17 +320,8 @@ bool TaskQueue::setState(const TaskFamily &family, const JSON &record, const cha
     try {
         const auto ctid = record.at("ctid").get<std::string>();
         const bool isOver = state != std::string_view(family.workingState());
-        if (!m_records.setState(ctid, state,
-                                isOver ? QueuedRecords::Secret::Wipe : QueuedRecords::Secret::Keep))
-            return false;
-        // A session that ends is what changes most records at once.
-        QMetaObject::invokeMethod(
-            this,
-            [this, ctid = QString::fromStdString(ctid), state = QString::fromLatin1(state)] {
-                emit recordChanged(ctid, state);
-            },
-            Qt::QueuedConnection);
-        return true;
+        return m_records.setState(ctid, state,
+                                  isOver ? QueuedRecords::Secret::Wipe : QueuedRecords::Secret::Keep);
     } catch (const std::exception &error) {
         qWarning("%s%s", family.lines.update, error.what());
     } catch (...) {

@@ -31,16 +31,10 @@ class TaskQueue : public QObject {
 public:
     /// Called on the worker's thread when a record has had its turn; error 0 means success.
     using Completion = std::function<void(quintptr context, quint32 error)>;
-    using Callable = std::function<void(const QString &ctid)>;
 
     ~TaskQueue() override;
 
     void setCompletionCallback(quintptr context, Completion completion);
-    /// Two callables that the queue keeps for those who use it.
-    void setProgressCallback(Callable callable) { m_progress = std::move(callable); }
-    void setStateCallback(Callable callable) { m_state = std::move(callable); }
-    const Callable &progressCallback() const { return m_progress; }
-    const Callable &stateCallback() const { return m_state; }
 
     /// The worker's body: works on every queued record, those that come meanwhile too. Blocks.
     void handlingTask();
@@ -68,7 +62,6 @@ public:
     QString stateOf(const QString &ctid) const;
 
 signals:
-    void recordChanged(const QString &ctid, const QString &state);
     /// The record's task is on the service; tid is its id there.
     void serviceTaskMade(const QString &ctid, const QString &tid);
     void handOverFailed(const FailedHandOver &failure);
@@ -123,8 +116,6 @@ private:
     quintptr m_completionContext = 0;
     Sending m_sending;
 
-    Callable m_progress;
-    Callable m_state;
     QTimer *m_timer;
     QSet<QString> m_followed; ///< records that somebody sees to
     bool m_ticking = false;
