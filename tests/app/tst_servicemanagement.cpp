@@ -351,7 +351,7 @@ private slots:
 
     void closedWhileAChangeIsUnderWay_data() {
         rows({{"linked", "fault late=700@/v1/orb/add_service", "Applying...", "Applied successfully"},
-              {"not linked", "fault reset@/v1/orb/add_service", "Applying...", unable},
+              {"not linked", "fault code=4@/v1/orb/add_service", "Applying...", unknown},
               {"unlinked", "fault late=700@/v1/orb/logout_service", "Disconnecting...",
                "Disconnected successfully!"}});
     }
@@ -362,6 +362,7 @@ private slots:
         ServiceDialog *dialog = unlinks ? static_cast<ServiceDialog *>(openStatusDialog()) : openAddDialog();
         tell(texts[0] + ",times=1");
         if (unlinks) {
+            QTRY_VERIFY_WITH_TIMEOUT(Form::part(dialog, "disconnectButton")->isEnabled(), patienceMs);
             Form::click(dialog, "disconnectButton");
             QTRY_VERIFY(Form::visible<ConfirmDialog>());
             Form::click(Form::visible<ConfirmDialog>(), "acceptButton");
