@@ -10,6 +10,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <string>
+
 namespace {
 
 /// Somebody looks at the welcome page meanwhile.

@@ -225,8 +225,8 @@ void TestApiClientEmulator::uploads() {
              unsigned(ApiOk));
     for (const bool isHere : {false, true}) {
         QVERIFY(CClientStore::instance().setThisComputer(isHere));
-        const LoginInfo login = CLocalStore::instance().loginInfo();
-        CLocalStore::instance().setLoginInfo(login.address, login.port, login.account, login.token, isHere);
+        CLocalStore &store = CLocalStore::instance();
+        store.setLoginInfo("127.0.0.1", m_emulator.port(), account, store.access(), isHere);
         QCOMPARE(client()->uploadFWFile(taskOf("deviceFWUpgrade").c_str(), path, "a.bin"), unsigned(ApiOk));
     }
     QCOMPARE(client()->exportFile(config.c_str(), m_root.filePath("a.zip").toUtf8()),
