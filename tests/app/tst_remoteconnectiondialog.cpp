@@ -147,6 +147,7 @@ private slots:
             choose(0);
             Form::click(m_dialog.get(), "deleteButton");
             Form::click(m_dialog.get(), button);
+            QTRY_VERIFY(!m_dialog->isVisible());
             QCOMPARE(keys.find("10.0.0.1:8079").has_value(), button == QByteArray("cancelButton"));
         }
         QVERIFY(keys.find("10.0.0.2:8079"));
