@@ -5,8 +5,10 @@
 #include "isolatedroot.h"
 #include "localstore.h"
 #include "logcapture.h"
+#include "pagereader.h"
 #include "processsetup.h"
 #include "servicecontrol.h"
+#include "servicerequest.h"
 
 #include <QTest>
 
@@ -58,6 +60,7 @@ private slots:
     void login();
     void sessionLimit();
     void pages();
+    void clickDuringALongReading();
     void sites();
     void commitOfDevices();
     void discoveryAndAuthorization();
@@ -150,6 +153,40 @@ void TestApiClientEmulator::pages() {
     JSON page;
     QCOMPARE(client()->listDevices(devicesOfFleet, 500, page), unsigned(ApiOk));
     QCOMPARE(page.dump(), "[]");
+}
+
+/// What a user does waits for one request of a reading, however many pages that has.
+void TestApiClientEmulator::clickDuringALongReading() {
+    constexpr int late = 250;
+    constexpr int pageSize = 31;
+    CLocalStore::instance().setLoginInfo("127.0.0.1", m_emulator.port(), account,
+                                         CLocalStore::instance().access());
+    QVERIFY(m_emulator.command(QStringLiteral("fault late=%1@/v1/").arg(late)).startsWith("ok"));
+    int pagesRead = 0;
+    int pagesAtClick = 0;
+    unsigned reading = ApiException;
+    unsigned clicked = ApiException;
+    QVERIFY(ServiceRequest::post(
+        NetJob::createRunner("reading", NetTask::Turn::Reading), this,
+        [&pagesRead](ServiceSession &session) {
+            return PageReader::readAll(session, &CApiClient::listDevices, pageSize,
+                                       [&](JSON &) { ++pagesRead; });
+        },
+        [&](unsigned result) { reading = result; }));
+    QTest::qWait(3 * late / 2);
+    QVERIFY(ServiceRequest::post(
+        NetJob::createRunner("click"), this,
+        [&](ServiceSession &session) {
+            pagesAtClick = pagesRead;
+            JSON settings;
+            return session.call([&](CApiClient &client) { return client.loadServerSettings(settings); });
+        },
+        [&](unsigned result) { clicked = result; }));
+    QTRY_COMPARE_WITH_TIMEOUT(reading, unsigned(ApiOk), 60000);
+    QCOMPARE(m_emulator.command("faults clear"), "ok");
+    QCOMPARE(clicked, unsigned(ApiOk));
+    QCOMPARE(pagesRead, devicesOfFleet / pageSize + 1);
+    QVERIFY2(pagesAtClick <= 4, qPrintable(QString::number(pagesAtClick)));
 }
 
 void TestApiClientEmulator::sites() {
