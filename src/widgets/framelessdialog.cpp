@@ -13,6 +13,10 @@
 
 namespace {
 constexpr int titleHeight = 44;
+/// How long a window manager may take to place a new window.
+constexpr int placingMs = 2000;
+/// One that wants the window elsewhere gets its way after these.
+constexpr int mostCorrections = 5;
 } // namespace
 
 FramelessDialog::FramelessDialog(QWidget *parent)
@@ -94,6 +98,24 @@ void FramelessDialog::prepareToShow() {
     if (!testAttribute(Qt::WA_Resized))
         resize(sizeHint().expandedTo(minimumSizeHint()));
     centreOverParent();
+    m_sinceShown.start();
+    m_corrections = mostCorrections;
+}
+
+void FramelessDialog::moveEvent(QMoveEvent *event) {
+    QDialog::moveEvent(event);
+    if (isVisible() && m_corrections > 0)
+        QMetaObject::invokeMethod(this, &FramelessDialog::correctPlace, Qt::QueuedConnection);
+}
+
+/// The first news of a new window's place may be of a moment when the window manager was not done with it. A
+/// move to where it should be makes the window manager tell its true place.
+void FramelessDialog::correctPlace() {
+    const QPoint place = preferredPlace(size()).topLeft();
+    if (m_dragged || m_corrections == 0 || m_sinceShown.elapsed() > placingMs || pos() == place)
+        return;
+    --m_corrections;
+    move(place);
 }
 
 void FramelessDialog::setVisible(bool visible) {

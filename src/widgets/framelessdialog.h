@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QDialog>
+#include <QElapsedTimer>
 
 #include <memory>
 
@@ -34,6 +35,7 @@ public:
 protected:
     void keyPressEvent(QKeyEvent *event) override;
     bool event(QEvent *event) override;
+    void moveEvent(QMoveEvent *event) override;
 
     /// Right before it is shown: sets its size and its place.
     virtual void prepareToShow();
@@ -43,12 +45,15 @@ protected:
 
 private:
     void fitContent();
+    void correctPlace();
 
     QLabel *m_title;
     QToolButton *m_close;
     QWidget *m_content;
     bool m_closable = true;
     bool m_dragged = false;
+    QElapsedTimer m_sinceShown;
+    int m_corrections = 0; ///< how many are left for this showing
 };
 
 /// The parts of a form, set up in a widget: for members that need them before the constructor's body.
