@@ -1,9 +1,14 @@
 #include "pagereader.h"
 
+#include "elementtexts.h"
 #include "requestturn.h"
 #include "servicesession.h"
 
+#include <QDebug>
+
 #include <nlohmann/json.hpp>
+
+#include <algorithm>
 
 namespace PageReader {
 
@@ -29,6 +34,30 @@ unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
         take(records);
         if (count < static_cast<std::size_t>(pageSize))
             break;
+    }
+    return ApiOk;
+}
+
+unsigned readTexts(ServiceSession &session, TextCall list,
+                   const std::function<void(std::string_view)> &take) {
+    std::string text;
+    for (int start = 0; start < recordLimit; start += recordsOfPage) {
+        RequestTurn::passOn();
+        const unsigned result =
+            session.call([&](CApiClient &client) { return (client.*list)(start, recordsOfPage, text); });
+        if (result != ApiOk)
+            return result;
+        try {
+            if (!text.starts_with('[') && !parseJson(text).is_array())
+                return ApiMissingData;
+            const std::vector<std::string_view> records = elementTexts(text);
+            std::for_each(records.begin(), records.end(), take);
+            if (records.size() < recordsOfPage)
+                break;
+        } catch (const std::exception &error) {
+            qWarning("A page of records cannot be read: %s", error.what());
+            return ApiException;
+        }
     }
     return ApiOk;
 }

@@ -3,6 +3,7 @@
 #include "apiclient.h"
 
 #include <functional>
+#include <string_view>
 
 class ServiceSession;
 
@@ -23,5 +24,13 @@ using GoOn = std::function<bool()>;
 /// requests before every page.
 unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
                  const std::function<void(JSON &page)> &take, const GoOn &goOn = {});
+
+/// A method of the client that gives a page as the text of an array.
+using TextCall = unsigned (CApiClient::*)(int, int, std::string &);
+
+/// The same, but the taker gets the text of each record, unparsed and not yet known to be JSON. What it
+/// throws over such a text ends the reading with ApiException.
+unsigned readTexts(ServiceSession &session, TextCall list,
+                   const std::function<void(std::string_view record)> &take);
 
 } // namespace PageReader

@@ -44,7 +44,7 @@ unsigned readMacs(ServiceSession &session, std::unordered_set<std::string> &macs
 
 /// The record as it came; what is managed at all is in the overview.
 JSON recordToAdd(const DeviceRecord &device) {
-    JSON record = parseJson(device.json);
+    JSON record = parseJson(device.json());
     if (device.siteIds.contains(Sites::overviewId))
         return record;
     JSON sites = JSON::array({Sites::overviewId.toStdString()});
@@ -57,7 +57,7 @@ JSON recordToAdd(const DeviceRecord &device) {
 QByteArray listText(const std::vector<DeviceRecordPtr> &devices) {
     QByteArray text = "[";
     for (const DeviceRecordPtr &device : devices)
-        text.append(text.size() > 1 ? "," : "").append(device->json.c_str());
+        text.append(text.size() > 1 ? "," : "").append(QByteArray::fromStdString(device->json()));
     return text + ']';
 }
 
@@ -65,7 +65,7 @@ void logSelected(const std::vector<DeviceRecordPtr> &devices) {
     QThreadPool::globalInstance()->start([devices] {
         int row = 0;
         for (const DeviceRecordPtr &device : devices)
-            qDebug("add selected row device: %d, json string: %s", row++, device->json.c_str());
+            qDebug("add selected row device: %d, json string: %s", row++, device->json().c_str());
     });
 }
 

@@ -15,7 +15,6 @@ namespace DeviceCommit {
 namespace {
 
 constexpr std::size_t batchSize = 500;
-constexpr int pageSize = 500;
 
 unsigned sendStage(ServiceSession &session, const JSON &records, const char *stage) {
     return session.call([&](CApiClient &client) { return client.commitDevices(records, stage); });
@@ -42,7 +41,7 @@ unsigned readPresent(ServiceSession &session, const QStringList &deviceIds, JSON
     const QSet<QString> wanted(deviceIds.begin(), deviceIds.end());
     QHash<QString, JSON> found;
     const unsigned result = PageReader::readAll(
-        session, &CApiClient::listDevices, pageSize,
+        session, &CApiClient::listDevices, PageReader::recordsOfPage,
         [&](JSON &page) {
             for (JSON &record : page) {
                 const QString id = DeviceRecords::identityOf(record);

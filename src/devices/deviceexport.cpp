@@ -33,7 +33,7 @@ QByteArray inOneLine(QString text) {
 QByteArray value(const DeviceRecord &device, const Field &field) {
     QString text = device.text(field.column);
     if (text == QLatin1String("--"))
-        text = stringMember(JSON::parse(device.json, nullptr, false), field.member);
+        text = stringMember(JSON::parse(device.json(), nullptr, false), field.member);
     return inOneLine(text);
 }
 

@@ -50,7 +50,7 @@ void selectionChanged(std::vector<DeviceRecordPtr> devices) {
         QByteArray ids = "[";
         for (const DeviceRecordPtr &device : devices) {
             const char *separator = records.size() > 1 ? "," : "";
-            records.append(separator).append(device->json.c_str());
+            records.append(separator).append(QByteArray::fromStdString(device->json()));
             ids.append(separator).append('"').append(device->id.toUtf8()).append('"');
         }
         qDebug("selected devices dump string: %s]", records.constData());

@@ -53,10 +53,10 @@ void DeviceMonitor::monitorLoop() {
 void DeviceMonitor::poll() {
     if (m_busy)
         return;
-    const auto read = [snapshot = m_inventory.snapshot(),
-                       codes = m_inventory.statuses()](ServiceSession &session) {
+    const auto read = [snapshot = m_inventory.snapshot(), codes = m_inventory.statuses(),
+                       cache = m_statusCache](ServiceSession &session) {
         const MessageLog::PollScope counted;
-        return InventoryReader::readStatus(session, snapshot, codes);
+        return InventoryReader::readStatus(session, snapshot, codes, cache.get());
     };
     // The flag goes when the runner ends, whatever became of the job.
     m_busy = ServiceRequest::post(

@@ -67,5 +67,7 @@ private:
     MonitorBeat m_beat;
     QTimer m_timer;
     NetTask::Owner m_runner;
+    /// Shared with the poll under way, which may outlive the monitor.
+    std::shared_ptr<StatusCache> m_statusCache = std::make_shared<StatusCache>();
     bool m_busy = false;
 };

@@ -1,5 +1,7 @@
 #include "devicerecord.h"
 
+#include "recordpool.h"
+
 #include <QCoreApplication>
 
 #include <nlohmann/json.hpp>
@@ -91,19 +93,19 @@ quint64 macKey(const QString &text) {
 /// One value of a record while it is read: text and sort key of a column.
 class Columns {
 public:
-    explicit Columns(DeviceRecord &record) : m_record(record) {}
+    Columns(DeviceRecord &record, RecordPool &pool) : m_record(record), m_pool(pool) {}
 
     void set(DeviceColumn column, const QString &text, quint64 key) {
         m_record.texts[static_cast<std::size_t>(column)] = text;
         m_record.sortKeys[static_cast<std::size_t>(column)] = key;
     }
     void setText(DeviceColumn column, const QString &value) {
-        const QString text = orUnknown(value);
+        const QString text = m_pool.shared(orUnknown(value));
         set(column, text, letterKey(text));
     }
     void setNumber(DeviceColumn column, std::optional<qint64> number) {
         const bool known = number && *number >= 0;
-        set(column, known ? QString::number(*number) : unknownText,
+        set(column, known ? m_pool.shared(QString::number(*number)) : unknownText,
             known ? static_cast<quint64>(*number) : DeviceRecord::unknownKey);
     }
     void setFlag(DeviceColumn column, std::optional<bool> on) {
@@ -114,6 +116,7 @@ public:
 
 private:
     DeviceRecord &m_record;
+    RecordPool &m_pool;
 };
 
 DeviceClass classOf(const QString &serverType) {
@@ -178,16 +181,17 @@ PasswordPolicy policyOf(const JSON &value) {
     return {number("plen", PasswordPolicy::longest), number("type", 63)};
 }
 
-void readColumns(const JSON &value, DeviceRecord &record) {
-    Columns columns(record);
+void readColumns(const JSON &value, DeviceRecord &record, RecordPool &pool) {
+    Columns columns(record, pool);
     columns.setText(DeviceColumn::Model, stringMember(value, "d_model"));
-    columns.setText(DeviceColumn::HostName, stringMember(value, "d_hostname"));
+    const QString host = orUnknown(stringMember(value, "d_hostname"));
+    columns.set(DeviceColumn::HostName, host, letterKey(host));
     const QString ip = stringMember(value, "d_ip");
     const quint64 ipKey = ipSortKey(ip);
     columns.set(DeviceColumn::Ip, ipKey == DeviceRecord::unknownKey ? unknownText : ip, ipKey);
     const QString mac = stringMember(value, "d_mac");
     columns.set(DeviceColumn::Mac, orUnknown(mac), macKey(mac));
-    const QString firmware = orUnknown(stringMember(value, "d_fw"));
+    const QString firmware = pool.shared(orUnknown(stringMember(value, "d_fw")));
     columns.set(DeviceColumn::Firmware, firmware, versionKey(firmware));
     columns.setNumber(DeviceColumn::HttpPort, wholeNumber(value, "d_http"));
     columns.setNumber(DeviceColumn::HttpsPort, wholeNumber(value, "d_https"));
@@ -199,6 +203,29 @@ void readColumns(const JSON &value, DeviceRecord &record) {
     columns.set(DeviceColumn::DateTime, time, digitsKey(time));
     columns.setNumber(DeviceColumn::PowerFrequency, wholeNumber(value, "d_powerfreq"));
     columns.setText(DeviceColumn::Audio, audioText(stringMember(value, "d_audio")));
+}
+
+std::shared_ptr<DeviceRecord> read(const JSON &value, RecordPool &pool) {
+    auto record = std::make_shared<DeviceRecord>();
+    record->id = identityOf(value);
+    if (record->id.isEmpty())
+        return nullptr;
+    record->deviceClass = classOf(stringMember(value, "d_svrtype"));
+    record->siteIds = pool.shared(siteIdsOf(value));
+    record->networkType = pool.shared(stringMember(value, "d_nettype"));
+    // Unlike the column: a write-protected card is of no use to who wants to store something.
+    record->hasCard = textMember(value, "d_sdstatus") == "ready";
+    record->policy = policyOf(value);
+    record->certificates = DeviceCertificates::of(value);
+    readColumns(value, *record, pool);
+    for (const DeviceColumn column :
+         {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {
+        if (record->text(column) != unknownText)
+            record->searchText += record->text(column).toCaseFolded().toStdString() + '\n';
+    }
+    record->searchText.shrink_to_fit();
+    record->keptJson = pool.keep(record->text(DeviceColumn::Model), dumpJson(value));
+    return record;
 }
 
 } // namespace
@@ -231,25 +258,19 @@ QString identityOf(const JSON &value) {
 }
 
 DeviceRecordPtr parse(const JSON &value) {
-    auto record = std::make_shared<DeviceRecord>();
-    record->id = identityOf(value);
-    if (record->id.isEmpty())
-        return nullptr;
-    record->deviceClass = classOf(stringMember(value, "d_svrtype"));
-    record->siteIds = siteIdsOf(value);
-    record->networkType = stringMember(value, "d_nettype");
-    // Unlike the column: a write-protected card is of no use to who wants to store something.
-    record->hasCard = textMember(value, "d_sdstatus") == "ready";
-    record->policy = policyOf(value);
-    record->certificates = DeviceCertificates::of(value);
-    readColumns(value, *record);
-    for (const DeviceColumn column :
-         {DeviceColumn::HostName, DeviceColumn::Ip, DeviceColumn::Model, DeviceColumn::Firmware}) {
-        if (record->text(column) != unknownText)
-            record->searchText += record->text(column).toCaseFolded().toStdString() + '\n';
-    }
-    record->json = dumpJson(value);
+    RecordPool pool;
+    return read(value, pool);
+}
+
+DeviceRecordPtr parse(std::string_view text, RecordPool &pool) {
+    std::shared_ptr<DeviceRecord> record = read(parseJson(text), pool);
+    if (record)
+        record->textHash = hashOf(text);
     return record;
+}
+
+std::size_t hashOf(std::string_view text) {
+    return std::hash<std::string_view>()(text);
 }
 
 QString columnTitle(DeviceColumn column) {

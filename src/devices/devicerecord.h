@@ -1,5 +1,6 @@
 #pragma once
 
+#include "deltatext.h"
 #include "devicecertificates.h"
 #include "json.h"
 #include "passwordpolicy.h"
@@ -10,6 +11,9 @@
 #include <array>
 #include <memory>
 #include <string>
+#include <string_view>
+
+class RecordPool;
 
 /// The kind of device, which decides the table it is shown in.
 enum class DeviceClass : quint8 { Camera, Nvr, Others };
@@ -55,9 +59,11 @@ struct DeviceRecord {
     std::array<quint64, deviceColumnCount> sortKeys{};
     /// Host name, address, model and firmware without case, in UTF-8: what a search looks through.
     std::string searchText;
-    /// The whole record as JSON text, with the members that this client does not know.
-    std::string json;
+    DeltaText keptJson;
+    std::size_t textHash = 0; ///< of the text that the record was read from, if it was one
 
+    /// The whole record as JSON text, with the members that this client does not know.
+    std::string json() const { return keptJson.text(); }
     const QString &text(DeviceColumn column) const { return texts[static_cast<std::size_t>(column)]; }
     quint64 sortKey(DeviceColumn column) const { return sortKeys[static_cast<std::size_t>(column)]; }
 };
@@ -69,6 +75,13 @@ namespace DeviceRecords {
 /// Reads a record. Members that are missing or of a wrong type spoil their own value only; null for a value
 /// that is no object or has neither an id nor a MAC address.
 DeviceRecordPtr parse(const JSON &value);
+
+/// The same for the text of a record, among many whose common parts are kept once. Throws what parseJson
+/// throws.
+DeviceRecordPtr parse(std::string_view text, RecordPool &pool);
+
+/// Of the text of a record: as long as it is the same, so is the record.
+std::size_t hashOf(std::string_view text);
 
 /// The id of a record, or its MAC address in a plain form where the service has given no id yet.
 QString identityOf(const JSON &value);

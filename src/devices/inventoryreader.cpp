@@ -2,6 +2,7 @@
 
 #include "messagelog.h"
 #include "pagereader.h"
+#include "recordpool.h"
 #include "servicesession.h"
 
 #include <QDebug>
@@ -15,13 +16,34 @@ namespace InventoryReader {
 
 namespace {
 
-/// The record as it was, when it says the same: then nothing has to be read, kept or painted anew.
-DeviceRecordPtr recordOf(const JSON &value, const DeviceSnapshot &previous) {
-    const int index = previous.indexOf(DeviceRecords::identityOf(value));
-    if (index >= 0 && previous.at(index)->json == dumpJson(value))
-        return previous.at(index);
-    return DeviceRecords::parse(value);
-}
+/// Takes the records of a list over from the reading before where their texts are the same: then nothing has
+/// to be parsed, kept or painted anew.
+class RecordReader {
+public:
+    explicit RecordReader(const DeviceSnapshot &previous) : m_previous(previous) {}
+
+    /// Null for a record without an identity.
+    DeviceRecordPtr read(std::string_view text) {
+        // The service mostly keeps its order.
+        if (isSame(m_next, text))
+            return m_previous.at(m_next++);
+        DeviceRecordPtr record = DeviceRecords::parse(text, m_pool);
+        const int index = record ? m_previous.indexOf(record->id) : -1;
+        if (index < 0)
+            return record;
+        m_next = index + 1;
+        return isSame(index, text) ? m_previous.at(index) : record;
+    }
+
+private:
+    bool isSame(int index, std::string_view text) const {
+        return index < m_previous.size() && m_previous.at(index)->textHash == DeviceRecords::hashOf(text);
+    }
+
+    const DeviceSnapshot &m_previous;
+    RecordPool m_pool;
+    int m_next = 0;
+};
 
 bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
     if (a.size() != b.size())
@@ -35,15 +57,14 @@ bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
 
 DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous) {
     std::vector<DeviceRecordPtr> records;
+    RecordReader reader(*previous);
     int unreadable = 0;
     const unsigned result =
-        PageReader::readAll(session, &CApiClient::listDevices, PageReader::recordsOfPage, [&](JSON &page) {
-            for (const JSON &value : page) {
-                if (DeviceRecordPtr record = recordOf(value, *previous))
-                    records.push_back(std::move(record));
-                else
-                    ++unreadable;
-            }
+        PageReader::readTexts(session, &CApiClient::listDevicesText, [&](std::string_view text) {
+            if (DeviceRecordPtr record = reader.read(text))
+                records.push_back(std::move(record));
+            else
+                ++unreadable;
         });
     if (result != ApiOk) {
         qDebug("HTTP API(listDevices) failed!");
@@ -63,30 +84,49 @@ struct StatusReading {
     DeviceDifference difference = {};
 };
 
+/// What a status record says; nothing where it has no id.
+std::optional<StatusCache::Entry> readState(std::string_view text, const DeviceSnapshot &snapshot,
+                                            DeviceDifference &difference) {
+    const JSON record = parseJson(text);
+    std::string id(textMember(record, "id"));
+    if (id.empty())
+        return std::nullopt;
+    const int index = snapshot.indexOf(id);
+    if (index < 0)
+        difference.unknown.push_back(std::move(id));
+    return StatusCache::Entry{0, index,
+                              DeviceStatus::codeOf(textMember(record, "connect_status"),
+                                                   textMember(record, "auth_status"),
+                                                   textMember(record, "action_status"))};
+}
+
 /// The states of a snapshot's devices; one that the list misses counts as unauthorized.
-std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnapshot &snapshot) {
-    const auto size = static_cast<std::size_t>(snapshot.size());
+std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnapshotPtr &snapshot,
+                                       StatusCache &cache) {
+    const auto size = static_cast<std::size_t>(snapshot->size());
     StatusReading reading{std::vector<DeviceStatusCode>(size, DeviceStatusCode::Unauthorized)};
     std::vector<bool> seen(size, false);
     int unreadable = 0;
     int readable = 0;
-    const unsigned result = PageReader::readAll(
-        session, &CApiClient::listDeviceStatus, PageReader::recordsOfPage, [&](JSON &page) {
-            for (const JSON &record : page) {
-                std::string id(textMember(record, "id"));
-                ++(id.empty() ? unreadable : readable);
-                const int index = snapshot.indexOf(id);
-                if (index < 0) {
-                    if (!id.empty())
-                        reading.difference.unknown.push_back(std::move(id));
-                    continue;
-                }
-                const auto place = static_cast<std::size_t>(index);
-                seen[place] = true;
-                reading.codes[place] = DeviceStatus::codeOf(textMember(record, "connect_status"),
-                                                            textMember(record, "auth_status"),
-                                                            textMember(record, "action_status"));
+    std::size_t record = 0;
+    cache.follow(snapshot);
+    const unsigned result =
+        PageReader::readTexts(session, &CApiClient::listDeviceStatusText, [&](std::string_view text) {
+            StatusCache::Entry &entry = cache.at(record++);
+            const std::size_t hash = DeviceRecords::hashOf(text);
+            if (entry.hash != hash || entry.index < 0) {
+                const auto read = readState(text, *snapshot, reading.difference);
+                entry = read.value_or(StatusCache::Entry());
+                entry.hash = hash;
+                ++(read ? readable : unreadable);
+            } else {
+                ++readable;
             }
+            if (entry.index < 0)
+                return;
+            const auto device = static_cast<std::size_t>(entry.index);
+            seen[device] = true;
+            reading.codes[device] = entry.code;
         });
     if (result != ApiOk) {
         qDebug("HTTP API(listDeviceStatus) failed! (%d)", static_cast<int>(result));
@@ -98,7 +138,7 @@ std::optional<StatusReading> readCodes(ServiceSession &session, const DeviceSnap
         return std::nullopt;
     for (std::size_t i = 0; i < size; ++i) {
         if (!seen[i])
-            reading.difference.stateless.push_back(snapshot.at(static_cast<int>(i))->id.toStdString());
+            reading.difference.stateless.push_back(snapshot->at(static_cast<int>(i))->id.toStdString());
     }
     for (std::vector<std::string> *ids : {&reading.difference.unknown, &reading.difference.stateless})
         std::sort(ids->begin(), ids->end());
@@ -159,7 +199,8 @@ Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
     reading.devices = readDevices(session, previous);
     if (!reading.devices)
         return reading;
-    if (std::optional<StatusReading> status = readCodes(session, *reading.devices))
+    StatusCache cache;
+    if (std::optional<StatusReading> status = readCodes(session, reading.devices, cache))
         reading.codes = std::move(status->codes);
     else
         reading.codes = carriedOver(*reading.devices, *previous, previousCodes);
@@ -167,8 +208,9 @@ Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
 }
 
 std::optional<DeviceStatusUpdate> readStatus(ServiceSession &session, const DeviceSnapshotPtr &snapshot,
-                                             const std::vector<DeviceStatusCode> &codes) {
-    std::optional<StatusReading> reading = readCodes(session, *snapshot);
+                                             const std::vector<DeviceStatusCode> &codes, StatusCache *cache) {
+    StatusCache own;
+    std::optional<StatusReading> reading = readCodes(session, snapshot, cache ? *cache : own);
     if (!reading)
         return std::nullopt;
     DeviceStatusUpdate update{snapshot, {}, std::move(reading->difference)};

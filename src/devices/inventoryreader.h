@@ -2,6 +2,7 @@
 
 #include "deviceinventory.h"
 #include "sitelist.h"
+#include "statuscache.h"
 
 #include <optional>
 
@@ -25,8 +26,10 @@ std::optional<Sites::List> readSites(ServiceSession &session);
 Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
                 std::vector<DeviceStatusCode> previousCodes);
 
-/// Reads the states and compares them with those of a snapshot. Nothing when they could not be read.
+/// Reads the states and compares them with those of a snapshot. Nothing when they could not be read. cache:
+/// what an earlier reading of states has left for the next one, or null.
 std::optional<DeviceStatusUpdate> readStatus(ServiceSession &session, const DeviceSnapshotPtr &snapshot,
-                                             const std::vector<DeviceStatusCode> &codes);
+                                             const std::vector<DeviceStatusCode> &codes,
+                                             StatusCache *cache = nullptr);
 
 } // namespace InventoryReader

@@ -1,5 +1,7 @@
 #include "json.h"
 
+#include "elementtexts.h"
+
 #include <nlohmann/json.hpp>
 
 #include <stdexcept>
@@ -52,11 +54,47 @@ void requireBounds(std::string_view text) {
         throw std::length_error("JSON holds too many values");
 }
 
+constexpr std::string_view blanks = " \t\r\n";
+
+std::string_view trimmed(std::string_view text) {
+    const std::size_t begin = text.find_first_not_of(blanks);
+    return begin == std::string_view::npos ? std::string_view()
+                                           : text.substr(begin, text.find_last_not_of(blanks) - begin + 1);
+}
+
 } // namespace
 
 JSON parseJson(std::string_view text) {
     requireBounds(text);
     return JSON::parse(text);
+}
+
+std::vector<std::string_view> elementTexts(std::string_view array) {
+    const std::string_view text = trimmed(array);
+    if (text.size() < 2 || text.front() != '[' || text.back() != ']')
+        throw std::invalid_argument("JSON is no array");
+    const std::string_view inner = trimmed(text.substr(1, text.size() - 2));
+    std::vector<std::string_view> elements;
+    int depth = 0;
+    std::size_t begin = 0;
+    for (std::size_t at = 0; at < inner.size(); ++at) {
+        const char c = inner[at];
+        if (c == '"') {
+            at = endOfString(inner, at + 1);
+        } else if (c == '[' || c == '{') {
+            ++depth;
+        } else if ((c == ']' || c == '}') && --depth < 0) {
+            throw std::invalid_argument("JSON is no array");
+        } else if (c == ',' && depth == 0) {
+            elements.push_back(trimmed(inner.substr(begin, at - begin)));
+            begin = at + 1;
+        }
+    }
+    if (depth != 0)
+        throw std::invalid_argument("JSON is no array");
+    if (!inner.empty())
+        elements.push_back(trimmed(inner.substr(begin)));
+    return elements;
 }
 
 std::string dumpJson(const JSON &value) {

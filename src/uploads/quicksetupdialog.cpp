@@ -131,7 +131,7 @@ void QuickSetupDialog::onZoneTyped() {
 }
 
 void QuickSetupDialog::propose(const DeviceRecord &device) {
-    const JSON record = parseJson(device.json);
+    const JSON record = parseJson(device.json());
     if (const QString zone = stringMember(record, "d_timezone"); TimeZones::isPosix(zone))
         m_zoneEdit->setText(zone);
     m_timeFields->propose(record);

@@ -16,7 +16,7 @@ const QByteArray row = "80,443,10.0.0.1,00:11:22:33:44:55,N-1";
 QString shown(const CsvDevices::Reading &reading) {
     QStringList devices;
     for (const DeviceRecordPtr &device : reading.devices) {
-        const JSON record = JSON::parse(device->json);
+        const JSON record = JSON::parse(device->json());
         devices += QStringList{QString::number(record["d_http"].get<int>()),
                                QString::number(record["d_https"].get<int>()), stringMember(record, "d_ip"),
                                stringMember(record, "d_mac"), stringMember(record, "d_model")}
@@ -101,7 +101,7 @@ private slots:
 
     void recordsAreAsTheServiceTakesThem() {
         const CsvDevices::Reading reading = CsvDevices::parse(header + row.chopped(3) + "\"\"\"\\\"");
-        const JSON record = JSON::parse(reading.devices.at(0)->json);
+        const JSON record = JSON::parse(reading.devices.at(0)->json());
         QCOMPARE(record.size(), 17u);
         QCOMPARE(record["d_model"].get<std::string>().c_str(), "\"\\");
         QCOMPARE(record["siteid"].get<std::string>().c_str(), "[\"DO000000000000\"]");

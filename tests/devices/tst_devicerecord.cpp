@@ -133,7 +133,27 @@ private slots:
         value["d_model"] = std::string(10000, 'N');
         const DeviceRecordPtr device = DeviceRecords::parse(value);
         QCOMPARE(device->text(DeviceColumn::Model), QString(10000, u'N'));
-        QVERIFY(JSON::parse(device->json) == value);
+        QVERIFY(JSON::parse(device->json()) == value);
+    }
+
+    void keepsTextsAsDifferences_data() {
+        QTest::addColumn<QByteArray>("base");
+        QTest::addColumn<QByteArray>("text");
+        const QByteArray base = R"({"a":1,"b":"x","c":[1,2,3],"d":null})";
+        for (const QByteArray &text :
+             {base, QByteArray(R"({"a":2,"b":"x","c":[1,2,3],"d":0})"),
+              QByteArray(R"({"a":1,"b":"x,y","c":[1]})"), QByteArray("{"), QByteArray(), QByteArray(",,,"),
+              QByteArray(base + base), QByteArray(70000, ','), QByteArray(70000, 'x') + ",\x01\x80\xff"})
+            QTest::addRow("%s", text.left(40).constData()) << base << text;
+        QTest::newRow("no base") << QByteArray() << base;
+    }
+    void keepsTextsAsDifferences() {
+        QFETCH(QByteArray, base);
+        QFETCH(QByteArray, text);
+        QCOMPARE(
+            DeltaText(std::make_shared<const std::string>(base.toStdString()), text.toStdString()).text(),
+            text.toStdString());
+        QCOMPARE(DeltaText(nullptr, text.toStdString()).text(), text.toStdString());
     }
 
     void ipSortKey_data() {

@@ -1,3 +1,4 @@
+#include "elementtexts.h"
 #include "json.h"
 
 #include <QElapsedTimer>
@@ -15,6 +16,8 @@ private slots:
     void refusesWhatIsNoJson();
     void takesAsLongAsTheTextIs();
     void dumpReplacesWhatIsNoUtf8();
+    void elementsOfAnArray_data();
+    void elementsOfAnArray();
 };
 
 void TestJson::nesting_data() {
@@ -79,6 +82,34 @@ void TestJson::takesAsLongAsTheTextIs() {
 void TestJson::dumpReplacesWhatIsNoUtf8() {
     const JSON value = {{"name", "a\xff z\xc3\xa4"}};
     QCOMPARE(dumpJson(value), std::string("{\"name\":\"a\xef\xbf\xbd z\xc3\xa4\"}"));
+}
+
+void TestJson::elementsOfAnArray_data() {
+    QTest::addColumn<std::string>("text");
+    QTest::addColumn<QByteArrayList>("elements");
+    const QByteArrayList refused = {"refused"};
+    QTest::newRow("none") << std::string(" [ ] ") << QByteArrayList();
+    QTest::newRow("values") << std::string("[1 ,\n\"a\", null]") << QByteArrayList{"1", "\"a\"", "null"};
+    QTest::newRow("nested") << std::string(R"([{"a":[1,{"b":2}]},[3,4]])")
+                            << QByteArrayList{R"({"a":[1,{"b":2}]})", "[3,4]"};
+    QTest::newRow("brackets in texts")
+        << std::string(R"(["]\",[", {"}":"\\"}])") << QByteArrayList{R"("]\",[")", R"({"}":"\\"})"};
+    QTest::newRow("what is missing is for the parser") << std::string("[1,]") << QByteArrayList{"1", ""};
+    for (const char *text : {"", "[", "{}", "1", "[1", "[{]", "[1]]", "[]]", "[1]}{[2]"})
+        QTest::newRow(text) << std::string(text) << refused;
+}
+
+void TestJson::elementsOfAnArray() {
+    QFETCH(std::string, text);
+    QFETCH(QByteArrayList, elements);
+    QByteArrayList found;
+    try {
+        for (const std::string_view element : elementTexts(text))
+            found.append(QByteArray(element.data(), static_cast<qsizetype>(element.size())));
+    } catch (const std::exception &) {
+        found = {"refused"};
+    }
+    QCOMPARE(found, elements);
 }
 
 QTEST_APPLESS_MAIN(TestJson)
