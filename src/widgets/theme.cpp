@@ -3,6 +3,7 @@
 #include <QFile>
 #include <QFontDatabase>
 #include <QGuiApplication>
+#include <QResource>
 
 #include <utility>
 
@@ -49,9 +50,13 @@ QString fontFamily() {
 }
 
 void installFonts() {
-    QFontDatabase::addApplicationFont(QStringLiteral(":/fonts/Segoe-UI-Variable-Static-Small.ttf"));
-    QFontDatabase::addApplicationFont(QStringLiteral(":/fonts/Segoe-UI-Variable-Static-Small-Semibold.ttf"));
-    QFontDatabase::addApplicationFont(QStringLiteral(":/fonts/Segoe-UI-Symbol.ttf"));
+    for (const char *name :
+         {"Segoe-UI-Variable-Static-Small", "Segoe-UI-Variable-Static-Small-Semibold", "Segoe-UI-Symbol"}) {
+        // Given by its file name, a font would be copied; its bytes stand in the program, uncompressed.
+        const QResource font(QStringLiteral(":/fonts/%1.ttf").arg(QLatin1String(name)));
+        if (font.isValid())
+            QFontDatabase::addApplicationFontFromData(font.uncompressedData());
+    }
     QFont::insertSubstitutions(fontFamily(), {QStringLiteral("Inter"), QStringLiteral("Segoe UI")});
     // Letters come from the text family; the symbol family only fills in what that has not.
     QFont::insertSubstitutions(QStringLiteral("Segoe UI Symbol"),
