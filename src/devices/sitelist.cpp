@@ -9,6 +9,10 @@ namespace Sites {
 
 namespace {
 
+/// Nobody nests sites deeper; what draws, opens and deletes the rows of a tree goes down level by level on
+/// the stack.
+constexpr int maxLevels = 64;
+
 List readRecords(const JSON &records) {
     List sites;
     QSet<QString> seen;
@@ -23,9 +27,10 @@ List readRecords(const JSON &records) {
     return sites;
 }
 
-/// Appends the sites below a parent, level by level; no recursion, since the depth is the service's.
-void appendBelow(const QString &root, const QMultiHash<QString, Site> &byParent, QSet<QString> &placed,
-                 List &ordered) {
+/// Appends the sites below a parent, level by level; no recursion, since the depth is the service's. What is
+/// too deep goes onto the top level with what is below it.
+void appendBelow(const QString &root, int firstLevel, const QMultiHash<QString, Site> &byParent,
+                 QSet<QString> &placed, List &ordered) {
     List level;
     const auto childrenOf = [&](const QString &parent) {
         // A multi-hash gives the latest first; the service's order is the one to keep.
@@ -33,11 +38,16 @@ void appendBelow(const QString &root, const QMultiHash<QString, Site> &byParent,
         return List(children.crbegin(), children.crend());
     };
     level = childrenOf(root);
-    while (!level.empty()) {
+    for (int depth = firstLevel; !level.empty(); ++depth) {
         List next;
-        for (const Site &site : level) {
+        const bool isTooDeep = depth > maxLevels;
+        if (isTooDeep)
+            depth = 1;
+        for (Site &site : level) {
             if (placed.contains(site.id))
                 continue;
+            if (isTooDeep)
+                site.parentId = rootId;
             placed.insert(site.id);
             ordered.push_back(site);
             const List children = childrenOf(site.id);
@@ -65,7 +75,7 @@ List arranged(List sites) {
     }
     List ordered;
     QSet<QString> placed;
-    appendBelow(rootId, byParent, placed, ordered);
+    appendBelow(rootId, 1, byParent, placed, ordered);
     // What is left hangs in a cycle: its first member becomes a top-level site, which breaks the cycle.
     for (Site site : sites) {
         if (placed.contains(site.id))
@@ -73,7 +83,7 @@ List arranged(List sites) {
         site.parentId = rootId;
         placed.insert(site.id);
         ordered.push_back(site);
-        appendBelow(site.id, byParent, placed, ordered);
+        appendBelow(site.id, 2, byParent, placed, ordered);
     }
     return ordered;
 }

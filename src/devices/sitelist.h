@@ -28,7 +28,8 @@ struct Site {
 using List = std::vector<Site>;
 
 /// Reads site records, ordered so that parents come first. A record without an id or with one seen before is
-/// left out; a site whose parent is unknown, or that is its own ancestor, becomes a top-level one.
+/// left out; a site whose parent is unknown, that is its own ancestor, or that lies below the 64th level
+/// becomes a top-level one.
 List parse(const JSON &records);
 
 /// Orders and heals sites in the same way. Brothers keep their order; ids must be unique.
