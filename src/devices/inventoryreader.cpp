@@ -55,30 +55,6 @@ bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
     return true;
 }
 
-DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous) {
-    std::vector<DeviceRecordPtr> records;
-    RecordReader reader(*previous);
-    int unreadable = 0;
-    const unsigned result =
-        PageReader::readTexts(session, &CApiClient::listDevicesText, [&](std::string_view text) {
-            if (DeviceRecordPtr record = reader.read(text))
-                records.push_back(std::move(record));
-            else
-                ++unreadable;
-        });
-    if (result != ApiOk) {
-        qDebug("HTTP API(listDevices) failed!");
-        return nullptr;
-    }
-    if (unreadable > 0)
-        qWarning("%d device records have neither id nor MAC address and are not shown", unreadable);
-    // Nothing but garbage is no list, and certainly no empty one.
-    if (unreadable > 0 && records.empty())
-        return nullptr;
-    auto snapshot = std::make_shared<const DeviceSnapshot>(std::move(records));
-    return isSame(*snapshot, *previous) ? previous : snapshot;
-}
-
 struct StatusReading {
     std::vector<DeviceStatusCode> codes;
     DeviceDifference difference = {};
@@ -169,7 +145,31 @@ void logSites(const JSON &sites) {
 
 } // namespace
 
-std::optional<Sites::List> readSites(ServiceSession &session) {
+DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous) {
+    std::vector<DeviceRecordPtr> records;
+    RecordReader reader(*previous);
+    int unreadable = 0;
+    const unsigned result =
+        PageReader::readTexts(session, &CApiClient::listDevicesText, [&](std::string_view text) {
+            if (DeviceRecordPtr record = reader.read(text))
+                records.push_back(std::move(record));
+            else
+                ++unreadable;
+        });
+    if (result != ApiOk) {
+        qDebug("HTTP API(listDevices) failed!");
+        return nullptr;
+    }
+    if (unreadable > 0)
+        qWarning("%d device records have neither id nor MAC address and are not shown", unreadable);
+    // Nothing but garbage is no list, and certainly no empty one.
+    if (unreadable > 0 && records.empty())
+        return nullptr;
+    auto snapshot = std::make_shared<const DeviceSnapshot>(std::move(records));
+    return isSame(*snapshot, *previous) ? previous : snapshot;
+}
+
+unsigned readSites(ServiceSession &session, Sites::List &sites) {
     JSON all = JSON::array();
     const unsigned result =
         PageReader::readAll(session, &CApiClient::listSites, PageReader::recordsOfPage, [&](JSON &page) {
@@ -178,24 +178,25 @@ std::optional<Sites::List> readSites(ServiceSession &session) {
         });
     if (result != ApiOk) {
         qDebug("HTTP API(listSites) failed!");
-        return std::nullopt;
+        return result;
     }
     if (all.empty())
         qDebug("no site found!");
     logSites(all);
-    Sites::List sites = Sites::parse(all);
+    sites = Sites::parse(all);
     const auto isReadable = [](const JSON &site) { return !textMember(site, "siteid").empty(); };
     if (all.empty() || std::any_of(all.begin(), all.end(), isReadable))
-        return sites;
+        return ApiOk;
     qWarning("none of %d site records has an id", static_cast<int>(all.size()));
-    return std::nullopt;
+    return ApiMissingData;
 }
 
 Reading readAll(ServiceSession &session, const DeviceSnapshotPtr &previous,
                 std::vector<DeviceStatusCode> previousCodes) {
     const MessageLog::PollScope counted;
     Reading reading;
-    reading.sites = readSites(session);
+    if (Sites::List sites; readSites(session, sites) == ApiOk)
+        reading.sites = std::move(sites);
     reading.devices = readDevices(session, previous);
     if (!reading.devices)
         return reading;

@@ -18,8 +18,11 @@ struct Reading {
     std::vector<DeviceStatusCode> codes; ///< one a device, in their order
 };
 
-/// Reads the sites alone. Nothing when they could not be read.
-std::optional<Sites::List> readSites(ServiceSession &session);
+/// Reads the sites alone. Returns an ApiResult.
+unsigned readSites(ServiceSession &session, Sites::List &sites);
+
+/// Reads the devices alone, as readAll() does. Null when they could not be read.
+DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &previous);
 
 /// Reads all three. Records that are as before are taken over from the previous reading; when all are, the
 /// very same snapshot comes back.

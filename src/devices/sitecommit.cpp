@@ -23,18 +23,20 @@ Answer commit(ServiceSession &session, SiteEdits edits) {
     qDebug("login info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
            static_cast<int>(login.port), qUtf8Printable(login.account),
            MessageLog::secret(login.token).constData());
-    const std::optional<Sites::List> reading = InventoryReader::readSites(session);
-    if (!reading)
-        return {ApiTransportError, {}};
-    edits.takeReading(*reading);
+    Answer answer;
+    answer.result = InventoryReader::readSites(session, answer.reading);
+    if (answer.result != ApiOk) {
+        qWarning("HTTP API(commitSites) failed!");
+        return answer;
+    }
+    edits.takeReading(answer.reading);
     const JSON sites = edits.commitRecords();
-    const unsigned result =
-        session.call([&](CApiClient &client) { return client.commitSites(sites, "all"); });
-    if (result == ApiOk)
+    answer.result = session.call([&](CApiClient &client) { return client.commitSites(sites, "all"); });
+    if (answer.result == ApiOk)
         qDebug("commit site info: %s", dumpJson(sites).c_str());
     else
         qWarning("HTTP API(commitSites) failed!");
-    return {result, *reading};
+    return answer;
 }
 
 } // namespace

@@ -113,6 +113,21 @@ private slots:
                                   QStringLiteral("Zebra"), patienceMs);
     }
 
+    void siteChangesThatCannotBeSentSayWhy() {
+        workOn(5);
+        QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
+        m_window->findChild<QToolButton *>("addTopSiteButton")->click();
+        tell("fault code=5@/v1/site/list");
+        const LogCapture log;
+        m_window->commitSites();
+        QTRY_COMPARE(message.size(), 1);
+        QCOMPARE(
+            message[0][0].toString(),
+            QStringLiteral("The site changes could not be sent: the server refused it. Press Apply to try "
+                           "again."));
+        QCOMPARE(log.count("HTTP API(commitSites) failed!"), 1);
+    }
+
     void failedReadingRecovers() {
         m_service.start({"--fault", "status=500@/v1/dev/list,times=1"});
         const LogCapture log;
