@@ -1,8 +1,9 @@
 #include "serveraddress.h"
 
+#include "ipv4.h"
+
 #include <QDebug>
 #include <QHostInfo>
-#include <QRegularExpression>
 
 namespace {
 constexpr qsizetype longestHost = 127;
@@ -26,10 +27,7 @@ std::optional<ServerAddress> ServerAddress::parse(const QString &text) {
 }
 
 bool ServerAddress::isIpAddress() const {
-    static const QRegularExpression pattern(QRegularExpression::anchoredPattern(
-        QStringLiteral("\\b(?:(?:25[0-5]|2[0-4][0-9]|[01]?[0-9][0-9]?)\\.){3}"
-                       "(?:25[0-5]|2[0-4][0-9]|[01]?[0-9][0-9]?)\\b")));
-    return pattern.match(host).hasMatch();
+    return Ipv4::parse(host.toLatin1().toStdString()).has_value();
 }
 
 QString ServerAddress::resolved() const {

@@ -1,5 +1,7 @@
 #include "addresspattern.h"
 
+#include "ipv4.h"
+
 #include <QDebug>
 #include <QRegularExpression>
 #include <QStringList>
@@ -86,9 +88,20 @@ private:
 } // namespace
 
 bool isAddress(const QString &text) {
-    static const QRegularExpression rule(QStringLiteral(
-        R"(\A(?:1\d?\d?|2(?:[0-4]\d?|[6789]|5[0-5]?)?|[3-9]\d?|0)(?:\.(?:1\d?\d?|2(?:[0-4]\d?|[6789]|5[0-5]?)?|[3-9]\d?|0)){3}\z)"));
-    return rule.match(text).hasMatch();
+    const std::optional<std::uint32_t> address = Ipv4::parse(text.toLatin1().toStdString());
+    return address && textOf(*address) == text;
+}
+
+quint32 numberOf(const QString &text) {
+    return Ipv4::parse(text.toLatin1().toStdString()).value_or(0);
+}
+
+QString textOf(quint32 address) {
+    return QString::fromStdString(Ipv4::toText(address));
+}
+
+bool isMask(const QString &text) {
+    return isAddress(text) && Ipv4::isMask(numberOf(text));
 }
 
 bool isPattern(const QString &text) {
@@ -158,25 +171,3 @@ std::vector<quint32> lowest(const QStringList &patterns, std::size_t wanted, con
 }
 
 } // namespace AddressPattern
-
-quint32 Ipv4::parse(const QString &address) {
-    quint32 value = 0;
-    for (const QString &part : address.split(u'.'))
-        value = value << 8 | part.toUInt();
-    return value;
-}
-
-QString Ipv4::toText(quint32 address) {
-    return QStringLiteral("%1.%2.%3.%4")
-        .arg(address >> 24)
-        .arg(address >> 16 & 255)
-        .arg(address >> 8 & 255)
-        .arg(address & 255);
-}
-
-bool Ipv4::isMask(const QString &text) {
-    if (!AddressPattern::isAddress(text))
-        return false;
-    const quint32 zeros = ~parse(text);
-    return zeros != 0 && zeros != ~quint32{0} && (zeros & (zeros + 1)) == 0;
-}

@@ -9,8 +9,13 @@
 /// parts, "192.168.*.10-19".
 namespace AddressPattern {
 
-/// Four numbers of at most three digits from 0 to 255.
+/// Four numbers from 0 to 255 without leading zeros.
 bool isAddress(const QString &text);
+/// The number of an address, with or without leading zeros; 0 for any other text.
+quint32 numberOf(const QString &text);
+QString textOf(quint32 address);
+/// Whether a text is a subnet mask.
+bool isMask(const QString &text);
 /// Four parts, each "*", a number or a range.
 bool isPattern(const QString &text);
 
@@ -36,14 +41,3 @@ bool isUsable(quint32 address, const Limits &limits);
 std::vector<quint32> lowest(const QStringList &patterns, std::size_t wanted, const Limits &limits);
 
 } // namespace AddressPattern
-
-/// Addresses as numbers, the first part highest.
-namespace Ipv4 {
-
-/// The number of a whole address; nothing good for another text, so ask isAddress first.
-quint32 parse(const QString &address);
-QString toText(quint32 address);
-/// A mask whose ones stand before its zeros, with some of both.
-bool isMask(const QString &text);
-
-} // namespace Ipv4

@@ -43,7 +43,7 @@ int AssignIpModel::columnCount(const QModelIndex &parent) const {
 QVariant AssignIpModel::data(const QModelIndex &index, int role) const {
     if (role == Qt::EditRole && index.column() == NewColumn) {
         const quint32 address = m_assignment.address(itemAt(index.row()));
-        return address == 0 ? QString() : Ipv4::toText(address);
+        return address == 0 ? QString() : AddressPattern::textOf(address);
     }
     return CheckListModel::data(index, role);
 }
@@ -59,7 +59,7 @@ bool AssignIpModel::setData(const QModelIndex &index, const QVariant &value, int
         emit addressRefused(typed);
         return false;
     }
-    m_assignment.setTyped(itemAt(index.row()), typed.isEmpty() ? 0 : Ipv4::parse(typed));
+    m_assignment.setTyped(itemAt(index.row()), typed.isEmpty() ? 0 : AddressPattern::numberOf(typed));
     emit addressTyped();
     return true;
 }
@@ -85,7 +85,7 @@ QString AssignIpModel::text(int item, int column) const {
     if (m_automatic)
         return tr("Automatic");
     const quint32 address = m_assignment.address(item);
-    return address == 0 ? QStringLiteral("--") : Ipv4::toText(address);
+    return address == 0 ? QStringLiteral("--") : AddressPattern::textOf(address);
 }
 
 std::vector<int> AssignIpModel::find(const QString &search) const {

@@ -1,5 +1,7 @@
 #include "deviceexport.h"
 
+#include "spreadsheetcell.h"
+
 #include <QSaveFile>
 
 #include <nlohmann/json.hpp>
@@ -24,9 +26,10 @@ constexpr Field beforeNetworkType[] = {{DeviceColumn::HostName, "d_hostname"},
 constexpr Field afterNetworkType[] = {
     {DeviceColumn::Model, "d_model"}, {DeviceColumn::Mac, "d_mac"}, {DeviceColumn::Firmware, "d_fw"}};
 
-/// As it is, but that a line break would make two lines of a device.
-QByteArray inOneLine(QString text) {
-    return text.replace(QLatin1Char('\n'), QLatin1Char(' ')).remove(QLatin1Char('\r')).toUtf8();
+/// As it is, but that a line break would make two lines of a device, and that no cell is a formula.
+QByteArray cell(QString text) {
+    text.replace(QLatin1Char('\n'), QLatin1Char(' ')).remove(QLatin1Char('\r'));
+    return QByteArray::fromStdString(SpreadsheetCell::harmless(text.toStdString()));
 }
 
 /// What the table shows, which is the record's own text in all but odd records.
@@ -34,14 +37,14 @@ QByteArray value(const DeviceRecord &device, const Field &field) {
     QString text = device.text(field.column);
     if (text == QLatin1String("--"))
         text = stringMember(JSON::parse(device.json(), nullptr, false), field.member);
-    return inOneLine(text);
+    return cell(text);
 }
 
 void append(QByteArray &lines, const DeviceRecord &device) {
     lines += brand;
     for (const Field &field : beforeNetworkType)
         lines += ',' + value(device, field);
-    lines += ',' + inOneLine(device.networkType);
+    lines += ',' + cell(device.networkType);
     for (const Field &field : afterNetworkType)
         lines += ',' + value(device, field);
     lines += '\n';

@@ -1,6 +1,9 @@
 #include "devicerecord.h"
 
+#include "ipv4.h"
+#include "macaddress.h"
 #include "recordpool.h"
+#include "sitemembership.h"
 
 #include <QCoreApplication>
 
@@ -85,9 +88,7 @@ quint64 digitsKey(const QString &text) {
 }
 
 quint64 macKey(const QString &text) {
-    bool ok = false;
-    const quint64 key = QString(text).remove(u':').remove(u'-').remove(u'.').toULongLong(&ok, 16);
-    return ok ? key : DeviceRecord::unknownKey;
+    return MacAddress::parse(text.toLatin1().toStdString()).value_or(DeviceRecord::unknownKey);
 }
 
 /// One value of a record while it is read: text and sort key of a column.
@@ -146,25 +147,10 @@ QString audioText(const QString &audio) {
     return audio;
 }
 
-/// The site ids: an array, or a text that holds one.
 QStringList siteIdsOf(const JSON &record) {
-    const JSON *value = member(record, "siteid");
-    JSON parsed;
-    if (value && value->is_string()) {
-        try {
-            parsed = parseJson(value->get_ref<const std::string &>());
-        } catch (const std::exception &) {
-            return {};
-        }
-        value = &parsed;
-    }
     QStringList ids;
-    if (!value || !value->is_array())
-        return ids;
-    for (const JSON &id : *value) {
-        if (id.is_string())
-            ids.append(QString::fromStdString(id.get_ref<const std::string &>()));
-    }
+    for (const JSON &id : SiteMembership::siteIdsOf(record))
+        ids.append(QString::fromStdString(id.get_ref<const std::string &>()));
     return ids;
 }
 
@@ -231,30 +217,14 @@ std::shared_ptr<DeviceRecord> read(const JSON &value, RecordPool &pool) {
 } // namespace
 
 quint64 ipSortKey(QStringView text) {
-    quint64 key = 0;
-    int part = 0;
-    int digits = 0;
-    quint64 number = 0;
-    for (qsizetype i = 0; i <= text.size(); ++i) {
-        if (i == text.size() || text[i] == u'.') {
-            if (digits == 0 || number > 255 || ++part > 4)
-                return DeviceRecord::unknownKey;
-            key = key << 8 | number;
-            number = 0;
-            digits = 0;
-        } else if (text[i] >= u'0' && text[i] <= u'9' && ++digits <= 3) {
-            number = number * 10 + (text[i].unicode() - u'0');
-        } else {
-            return DeviceRecord::unknownKey;
-        }
-    }
-    return part == 4 ? key : DeviceRecord::unknownKey;
+    const std::optional<std::uint32_t> address = Ipv4::parse(text.toLatin1().toStdString());
+    return address ? *address : DeviceRecord::unknownKey;
 }
 
 QString identityOf(const JSON &value) {
     if (const QString id = stringMember(value, "id"); !id.isEmpty())
         return id;
-    return stringMember(value, "d_mac").toUpper().remove(u':').remove(u'-').remove(u'.');
+    return QString::fromStdString(MacAddress::plain(textMember(value, "d_mac")));
 }
 
 DeviceRecordPtr parse(const JSON &value) {

@@ -1,25 +1,20 @@
 #include "devicesearch.h"
 
+#include "macaddress.h"
+
 #include <algorithm>
 #include <array>
 #include <string_view>
 
 namespace {
 
-constexpr int macLength = 12;
+constexpr std::size_t macLength = 12;
 
 /// The digits of a MAC, or of a part of one; empty for anything else.
 QByteArray macDigitsOf(const QString &text) {
-    QByteArray digits;
-    for (const QChar c : text) {
-        if (c == u':' || c == u'-' || c == u'.')
-            continue;
-        const char letter = c.toUpper().toLatin1();
-        if (!std::isxdigit(static_cast<unsigned char>(letter)))
-            return {};
-        digits += letter;
-    }
-    return digits.size() >= 2 && digits.size() <= macLength ? digits : QByteArray();
+    const std::string digits = MacAddress::digits(text.toLatin1().toStdString());
+    return digits.size() >= 2 && digits.size() <= macLength ? QByteArray::fromStdString(digits)
+                                                            : QByteArray();
 }
 
 bool macContains(quint64 key, const QByteArray &digits) {
@@ -47,28 +42,34 @@ DeviceSearch::DeviceSearch(const QString &text, const QHash<QString, QString> &s
     }
 }
 
+/// A network, or a range whose ends are both addresses; the second may be the last number of one alone. A
+/// host name may begin with an address and a dash, too.
 bool DeviceSearch::readRange(const QString &text, Word &word) {
     const qsizetype slash = text.indexOf(QLatin1Char('/'));
-    const qsizetype dash = text.indexOf(QLatin1Char('-'));
-    const QStringView view(text);
-    const quint64 first = DeviceRecords::ipSortKey(view.left(slash > 0 ? slash : dash));
-    if ((slash <= 0 && dash <= 0) || first == DeviceRecord::unknownKey)
+    const qsizetype sign = slash > 0 ? slash : text.indexOf(QLatin1Char('-'));
+    if (sign <= 0)
+        return false;
+    const QStringView end = QStringView(text).mid(sign + 1);
+    const quint64 first = DeviceRecords::ipSortKey(QStringView(text).left(sign));
+    if (first == DeviceRecord::unknownKey)
         return false;
     bool isNumber = false;
+    const uint number = end.toUInt(&isNumber);
     if (slash > 0) {
-        const int bits = view.mid(slash + 1).toInt(&isNumber);
-        if (!isNumber || bits < 0 || bits > 32)
+        if (!isNumber || number > 32)
             return false;
-        const quint64 hosts = (quint64{1} << (32 - bits)) - 1;
+        const quint64 hosts = (quint64{1} << (32 - number)) - 1;
         word.firstIp = first & ~hosts;
         word.lastIp = word.firstIp | hosts;
         return true;
     }
-    const QStringView end = view.mid(dash + 1);
-    const uint last = end.toUInt(&isNumber);
+    const quint64 last =
+        isNumber && number <= 255 ? (first & ~quint64{255}) | number : DeviceRecords::ipSortKey(end);
+    if (last == DeviceRecord::unknownKey)
+        return false;
     word.firstIp = first;
-    word.lastIp = isNumber && last <= 255 ? (first & ~quint64{255}) | last : DeviceRecords::ipSortKey(end);
-    return word.lastIp != DeviceRecord::unknownKey;
+    word.lastIp = last;
+    return true;
 }
 
 bool DeviceSearch::matches(const DeviceRecord &device) const {

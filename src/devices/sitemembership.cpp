@@ -23,19 +23,6 @@ JSON parsed(std::string_view text) {
     }
 }
 
-/// The site ids of a record: an array, or a text that holds one.
-JSON siteIdsOf(const JSON &record) {
-    const auto found = record.find(siteMember);
-    if (found == record.end())
-        return JSON::array();
-    JSON ids = found->is_string() ? parsed(found->get_ref<const std::string &>()) : *found;
-    if (!ids.is_array())
-        return JSON::array();
-    ids.erase(std::remove_if(ids.begin(), ids.end(), [](const JSON &id) { return !id.is_string(); }),
-              ids.end());
-    return ids;
-}
-
 bool holds(const JSON &ids, const std::string &id) {
     return std::find(ids.begin(), ids.end(), JSON(id)) != ids.end();
 }
@@ -71,6 +58,18 @@ std::vector<DeviceOutcome> changeSites(const JSON &records, JSON &changed, const
 }
 
 } // namespace
+
+JSON siteIdsOf(const JSON &record) {
+    const auto found = record.find(siteMember);
+    if (found == record.end())
+        return JSON::array();
+    JSON ids = found->is_string() ? parsed(found->get_ref<const std::string &>()) : *found;
+    if (!ids.is_array())
+        return JSON::array();
+    ids.erase(std::remove_if(ids.begin(), ids.end(), [](const JSON &id) { return !id.is_string(); }),
+              ids.end());
+    return ids;
+}
 
 QByteArray encode(const DraggedDevices &devices) {
     JSON ids = JSON::array();

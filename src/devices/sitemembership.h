@@ -16,6 +16,9 @@ namespace SiteMembership {
 /// What a device table drags.
 inline const QString mimeType = QStringLiteral("application/x-nvldm-devices");
 
+/// The site ids of a device's record, an array or a text that holds one, as an array of texts.
+JSON siteIdsOf(const JSON &record);
+
 struct DraggedDevices {
     QString sourceSiteId; ///< the site that the table shows; the overview's id where it shows all
     QStringList deviceIds;

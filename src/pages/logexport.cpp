@@ -1,5 +1,7 @@
 #include "logexport.h"
 
+#include "spreadsheetcell.h"
+
 #include <QDebug>
 #include <QSaveFile>
 
@@ -16,6 +18,7 @@ constexpr qsizetype blockSize = 1 << 20;
 void append(QByteArray &lines, QString field) {
     field.replace(QLatin1String("\r\n"), QLatin1String(" "));
     field.replace(QLatin1Char('\n'), QLatin1Char(' ')).replace(QLatin1Char('\r'), QLatin1Char(' '));
+    field = QString::fromStdString(SpreadsheetCell::harmless(field.toStdString()));
     if (field.contains(QLatin1Char(',')) || field.contains(QLatin1Char('"')))
         field =
             QLatin1Char('"') + field.replace(QLatin1String("\""), QLatin1String("\"\"")) + QLatin1Char('"');

@@ -1,5 +1,7 @@
 #include "tasktargets.h"
 
+#include "macaddress.h"
+
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
@@ -74,10 +76,7 @@ JSON onlyFilesOf(const JSON &files, const QSet<QString> &macs) {
 }
 
 QString plainMac(const QString &mac) {
-    QString plain;
-    std::copy_if(mac.begin(), mac.end(), std::back_inserter(plain),
-                 [](QChar each) { return each.isLetterOrNumber(); });
-    return plain.toLower();
+    return QString::fromStdString(MacAddress::plain(mac.toLatin1().toStdString()));
 }
 
 } // namespace TaskTargets

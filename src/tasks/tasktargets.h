@@ -22,7 +22,7 @@ JSON withMembers(const JSON &devices, const JSON &record, std::initializer_list<
 JSON only(const JSON &devices, const QStringList &deviceIds);
 /// The files whose device has one of the addresses, and those of no certain device.
 JSON onlyFilesOf(const JSON &files, const QSet<QString> &macs);
-/// An address without case and separators.
+/// The twelve digits of a MAC address in upper case; empty for any other text.
 QString plainMac(const QString &mac);
 
 } // namespace TaskTargets

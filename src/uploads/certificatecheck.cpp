@@ -15,7 +15,6 @@ using Finding = CertificateFinding;
 using Findings = CertificateFindings;
 
 constexpr const char *context = "CertificateCheck";
-constexpr qsizetype macDigits = 12;
 
 struct Text {
     Finding finding;
@@ -84,8 +83,7 @@ Findings judgeFiles(const CertificatePair &pair, CertificateNeeds needs) {
 
 bool hasAddress(const DeviceRecord &device) {
     const quint64 mac = device.sortKey(DeviceColumn::Mac);
-    // A shorter text is a number too, but no address.
-    return mac != 0 && mac != DeviceRecord::unknownKey && device.text(DeviceColumn::Mac).size() >= macDigits;
+    return mac != 0 && mac != DeviceRecord::unknownKey;
 }
 
 bool needsKey(CertificateNeeds needs) {

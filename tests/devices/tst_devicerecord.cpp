@@ -156,24 +156,6 @@ private slots:
         QCOMPARE(DeltaText(nullptr, text.toStdString()).text(), text.toStdString());
     }
 
-    void ipSortKey_data() {
-        QTest::addColumn<QString>("text");
-        QTest::addColumn<quint64>("key");
-        QTest::newRow("lowest") << "0.0.0.0" << quint64(0);
-        QTest::newRow("highest") << "255.255.255.255" << quint64(0xFFFFFFFF);
-        QTest::newRow("parts") << "1.2.3.4" << quint64(0x01020304);
-        QTest::newRow("leading zeros") << "010.000.0.09" << quint64(0x0A000009);
-        for (const char *text : {"", ".", "1.2.3", "1.2.3.", ".1.2.3.4", "1..3.4", "1.2.3.4.5", "256.0.0.1",
-                                 "1.2.3.4 ", " 1.2.3.4", "1.2.3.-4", "+1.2.3.4", "1.2.3.0x4", "0001.2.3.4",
-                                 "99999999999999999999.1.1.1", "a.b.c.d", "::1", "--", "\xef\xbc\x91.2.3.4"})
-            QTest::newRow(qPrintable(u'"' + QString::fromUtf8(text) + u'"'))
-                << QString::fromUtf8(text) << none;
-    }
-    void ipSortKey() {
-        QFETCH(QString, text);
-        QTEST(DeviceRecords::ipSortKey(text), "key");
-    }
-
     void ipItemsCompareByNumbers() {
         const auto less = [](const char *left, const char *right) {
             return SortableIpTableWidgetItem(QString::fromLatin1(left)) <

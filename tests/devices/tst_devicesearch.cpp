@@ -13,7 +13,7 @@ DeviceRecordPtr gate() {
                                  {"d_mac", "00:1A:07:10:04:0B"},
                                  {"d_ip", "10.4.0.11"},
                                  {"d_model", "NC-9381"},
-                                 {"d_hostname", "gate-east"},
+                                 {"d_hostname", "gate-east 10.4.0.5-cam"},
                                  {"d_fw", "2.4.1"},
                                  {"d_http", 80},
                                  {"d_https", "443"},
@@ -46,6 +46,11 @@ private slots:
             {"10.4.0.12-20", false},
             {"10.4.0.9-10.4.2.1", true},
             {"10.4.2.1-10.4.0.9", false},
+            {"10.4.0.5-cam", true},
+            {"10.4.0.6-cam", false},
+            {"10.4.0.9-", false},
+            {"10.4.0.5-", true},
+            {"10.4.0.5-cam/24", false},
             {"001a0710", true},
             {"1a-07-10", true},
             {"00.1a.07", true},
@@ -72,12 +77,13 @@ private slots:
         const DeviceSnapshot devices(
             {gate(),
              DeviceRecords::parse(
-                 {{"id", "DV2"}, {"d_ip", "odd"}, {"d_hostname", "a,b\r\nc"}, {"d_nettype", " a  b"}})});
-        QCOMPARE(DeviceExport::text(devices, {1, 0}),
-                 QByteArray(
-                     "Brand,Host name,IP,HTTP port,HTTPS port,Network type,Model name,MAC,Firmware version\n"
-                     "Norvell,a,b c,odd,,, a  b,,,\n"
-                     "Norvell,gate-east,10.4.0.11,80,443,dhcp,NC-9381,00:1A:07:10:04:0B,2.4.1\n"));
+                 {{"id", "DV2"}, {"d_ip", "odd"}, {"d_hostname", "a,b\r\nc"}, {"d_nettype", "=a  b"}})});
+        QCOMPARE(
+            DeviceExport::text(devices, {1, 0}),
+            QByteArray(
+                "Brand,Host name,IP,HTTP port,HTTPS port,Network type,Model name,MAC,Firmware version\n"
+                "Norvell,a,b c,odd,,,'=a  b,,,\n"
+                "Norvell,gate-east 10.4.0.5-cam,10.4.0.11,80,443,dhcp,NC-9381,00:1A:07:10:04:0B,2.4.1\n"));
         QVERIFY(!DeviceExport::text(devices, {}).contains("Norvell"));
     }
 
