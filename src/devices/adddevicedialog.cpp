@@ -7,6 +7,7 @@
 #include "filedialogs.h"
 #include "icons.h"
 #include "lastfolder.h"
+#include "macaddress.h"
 #include "pagereader.h"
 #include "sitelist.h"
 #include "transientmessage.h"
@@ -15,6 +16,7 @@
 #include <QAction>
 #include <QDebug>
 #include <QFileInfo>
+#include <QLocale>
 #include <QThreadPool>
 
 #include <nlohmann/json.hpp>
@@ -32,7 +34,7 @@ struct AddDeviceDialog::Addition {
 namespace {
 
 std::string macOf(const JSON &record) {
-    return DeviceRecords::identityOf({{"d_mac", std::string(textMember(record, "d_mac"))}}).toStdString();
+    return MacAddress::plain(textMember(record, "d_mac"));
 }
 
 unsigned readMacs(ServiceSession &session, std::unordered_set<std::string> &macs) {
@@ -54,10 +56,12 @@ JSON recordToAdd(const DeviceRecord &device) {
     return record;
 }
 
+/// The records as an array; of very many the first ones, since all of them are one line of the log.
 QByteArray listText(const std::vector<DeviceRecordPtr> &devices) {
+    constexpr std::size_t maxListed = 1000;
     QByteArray text = "[";
-    for (const DeviceRecordPtr &device : devices)
-        text.append(text.size() > 1 ? "," : "").append(QByteArray::fromStdString(device->json()));
+    for (std::size_t i = 0; i < devices.size() && i < maxListed; ++i)
+        text.append(text.size() > 1 ? "," : "").append(QByteArray::fromStdString(devices[i]->json()));
     return text + ']';
 }
 
@@ -109,7 +113,9 @@ AddDeviceDialog::AddDeviceDialog(const DeviceSnapshotPtr &managed, QWidget *pare
     setManaged(managed);
 }
 
-AddDeviceDialog::~AddDeviceDialog() = default;
+AddDeviceDialog::~AddDeviceDialog() {
+    m_stopReading.request_stop();
+}
 
 void AddDeviceDialog::setManaged(const DeviceSnapshotPtr &managed) {
     m_managed = managed;
@@ -183,10 +189,15 @@ void AddDeviceDialog::onDeviceManualDiscovery(DeviceDiscovery::Method method, co
 void AddDeviceDialog::onFound(const DeviceDiscovery::Search &search,
                               const std::vector<DeviceRecordPtr> &devices) {
     const bool isManual = search.method != DeviceDiscovery::Method::Network;
-    const int added = m_model->add(devices, isManual ? DeviceSource::Manual : DeviceSource::Network);
-    m_knownFound = static_cast<int>(devices.size()) - added;
+    const DiscoveredModel::Added added =
+        m_model->add(devices, isManual ? DeviceSource::Manual : DeviceSource::Network);
+    m_knownFound = added.known;
     updateState();
-    if (!isManual || added > 0)
+    if (added.withoutMac > 0)
+        return m_warning.setText(
+            tr("%n device(s) without a good MAC address answered, which cannot be added.", nullptr,
+               added.withoutMac));
+    if (!isManual || added.taken > 0)
         return;
     if (!devices.empty())
         m_warning.setText(tr("What was found there is managed or listed already."));
@@ -216,7 +227,7 @@ void AddDeviceDialog::runOnFile(const QString &path, Work work, Done done) {
 
 void AddDeviceDialog::importCsv(const QString &path) {
     runOnFile(
-        path, [path] { return CsvDevices::readFile(path); },
+        path, [path, stop = m_stopReading.get_token()] { return CsvDevices::readFile(path, stop); },
         [this, path](const CsvDevices::Reading &reading) { onCsvRead(QFileInfo(path).fileName(), reading); });
 }
 
@@ -235,8 +246,7 @@ void AddDeviceDialog::onCsvRead(const QString &name, const CsvDevices::Reading &
     if (!reading.error.isEmpty())
         return m_warning.setText(tr("The file \"%1\" could not be read: %2.").arg(name, reading.error));
     logImported(reading.devices, m_model->devices());
-    const int added = m_model->add(reading.devices, DeviceSource::File);
-    const int known = static_cast<int>(reading.devices.size()) - added;
+    const auto [added, known, withoutMac] = m_model->add(reading.devices, DeviceSource::File);
     if (added > 0)
         tell(tr("%n device(s) added to the list.", nullptr, added), TransientMessage::Kind::Success);
     if (reading.devices.empty() && reading.refused.empty())
@@ -248,8 +258,11 @@ void AddDeviceDialog::onCsvRead(const QString &name, const CsvDevices::Reading &
     std::vector<InvalidDeviceDialog::Entry> entries;
     for (const CsvDevices::RefusedRow &row : reading.refused)
         entries.push_back({tr("Line %1").arg(row.line), row.reason});
-    const int refused = static_cast<int>(entries.size());
-    listInvalid(tr("%n row(s) of the file \"%1\" could not be read.", nullptr, refused).arg(name), entries);
+    QString message =
+        tr("%n row(s) of the file \"%1\" could not be read.", nullptr, reading.refusedCount).arg(name);
+    if (reading.refusedCount > static_cast<int>(entries.size()))
+        message += QLatin1Char(' ') + tr("The first %1 are listed.").arg(QLocale().toString(entries.size()));
+    listInvalid(message, entries);
 }
 
 void AddDeviceDialog::on_addButton_clicked() {

@@ -9,6 +9,7 @@
 
 #include <functional>
 #include <memory>
+#include <stop_token>
 
 namespace CsvDevices {
 struct Reading;
@@ -86,7 +87,8 @@ private:
     DeviceSnapshotPtr m_managed;
     bool m_searched = false; ///< at least once
     bool m_adding = false;
-    bool m_onFile = false; ///< a job on a file runs
-    QString m_failure;     ///< of the last search
-    int m_knownFound = 0;  ///< devices that the last search found and the list did not take
+    bool m_onFile = false;          ///< a job on a file runs
+    std::stop_source m_stopReading; ///< ends it with the dialog
+    QString m_failure;              ///< of the last search
+    int m_knownFound = 0;           ///< devices that the last search found and the list did not take
 };

@@ -1,10 +1,14 @@
 #include "csvdevices.h"
 
+#include "ipv4.h"
+#include "macaddress.h"
+#include "spreadsheetcell.h"
+
 #include <QCoreApplication>
 #include <QDebug>
 #include <QFileInfo>
 #include <QHash>
-#include <QRegularExpression>
+#include <QLocale>
 #include <QSaveFile>
 #include <QThreadPool>
 
@@ -21,6 +25,8 @@ constexpr const char *recordTemplate =
     R"({"d_apstate":0,"d_camid":"","d_camname":"","d_cport":0,"d_ezver":"","d_ftp":0,"d_http":0,"d_https":0,)"
     R"("d_ip":"","d_iscsvc":0,"d_lang":"","d_mac":"","d_model":"","d_netcip":"","d_svrtype":"","id":"",)"
     R"("siteid":"[\"DO000000000000\"]"})";
+constexpr int maxLoggedRows = 1000;
+constexpr int maxLoggedFields = 32;
 constexpr const char *exampleFile = "Model,IP,MAC,HTTP Port,HTTPS Port\r\n"
                                     "Example Camera,192.0.2.10,00-00-5E-00-53-01,80,443\r\n";
 
@@ -39,23 +45,37 @@ struct Layout {
 
 struct Row {
     int line;
-    QByteArray bytes;
+    QByteArrayView bytes;
 };
 
-std::vector<Row> rowsOf(const QByteArray &text) {
-    std::vector<Row> rows;
-    qsizetype from = text.startsWith("\xEF\xBB\xBF") ? 3 : 0;
-    for (int line = 1; from < text.size(); ++line) {
-        const qsizetype end = text.indexOf('\n', from);
-        const qsizetype to = end < 0 ? text.size() : end;
-        QByteArray bytes = text.mid(from, to - from);
-        if (bytes.endsWith('\r'))
-            bytes.chop(1);
-        if (!bytes.trimmed().isEmpty())
-            rows.push_back({line, bytes});
-        from = to + 1;
+/// Goes through the rows of a text that are not blank, without a copy of it.
+class Rows {
+public:
+    explicit Rows(const QByteArray &text) : m_text(text), m_from(text.startsWith("\xEF\xBB\xBF") ? 3 : 0) {}
+
+    std::optional<Row> next() {
+        while (m_from < m_text.size()) {
+            const qsizetype end = m_text.indexOf('\n', m_from);
+            const qsizetype to = end < 0 ? m_text.size() : end;
+            QByteArrayView bytes = m_text.sliced(m_from, to - m_from);
+            m_from = to + 1;
+            ++m_line;
+            if (bytes.endsWith('\r'))
+                bytes.chop(1);
+            if (!bytes.trimmed().isEmpty())
+                return Row{m_line, bytes};
+        }
+        return std::nullopt;
     }
-    return rows;
+
+private:
+    QByteArrayView m_text;
+    qsizetype m_from;
+    int m_line = 0;
+};
+
+bool isTooLong(const Row &row) {
+    return row.bytes.size() > rowSizeLimit;
 }
 
 /// The fields of a row; nothing where a quotation mark stays open.
@@ -117,22 +137,8 @@ std::optional<int> portOf(const QString &text) {
 
 /// The address without leading zeros, which some would read as octal.
 QString addressOf(const QString &text) {
-    const quint64 key = DeviceRecords::ipSortKey(text);
-    if (key == DeviceRecord::unknownKey)
-        return {};
-    return QStringLiteral("%1.%2.%3.%4")
-        .arg(key >> 24)
-        .arg(key >> 16 & 255)
-        .arg(key >> 8 & 255)
-        .arg(key & 255);
-}
-
-bool isMac(const QString &text) {
-    static const QRegularExpression form(
-        QStringLiteral("^(?:[0-9a-f]{2}([:-]?)[0-9a-f]{2}(?:\\1[0-9a-f]{2}){4}|"
-                       "[0-9a-f]{4}\\.[0-9a-f]{4}\\.[0-9a-f]{4})$"),
-        QRegularExpression::CaseInsensitiveOption);
-    return form.match(text).hasMatch();
+    const std::optional<std::uint32_t> address = Ipv4::parse(text.toLatin1().toStdString());
+    return address ? QString::fromStdString(Ipv4::toText(*address)) : QString();
 }
 
 /// A value as a reason quotes it.
@@ -148,13 +154,18 @@ public:
 
     void take(const Row &row) {
         QString reason = refusal(row);
-        if (!reason.isEmpty())
+        if (reason.isEmpty())
+            return;
+        ++m_reading.refusedCount;
+        if (m_reading.refused.size() < maxRefusedKept)
             m_reading.refused.push_back({row.line, std::move(reason)});
     }
     Reading &reading() { return m_reading; }
 
 private:
     QString refusal(const Row &row) {
+        if (isTooLong(row))
+            return Text::tr("The row is longer than %1 characters.").arg(rowSizeLimit);
         const QString text = QString::fromUtf8(row.bytes);
         if (text.contains(QChar::ReplacementCharacter))
             return Text::tr("The row is not UTF-8 text.");
@@ -162,7 +173,8 @@ private:
         if (!fields)
             return Text::tr("A quotation mark is not closed.");
         if (fields->size() != m_layout.columns) {
-            qDebug("invalid column number in csv file");
+            if (m_reading.refused.size() < maxRefusedKept)
+                qDebug("invalid column number in csv file");
             return Text::tr("The row has %n column(s) in place of %1.", nullptr,
                             static_cast<int>(fields->size()))
                 .arg(m_layout.columns);
@@ -171,7 +183,7 @@ private:
     }
 
     QString refusal(const QStringList &fields, int line) {
-        const auto value = [&](Field field) { return fields[m_layout.places[field]]; };
+        const auto value = [&](Field field) -> const QString & { return fields[m_layout.places[field]]; };
         for (const Field field : {HttpPort, HttpsPort}) {
             if (!portOf(value(field)))
                 return Text::tr("\"%1\" is no port from 1 to 65535.").arg(quoted(value(field)));
@@ -179,7 +191,7 @@ private:
         const QString ip = addressOf(value(Ip));
         if (ip.isEmpty())
             return Text::tr("\"%1\" is no IPv4 address.").arg(quoted(value(Ip)));
-        if (!isMac(value(Mac)))
+        if (!MacAddress::parse(value(Mac).toLatin1().toStdString()))
             return Text::tr("\"%1\" is no MAC address.").arg(quoted(value(Mac)));
         static const JSON blank = JSON::parse(recordTemplate);
         JSON record = blank;
@@ -187,13 +199,13 @@ private:
         record["d_https"] = *portOf(value(HttpsPort));
         record["d_ip"] = ip.toStdString();
         record["d_mac"] = value(Mac).toStdString();
-        record["d_model"] = value(Model).simplified().toStdString();
+        record["d_model"] = SpreadsheetCell::original(value(Model).simplified().toStdString());
         const DeviceRecordPtr device = DeviceRecords::parse(record);
         const int first = m_lines.value(device->id, line);
         m_lines.insert(device->id, first);
         if (first != line)
             return Text::tr("The MAC address \"%1\" stands in line %2 already.")
-                .arg(value(Mac), QString::number(first));
+                .arg(quoted(value(Mac)), QString::number(first));
         m_reading.devices.push_back(device);
         return {};
     }
@@ -203,20 +215,28 @@ private:
     QHash<QString, int> m_lines; ///< of the devices, by their identities
 };
 
+/// The first rows of a file: each of them is several lines of the log.
 void logRows(const QByteArray &text) {
-    for (const Row &row : rowsOf(text)) {
-        if (row.line == 1 || QCoreApplication::closingDown())
+    Rows rows(text);
+    rows.next();
+    int left = maxLoggedRows;
+    while (const std::optional<Row> row = rows.next()) {
+        if (QCoreApplication::closingDown())
+            return;
+        if (left-- == 0)
+            return qDebug("The csv file has more rows, which are not logged");
+        if (isTooLong(*row))
             continue;
-        qDebug("row data at row %d: %s", row.line - 1, row.bytes.constData());
-        const QStringList fields = fieldsOf(QString::fromUtf8(row.bytes)).value_or(QStringList());
+        qDebug("row data at row %d: %s", row->line - 1, row->bytes.toByteArray().constData());
+        const QStringList fields = fieldsOf(QString::fromUtf8(row->bytes)).value_or(QStringList());
         qDebug("column data size: %d", static_cast<int>(fields.size()));
-        for (int i = 0; i < fields.size(); ++i)
-            qDebug("column data (%d, %d): %s", row.line - 1, i, qUtf8Printable(fields[i]));
+        for (int i = 0; i < fields.size() && i < maxLoggedFields; ++i)
+            qDebug("column data (%d, %d): %s", row->line - 1, i, qUtf8Printable(fields[i]));
     }
 }
 
 Reading failure(const QString &error) {
-    return {{}, {}, error};
+    return {{}, {}, 0, error};
 }
 
 Reading tooLarge() {
@@ -225,31 +245,44 @@ Reading tooLarge() {
 
 } // namespace
 
-Reading parse(const QByteArray &text) {
+Reading parse(const QByteArray &text, const std::stop_token &stop) {
     if (text.size() > sizeLimit)
         return tooLarge();
     if (text.contains('\0'))
         return failure(Text::tr("it is no text file"));
-    const std::vector<Row> rows = rowsOf(text);
-    if (rows.empty())
+    Rows rows(text);
+    const std::optional<Row> header = rows.next();
+    if (!header)
         return {};
-    const Layout layout = layoutOf(fieldsOf(QString::fromUtf8(rows.front().bytes)).value_or(QStringList()));
+    const Layout layout = isTooLong(*header)
+                              ? Layout()
+                              : layoutOf(fieldsOf(QString::fromUtf8(header->bytes)).value_or(QStringList()));
     Reader reader(layout);
-    for (std::size_t i = 1; i < rows.size(); ++i)
-        reader.take(rows[i]);
+    int count = 0;
+    while (const std::optional<Row> row = rows.next()) {
+        if (++count > rowLimit)
+            return failure(Text::tr("it has more than %1 rows").arg(QLocale().toString(rowLimit)));
+        if (stop.stop_requested())
+            return {};
+        reader.take(*row);
+    }
     Reading &reading = reader.reading();
+    if (reading.refusedCount > 0)
+        qDebug("rows of the csv file that were refused: %d", reading.refusedCount);
     if (layout.isNamed)
         return reading;
     // A list that begins with a device at once would lose that one without a word.
     Reader first(layout);
-    first.take(rows.front());
-    if (!first.reading().devices.empty())
+    first.take(*header);
+    if (!first.reading().devices.empty()) {
+        ++reading.refusedCount;
         reading.refused.insert(reading.refused.begin(),
-                               {rows.front().line, Text::tr("The first line is read as the header.")});
+                               {header->line, Text::tr("The first line is read as the header.")});
+    }
     return reading;
 }
 
-Reading readFile(const QString &path) {
+Reading readFile(const QString &path, const std::stop_token &stop) {
     QFile file(path);
     // Anything but a file, a pipe for one, may never come to an end.
     if (!QFileInfo(path).isFile())
@@ -259,8 +292,8 @@ Reading readFile(const QString &path) {
     const QByteArray text = file.read(sizeLimit + 1);
     if (file.error() != QFileDevice::NoError)
         return failure(file.errorString());
-    Reading reading = parse(text);
-    if (reading.error.isEmpty())
+    Reading reading = parse(text, stop);
+    if (reading.error.isEmpty() && !stop.stop_requested())
         QThreadPool::globalInstance()->start([text] { logRows(text); });
     return reading;
 }

@@ -4,6 +4,7 @@
 
 #include <QByteArray>
 
+#include <stop_token>
 #include <vector>
 
 /// Reads devices from a file that a spreadsheet has written: comma-separated UTF-8, the first line is the
@@ -15,6 +16,11 @@
 namespace CsvDevices {
 
 inline constexpr qint64 sizeLimit = 64 << 20;
+inline constexpr int rowLimit = 100'000;
+/// Longer rows are refused unread.
+inline constexpr qsizetype rowSizeLimit = 8192;
+/// So many refused rows are kept with their reasons; the others are counted.
+inline constexpr std::size_t maxRefusedKept = 1000;
 
 struct RefusedRow {
     int line; ///< counted from 1
@@ -24,13 +30,15 @@ struct RefusedRow {
 struct Reading {
     std::vector<DeviceRecordPtr> devices;
     std::vector<RefusedRow> refused;
-    QString error; ///< why the file as a whole was refused; empty where it was read
+    int refusedCount = 0; ///< those that were not kept among them
+    QString error;        ///< why the file as a whole was refused; empty where it was read
 };
 
-Reading parse(const QByteArray &text);
+/// A stop ends the reading early; what comes back then is of no use.
+Reading parse(const QByteArray &text, const std::stop_token &stop = {});
 
 /// Reads and parses a file, and logs its rows.
-Reading readFile(const QString &path);
+Reading readFile(const QString &path, const std::stop_token &stop = {});
 
 /// Writes an example of such a file, whole or not at all; returns what went wrong, or an empty text.
 QString writeTemplate(const QString &path);

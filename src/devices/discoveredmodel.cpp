@@ -12,10 +12,9 @@ constexpr DeviceColumn deviceColumns[DiscoveredModel::columnTotal] = {
     DeviceColumn::Status, DeviceColumn::Model,    DeviceColumn::Ip,
     DeviceColumn::Mac,    DeviceColumn::HttpPort, DeviceColumn::HttpsPort};
 
-/// The MAC address as devices are told apart by; empty where there is none.
-QString macOf(const DeviceRecord &device) {
-    QString mac = device.text(DeviceColumn::Mac).toUpper();
-    return mac.removeIf([](QChar c) { return c == u':' || c == u'-' || c == u'.' || c.isSpace(); });
+/// The MAC address, by which devices are told apart; unknownKey where there is none.
+quint64 macOf(const DeviceRecord &device) {
+    return device.sortKey(DeviceColumn::Mac);
 }
 
 struct Taken {
@@ -58,7 +57,7 @@ int DiscoveredModel::setManaged(const DeviceSnapshot &managed) {
     std::vector<Entry> left;
     std::vector<int> checked;
     for (int item = 0; item < itemCount(); ++item) {
-        const QString mac = macOf(*entry(item).record);
+        const quint64 mac = macOf(*entry(item).record);
         if (m_managed.contains(mac)) {
             m_listed.remove(mac);
             continue;
@@ -85,30 +84,31 @@ void DiscoveredModel::clear() {
     setItemCount(0, false);
 }
 
-int DiscoveredModel::add(const std::vector<DeviceRecordPtr> &devices, DeviceSource source) {
+DiscoveredModel::Added DiscoveredModel::add(const std::vector<DeviceRecordPtr> &devices,
+                                            DeviceSource source) {
     std::vector<Taken> taken;
-    const std::size_t before = m_devices.size();
-    int nameless = 0;
+    Added added;
     for (const DeviceRecordPtr &device : devices) {
+        const quint64 mac = macOf(*device);
         // Without a MAC address nobody can tell whether the device is managed already.
-        if (device->text(DeviceColumn::Mac) == QLatin1String("--")) {
-            ++nameless;
+        if (mac == DeviceRecord::unknownKey) {
+            ++added.withoutMac;
             continue;
         }
-        const QString mac = macOf(*device);
         const bool isNew = !m_managed.contains(mac) && !m_listed.contains(mac);
+        ++(isNew ? added.taken : added.known);
         taken.push_back({device, isNew});
         if (!isNew)
             continue;
         m_listed.insert(mac);
         m_devices.push_back({device, source});
     }
-    if (nameless > 0)
-        qWarning("%d devices have no MAC address and are not listed", nameless);
+    if (added.withoutMac > 0)
+        qWarning("%d devices have no MAC address and are not listed", added.withoutMac);
     log(std::move(taken));
-    if (m_devices.size() > before)
+    if (added.taken > 0)
         setItemCount(static_cast<int>(m_devices.size()), false);
-    return static_cast<int>(m_devices.size() - before);
+    return added;
 }
 
 std::vector<DeviceRecordPtr> DiscoveredModel::devices() const {

@@ -31,8 +31,14 @@ public:
     /// The devices that the service manages now. Takes those out of the list and returns how many they were.
     int setManaged(const DeviceSnapshot &managed);
     void clear();
-    /// Takes what is new among the devices; returns how many that were.
-    int add(const std::vector<DeviceRecordPtr> &devices, DeviceSource source);
+    /// What became of found devices.
+    struct Added {
+        int taken = 0;
+        int known = 0; ///< managed or listed already
+        int withoutMac = 0;
+    };
+    /// Takes what is new among the devices.
+    Added add(const std::vector<DeviceRecordPtr> &devices, DeviceSource source);
 
     /// All devices of the list, also those that the search hides.
     std::vector<DeviceRecordPtr> devices() const;
@@ -54,7 +60,7 @@ private:
 
     const Entry &entry(int item) const { return m_devices[static_cast<std::size_t>(item)]; }
 
-    QSet<QString> m_managed; ///< MAC addresses
-    QSet<QString> m_listed;
+    QSet<quint64> m_managed; ///< MAC addresses
+    QSet<quint64> m_listed;
     std::vector<Entry> m_devices;
 };

@@ -102,11 +102,17 @@ private slots:
         };
         DiscoveredModel model;
         model.setManaged(*DeviceMaker::snapshot({DeviceMaker::record(1, {{"d_mac", "AA:BB:CC:DD:EE:01"}})}));
-        QCOMPARE(model.add(devices({{100, "aabbccddee01"}, {100, "aa-bb-cc-dd-ee-02"}, {20, "AABBCCDDEE03"}}),
-                           DeviceSource::Network),
-                 2);
-        QCOMPARE(model.add(devices({{9, "AA:BB:CC:DD:EE:02"}, {9, "aabb.ccdd.ee04"}}), DeviceSource::File),
-                 1);
+        const auto found =
+            model.add(devices({{100, "aabbccddee01"}, {100, "aa-bb-cc-dd-ee-02"}, {20, "AABBCCDDEE03"}}),
+                      DeviceSource::Network);
+        QVERIFY(found.taken == 2 && found.known == 1 && found.withoutMac == 0);
+        JSON unnamed = {{"id", "DV9"}, {"d_mac", "none"}};
+        std::vector<DeviceRecordPtr> more = devices({{9, "AA BB CC DD EE 02"}, {9, "aabb.ccdd.ee04"}});
+        more.push_back(DeviceRecords::parse(unnamed));
+        unnamed.erase("d_mac");
+        more.push_back(DeviceRecords::parse(unnamed));
+        const auto others = model.add(more, DeviceSource::File);
+        QVERIFY(others.taken == 1 && others.known == 1 && others.withoutMac == 2);
         const auto addresses = [&model] {
             QStringList texts;
             for (int row = 0; row < model.rowCount(); ++row)

@@ -73,7 +73,7 @@ private slots:
             {"80,443,10.0.0.256,001122334466,N", "\"10.0.0.256\" is no IPv4 address."},
             {"80,443,camera,001122334466,N", "\"camera\" is no IPv4 address."},
             {"80,443,10.0.0.2,00:11:22:33:44,N", "\"00:11:22:33:44\" is no MAC address."},
-            {"80,443,10.0.0.2,00:11-22:33:44:66,N", "\"00:11-22:33:44:66\" is no MAC address."},
+            {"80,443,10.0.0.2,00:11:22:33:44:66:77,N", "\"00:11:22:33:44:66:77\" is no MAC address."},
             {"80,443,10.0.0.2,001122334455,N", "The MAC address \"001122334455\" stands in line 2 already."},
             {"80,443,10.0.0.2,001122334466,\"N", "A quotation mark is not closed."},
             {"80,443,10.0.0.2,001122334466,\xE4", "The row is not UTF-8 text."}};
@@ -116,6 +116,32 @@ private slots:
         QTRY_COMPARE(log.count("column data (1, 4): 443"), 1);
         QCOMPARE(log.count("row data at row 1: Example Camera,192.0.2.10,"), 1);
         QVERIFY(!CsvDevices::writeTemplate(m_root.filePath("missing/example.csv")).isEmpty());
+    }
+
+    void hostileFilesCostLittle() {
+        // Rows of nothing but separators, short ones by the thousand, and one that is the whole file.
+        const CsvDevices::Reading rows =
+            CsvDevices::parse(header + QByteArray(QByteArray(79, ',') + '\n').repeated(CsvDevices::rowLimit));
+        QCOMPARE(rows.refusedCount, CsvDevices::rowLimit);
+        QCOMPARE(rows.refused.size(), CsvDevices::maxRefusedKept);
+        QCOMPARE(CsvDevices::parse(header + QByteArray("x\n").repeated(CsvDevices::rowLimit + 1)).error,
+                 QStringLiteral("it has more than 100,000 rows"));
+        const CsvDevices::Reading one = CsvDevices::parse(header + QByteArray(8 << 20, ','));
+        QCOMPARE(one.refused.at(0).reason, QStringLiteral("The row is longer than 8192 characters."));
+        QVERIFY(CsvDevices::parse(QByteArray(8 << 20, ',') + '\n' + row).refused.empty());
+        std::stop_source stop;
+        stop.request_stop();
+        QVERIFY(CsvDevices::parse(header + row, stop.get_token()).devices.empty());
+
+        const LogCapture log;
+        QFile file(m_root.filePath("rows.csv"));
+        QVERIFY(file.open(QIODevice::WriteOnly));
+        file.write(header + QByteArray("a,b\n").repeated(50000));
+        file.close();
+        CsvDevices::readFile(file.fileName());
+        QTRY_COMPARE(log.count("The csv file has more rows, which are not logged"), 1);
+        QCOMPARE(log.count("row data at row"), 1000);
+        QCOMPARE(log.count("invalid column number in csv file"), 1000);
     }
 
     void manyRowsAreQuick() {
