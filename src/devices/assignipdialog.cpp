@@ -3,6 +3,8 @@
 #include "assignipmodel.h"
 #include "exetaskmgr.h"
 #include "icons.h"
+#include "inventoryreader.h"
+#include "servicerequest.h"
 #include "targetwarninglines.h"
 #include "ui_assignipdialog.h"
 
@@ -47,6 +49,7 @@ AssignIpDialogII::AssignIpDialogII(OperationTargets::List targets, const DeviceS
     : FramelessDialog(parent),
       m_ui(formIn<Ui::AssignIpDialogII>(content())),
       m_warning(m_ui->msgWarningIcon, m_ui->msgWarningLabel),
+      m_managed(managed),
       m_model(new AssignIpModel(std::move(targets), *managed, this)),
       m_targetWarnings(new TargetWarningLines(m_model, content())),
       m_stateWarnings(OperationTargets::warnings(m_model->targets(), OperationTargets::Need::Authorization)) {
@@ -115,10 +118,10 @@ IpAssignment::Network AssignIpDialogII::network() const {
     IpAssignment::Network network;
     if (isEveryPattern(patterns))
         network.patterns = patterns;
-    if (Ipv4::isMask(m_ui->maskEdit->address()))
-        network.mask = Ipv4::parse(m_ui->maskEdit->address());
+    if (AddressPattern::isMask(m_ui->maskEdit->address()))
+        network.mask = AddressPattern::numberOf(m_ui->maskEdit->address());
     if (m_ui->gatewayEdit->isValid())
-        network.gateway = Ipv4::parse(m_ui->gatewayEdit->address());
+        network.gateway = AddressPattern::numberOf(m_ui->gatewayEdit->address());
     return network;
 }
 
@@ -154,7 +157,7 @@ void AssignIpDialogII::showWarnings(std::vector<TargetWarning> more) {
 void AssignIpDialogII::updateState() {
     m_ui->totalLabel->setText(tr("Total Quantity: %1").arg(QLocale().toString(m_model->checkedCount())));
     m_ui->selectAllCheckBox->setCheckState(m_model->shownState());
-    m_ui->applyButton->setEnabled(m_model->checkedCount() > 0);
+    m_ui->applyButton->setEnabled(m_model->checkedCount() > 0 && !m_checking);
 }
 
 bool AssignIpDialogII::complain(QLineEdit *field, const QString &problem) {
@@ -173,7 +176,7 @@ bool AssignIpDialogII::areFieldsGood() {
     if (!isEveryPattern(patterns))
         return complain(m_ui->addressEdit, tr("Each address has four parts: numbers from 0 to 255, ranges as "
                                               "in 10-19, or * for any."));
-    if (!Ipv4::isMask(m_ui->maskEdit->address()))
+    if (!AddressPattern::isMask(m_ui->maskEdit->address()))
         return complain(m_ui->maskEdit, tr("This is no subnet mask, as 255.255.255.0 is one."));
     if (!m_ui->gatewayEdit->isValid())
         return complain(m_ui->gatewayEdit, tr("The gateway is no IP address."));
@@ -181,7 +184,8 @@ bool AssignIpDialogII::areFieldsGood() {
         if (!dns->text().isEmpty() && !dns->isValid())
             return complain(dns, tr("The DNS server is no IP address."));
     }
-    if (countOf(patterns) < m_model->checkedCount() || !m_enough || m_conflicts)
+    const int waiting = m_model->assignment().waitingCount(m_model->checkedItems());
+    if (countOf(patterns) < waiting || !m_enough || m_conflicts)
         return complain(m_ui->addressEdit,
                         tr("IP conflicts or not enough available IP addresses. Pleasea use available IP or "
                            "try a wider IP range."));
@@ -191,12 +195,59 @@ bool AssignIpDialogII::areFieldsGood() {
 void AssignIpDialogII::onApply() {
     qDebug("Current assgined IP mode: %s", isManual() ? "Manual" : "Auto");
     plan();
-    if (isManual() && !areFieldsGood())
-        return;
-    if (isManual() ? applyManually() : applyAutomatically())
+    if (!isManual())
+        return finishWith(applyAutomatically());
+    if (areFieldsGood())
+        checkAndApply();
+}
+
+void AssignIpDialogII::finishWith(bool isStarted) {
+    if (isStarted)
         accept();
     else
         m_warning.setText(tr("The assignment could not be started."));
+}
+
+/// Other clients give devices addresses, too, so the plan has to hold on the list as it is at this moment.
+void AssignIpDialogII::checkAndApply() {
+    m_warning.setText({});
+    m_checking = ServiceRequest::post(
+        NetJob::createRunner("reading the addresses in use"), this,
+        [previous = m_managed](ServiceSession &session) {
+            return InventoryReader::readDevices(session, previous);
+        },
+        [this](const DeviceSnapshotPtr &managed) { onManagedRead(managed); },
+        [this](JobEnd end) {
+            m_checking = false;
+            updateState();
+            if (end == JobEnd::NotRun || end == JobEnd::Failed)
+                onManagedRead(nullptr);
+        });
+    updateState();
+    if (!m_checking)
+        onManagedRead(nullptr);
+}
+
+void AssignIpDialogII::onManagedRead(const DeviceSnapshotPtr &managed) {
+    if (!managed)
+        return m_warning.setText(tr("The addresses in use could not be read. Press Apply to try again."));
+    const auto addresses = [this] {
+        std::vector<quint32> all;
+        for (const int item : m_model->checkedItems())
+            all.push_back(m_model->assignment().address(item));
+        return all;
+    };
+    const std::vector<quint32> shown = addresses();
+    m_managed = managed;
+    m_model->assignment().setManaged(*managed);
+    plan();
+    if (!isManual() || !areFieldsGood())
+        return;
+    if (addresses() == shown)
+        return finishWith(applyManually());
+    m_warning.setText(
+        tr("Some of the addresses were taken meanwhile, so others are given now. Look at them and "
+           "press Apply again."));
 }
 
 bool AssignIpDialogII::applyAutomatically() {
@@ -213,7 +264,7 @@ bool AssignIpDialogII::applyManually() {
     for (const int item : m_model->checkedItems())
         devices.push_back(
             {{"id", m_model->targets()[static_cast<std::size_t>(item)].device->id.toStdString()},
-             {"ip", Ipv4::toText(m_model->assignment().address(item)).toStdString()}});
+             {"ip", AddressPattern::textOf(m_model->assignment().address(item)).toStdString()}});
     return ExeTaskMgr::instance().insertNewManualAssignIpTask(
         devices, m_ui->maskEdit->address(), m_ui->gatewayEdit->address(), m_ui->dns1Edit->address(),
         m_ui->dns2Edit->address());

@@ -39,14 +39,19 @@ private:
     bool complain(QLineEdit *field, const QString &problem);
 
     void onApply();
+    void finishWith(bool isStarted);
+    void checkAndApply();
+    void onManagedRead(const DeviceSnapshotPtr &managed);
     bool applyAutomatically();
     bool applyManually();
 
     std::unique_ptr<Ui::AssignIpDialogII> m_ui;
     WarningLine m_warning;
+    DeviceSnapshotPtr m_managed; ///< as last read
     AssignIpModel *m_model;
     TargetWarningLines *m_targetWarnings;
     std::vector<TargetWarning> m_stateWarnings; ///< what the devices' states speak against
     bool m_enough = false;                      ///< addresses for all devices
     bool m_conflicts = false;
+    bool m_checking = false; ///< the addresses in use are being read
 };

@@ -9,8 +9,7 @@ struct Texts {
 };
 
 quint32 addressOf(const DeviceRecord &device) {
-    const QString &text = device.text(DeviceColumn::Ip);
-    return AddressPattern::isAddress(text) ? Ipv4::parse(text) : 0;
+    return AddressPattern::numberOf(device.text(DeviceColumn::Ip));
 }
 
 /// The warning for those of the items that the test holds of.
@@ -28,11 +27,27 @@ void warn(std::vector<TargetWarning> &warnings, const std::vector<int> &items, T
 IpAssignment::IpAssignment(const OperationTargets::List &targets, const DeviceSnapshot &managed)
     : m_addresses(targets.size()), m_typed(targets.size()) {
     for (const OperationTarget &target : targets)
-        m_current.push_back(addressOf(*target.device));
+        m_ids += target.device->id;
+    setManaged(managed);
+}
+
+void IpAssignment::setManaged(const DeviceSnapshot &managed) {
+    m_managed.clear();
     for (int i = 0; i < managed.size(); ++i) {
         if (const quint32 address = addressOf(*managed.at(i)))
             ++m_managed[address];
     }
+    m_current.clear();
+    for (const QString &id : m_ids) {
+        const int index = managed.indexOf(id);
+        m_current.push_back(index < 0 ? 0 : addressOf(*managed.at(index)));
+    }
+}
+
+int IpAssignment::waitingCount(const std::vector<int> &items) const {
+    return static_cast<int>(std::count_if(items.begin(), items.end(), [this](int item) {
+        return m_typed[static_cast<std::size_t>(item)] == 0;
+    }));
 }
 
 QSet<quint32> IpAssignment::takenByOthers(const std::vector<int> &items) const {

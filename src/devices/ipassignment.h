@@ -20,6 +20,12 @@ public:
     /// when there are too few.
     bool handOut(const Network &network, const std::vector<int> &items);
 
+    /// How many of the items have no address typed by hand, so that they need one of the patterns'.
+    int waitingCount(const std::vector<int> &items) const;
+
+    /// All devices of the service as they are now.
+    void setManaged(const DeviceSnapshot &managed);
+
     /// An item's new address, 0 for none.
     quint32 address(int item) const { return m_addresses[static_cast<std::size_t>(item)]; }
     /// Types an address for an item by hand, which handing out leaves alone; 0 takes it back.
@@ -35,6 +41,7 @@ private:
     /// The addresses of all devices but those items.
     QSet<quint32> takenByOthers(const std::vector<int> &items) const;
 
+    QStringList m_ids;                ///< of the targets
     std::vector<quint32> m_current;   ///< of the targets
     std::vector<quint32> m_addresses; ///< new ones
     std::vector<quint32> m_typed;     ///< those given by hand, 0 for the others

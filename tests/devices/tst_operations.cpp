@@ -302,6 +302,20 @@ private slots:
         QVERIFY(!list->model()->setData(list->model()->index(0, 3), "10.77.0.300"));
         QVERIFY(list->model()->setData(list->model()->index(0, 3), "10.77.0.3"));
         QCOMPARE(list->model()->index(1, 3).data().toString(), QStringLiteral("10.77.0.2"));
+        // Another client gives one of the addresses away at this moment.
+        JSON all;
+        SignedInService::call([&](CApiClient &client) { return client.listDevices(0, 500, all); });
+        const auto other = std::find_if(all.begin(), all.end(),
+                                        [](const JSON &each) { return each["d_svrtype"] != "Camera"; });
+        QVERIFY(other != all.end());
+        const JSON taken = JSON::array({{{"id", (*other)["id"]}, {"d_ip", "10.77.0.2"}}});
+        SignedInService::call([&](CApiClient &client) { return client.commitDevices(taken, "all"); });
+        apply();
+        QTRY_VERIFY(
+            label(dialog, "msgWarningLabel").startsWith("Some of the addresses were taken meanwhile"));
+        QCOMPARE(list->model()->index(1, 3).data().toString(), QStringLiteral("10.77.0.4"));
+        // The device with an address of its own needs none of these.
+        set("addressEdit", QStringLiteral("10.77.0.4-%1").arg(devices + 2));
         apply();
         QTRY_VERIFY(!visible<AssignIpDialogII>());
         QTRY_VERIFY_WITH_TIMEOUT(ended("deviceAssignIPManual"), patienceMs);
