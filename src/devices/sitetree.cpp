@@ -340,7 +340,8 @@ void SiteTree::addSite(const QString &parentId) {
     emit sitesEdited();
     if (QTreeWidgetItem *parent = m_items.value(parentId))
         expandItem(parent);
-    editSite(id);
+    // The site that is shown stays: devices may be selected there to be put into the new one.
+    openEditor(id);
 }
 
 void SiteTree::editSite(const QString &siteId) {
@@ -348,6 +349,13 @@ void SiteTree::editSite(const QString &siteId) {
     if (!item)
         return;
     setCurrentItem(item);
+    openEditor(siteId);
+}
+
+void SiteTree::openEditor(const QString &siteId) {
+    QTreeWidgetItem *item = m_items.value(siteId);
+    if (!item)
+        return;
     scrollToItem(item);
     editItem(item);
 }

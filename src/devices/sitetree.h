@@ -97,6 +97,7 @@ private:
     PopupMenu *menuOf(const QTreeWidgetItem *item);
     void addSite(const QString &parentId);
     void editSite(const QString &siteId);
+    void openEditor(const QString &siteId);
     void askToDelete(const QString &siteId);
     void deleteSite(const QString &siteId);
     void finishEditing(const QString &siteId, const QString &text);

@@ -77,9 +77,12 @@ private slots:
         QTest::keyClicks(editor(), "  Hall 7 ");
         QTest::keyClick(editor(), Qt::Key_Return);
         QTRY_VERIFY(!editor());
-        QCOMPARE(m_tree->currentItem()->text(0), QStringLiteral("Hall 7"));
-        QCOMPARE(m_tree->currentItem()->parent(), item("b"));
+        // What is shown stays, with the devices that are selected there.
+        QCOMPARE(m_tree->currentSite(), Sites::overviewId);
+        QTreeWidgetItem *added = item("b")->child(item("b")->childCount() - 1);
+        QCOMPARE(added->text(0), QStringLiteral("Hall 7"));
         QCOMPARE(edited.size(), 2);
+        m_tree->setCurrentItem(added);
         m_tree->activateWindow();
         QVERIFY(QTest::qWaitForWindowActive(m_tree.get()));
         // F2 opens the editor again; Escape leaves the name as it was, and so does an empty text.
@@ -242,7 +245,8 @@ private slots:
         choose("b", "Add Site");
         QTRY_VERIFY(editor());
         QTest::keyClick(editor(), Qt::Key_Return);
-        const QString site = m_tree->currentSite();
+        const QString site =
+            item("b")->child(item("b")->childCount() - 1)->data(0, SiteTree::siteIdRole).toString();
         QVERIFY(site.startsWith("SR"));
         QMimeData data;
         data.setData(SiteMembership::mimeType, SiteMembership::encode({Sites::overviewId, {"1"}}));
@@ -258,6 +262,18 @@ private slots:
         QCOMPARE(drag(data, place(site), {}), Qt::CopyAction);
         QCOMPARE(drop(data, place(site), {}), Qt::CopyAction);
         QCOMPARE(dropped.size(), 1);
+    }
+
+    void longestChainIsShown() {
+        JSON records = JSON::array();
+        for (int i = 1; i <= 28000; ++i)
+            records.push_back({{"siteid", "s" + std::to_string(i)},
+                               {"parentid", "s" + std::to_string(i - 1)},
+                               {"sitename", "s"}});
+        m_tree->setSites(Sites::parse(records));
+        QVERIFY(item("s1") && item("s28000"));
+        m_tree->expandAll();
+        m_tree->setSites({});
     }
 
     void placeSurvivesAReading() {
