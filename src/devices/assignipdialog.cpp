@@ -216,34 +216,37 @@ void AssignIpDialogII::checkAndApply() {
         [previous = m_managed](ServiceSession &session) {
             return InventoryReader::readDevices(session, previous);
         },
-        [this](const DeviceSnapshotPtr &managed) { onManagedRead(managed); },
+        [this, shown = checkedAddresses()](const DeviceSnapshotPtr &managed) {
+            onManagedRead(managed, shown);
+        },
         [this](JobEnd end) {
             m_checking = false;
             updateState();
             if (end == JobEnd::NotRun || end == JobEnd::Failed)
-                onManagedRead(nullptr);
+                onManagedRead(nullptr, {});
         });
     updateState();
     if (!m_checking)
-        onManagedRead(nullptr);
+        onManagedRead(nullptr, {});
 }
 
-void AssignIpDialogII::onManagedRead(const DeviceSnapshotPtr &managed) {
+std::vector<quint32> AssignIpDialogII::checkedAddresses() const {
+    std::vector<quint32> addresses;
+    for (const int item : m_model->checkedItems())
+        addresses.push_back(m_model->assignment().address(item));
+    return addresses;
+}
+
+/// shown: the addresses that the user has agreed to.
+void AssignIpDialogII::onManagedRead(const DeviceSnapshotPtr &managed, const std::vector<quint32> &shown) {
     if (!managed)
         return m_warning.setText(tr("The addresses in use could not be read. Press Apply to try again."));
-    const auto addresses = [this] {
-        std::vector<quint32> all;
-        for (const int item : m_model->checkedItems())
-            all.push_back(m_model->assignment().address(item));
-        return all;
-    };
-    const std::vector<quint32> shown = addresses();
     m_managed = managed;
     m_model->assignment().setManaged(*managed);
     plan();
     if (!isManual() || !areFieldsGood())
         return;
-    if (addresses() == shown)
+    if (checkedAddresses() == shown)
         return finishWith(applyManually());
     m_warning.setText(
         tr("Some of the addresses were taken meanwhile, so others are given now. Look at them and "

@@ -41,7 +41,8 @@ private:
     void onApply();
     void finishWith(bool isStarted);
     void checkAndApply();
-    void onManagedRead(const DeviceSnapshotPtr &managed);
+    std::vector<quint32> checkedAddresses() const;
+    void onManagedRead(const DeviceSnapshotPtr &managed, const std::vector<quint32> &shown);
     bool applyAutomatically();
     bool applyManually();
 
