@@ -303,12 +303,12 @@ private slots:
         QVERIFY(list->model()->setData(list->model()->index(0, 3), "10.77.0.3"));
         QCOMPARE(list->model()->index(1, 3).data().toString(), QStringLiteral("10.77.0.2"));
         // Another client gives one of the addresses away at this moment.
-        JSON all;
-        SignedInService::call([&](CApiClient &client) { return client.listDevices(0, 500, all); });
-        const auto other = std::find_if(all.begin(), all.end(),
-                                        [](const JSON &each) { return each["d_svrtype"] != "Camera"; });
-        QVERIFY(other != all.end());
-        const JSON taken = JSON::array({{{"id", (*other)["id"]}, {"d_ip", "10.77.0.2"}}});
+        const JSON taken = JSON::array({{{"id", ""},
+                                         {"d_mac", "00:11:22:33:44:55"},
+                                         {"d_ip", "10.77.0.2"},
+                                         {"d_model", "N"},
+                                         {"d_svrtype", "NVR"},
+                                         {"siteid", {"DO000000000000"}}}});
         SignedInService::call([&](CApiClient &client) { return client.commitDevices(taken, "all"); });
         apply();
         QTRY_VERIFY(
