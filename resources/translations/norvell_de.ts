@@ -404,30 +404,16 @@
             <numerusform>%n Geräte haben geantwortet, die bereits verwaltet werden.</numerusform>
         </translation>
     </message>
+    <message numerus="yes">
+        <source>%n device(s) without a good MAC address answered, which cannot be added.</source>
+        <translation>
+            <numerusform>%n Gerät ohne gültige MAC-Adresse hat geantwortet und kann nicht hinzugefügt werden.</numerusform>
+            <numerusform>%n Geräte ohne gültige MAC-Adresse haben geantwortet und können nicht hinzugefügt werden.</numerusform>
+        </translation>
+    </message>
     <message>
-        <source>The device(s) found there are managed or listed already.</source>
-        <translation>Die dort gefundenen Geräte werden bereits verwaltet oder stehen schon in der Liste.</translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) of the file are managed or listed already.</source>
-        <translation>
-            <numerusform>%n Gerät der Datei wird bereits verwaltet oder steht schon in der Liste.</numerusform>
-            <numerusform>%n Geräte der Datei werden bereits verwaltet oder stehen schon in der Liste.</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) answered, which are managed already.</source>
-        <translation>
-            <numerusform>%n Gerät hat geantwortet, das bereits verwaltet wird.</numerusform>
-            <numerusform>%n Geräte haben geantwortet, die bereits verwaltet werden.</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) were managed already and stay as they are.</source>
-        <translation>
-            <numerusform>%n Gerät war bereits verwaltet und bleibt, wie es ist.</numerusform>
-            <numerusform>%n Geräte waren bereits verwaltet und bleiben, wie sie sind.</numerusform>
-        </translation>
+        <source>The first %1 are listed.</source>
+        <translation>Die ersten %1 werden aufgeführt.</translation>
     </message>
 </context>
 <context>
@@ -630,10 +616,6 @@
         <translation>ein Geheimnis konnte nicht verschlüsselt werden</translation>
     </message>
     <message>
-        <source>nobody is logged in</source>
-        <translation>niemand ist angemeldet</translation>
-    </message>
-    <message>
         <source>the file exists already or cannot be written</source>
         <translation>die Datei ist schon vorhanden oder kann nicht geschrieben werden</translation>
     </message>
@@ -644,6 +626,18 @@
     <message>
         <source>the server&apos;s key has changed</source>
         <translation>der Schlüssel des Servers hat sich geändert</translation>
+    </message>
+    <message>
+        <source>nothing was sent, because something in it is missing or not allowed</source>
+        <translation>es wurde nichts gesendet, weil etwas darin fehlt oder nicht erlaubt ist</translation>
+    </message>
+    <message>
+        <source>the server does not know the session any more</source>
+        <translation>der Server kennt die Sitzung nicht mehr</translation>
+    </message>
+    <message>
+        <source>the server takes no more sessions</source>
+        <translation>der Server nimmt keine weiteren Sitzungen an</translation>
     </message>
 </context>
 <context>
@@ -755,6 +749,14 @@
     <message>
         <source>The assignment could not be started.</source>
         <translation>Die Zuweisung konnte nicht gestartet werden.</translation>
+    </message>
+    <message>
+        <source>The addresses in use could not be read. Press Apply to try again.</source>
+        <translation>Die belegten Adressen konnten nicht gelesen werden. Mit „Übernehmen“ erneut versuchen.</translation>
+    </message>
+    <message>
+        <source>Some of the addresses were taken meanwhile, so others are given now. Look at them and press Apply again.</source>
+        <translation>Einige der Adressen wurden inzwischen belegt, deshalb werden nun andere vergeben. Prüfen Sie sie und wählen Sie noch einmal „Übernehmen“.</translation>
     </message>
 </context>
 <context>
@@ -1581,8 +1583,12 @@
         </translation>
     </message>
     <message>
-        <source>The row has %1 column(s) in place of %2.</source>
-        <translation>Die Zeile hat %1 Spalte(n) statt %2.</translation>
+        <source>The row is longer than %1 characters.</source>
+        <translation>Die Zeile ist länger als %1 Zeichen.</translation>
+    </message>
+    <message>
+        <source>it has more than %1 rows</source>
+        <translation>sie hat mehr als %1 Zeilen</translation>
     </message>
 </context>
 <context>
@@ -1605,10 +1611,6 @@
     <message>
         <source>%1 of %2 devices are authorized so far. %3.</source>
         <translation>%1 von %2 Geräten sind bisher autorisiert. %3.</translation>
-    </message>
-    <message>
-        <source>%1 could not be started: the client is busy, try again.</source>
-        <translation>„%1“ konnte nicht gestartet werden: der Client ist beschäftigt, bitte erneut versuchen.</translation>
     </message>
     <message>
         <source>Authorize Device</source>
@@ -1715,34 +1717,9 @@
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
         </translation>
     </message>
-    <message numerus="yes">
-        <source>%n device record(s) could not be read.</source>
-        <translation>
-            <numerusform>%n Gerätedatensatz konnte nicht gelesen werden.</numerusform>
-            <numerusform>%n Gerätedatensätze konnten nicht gelesen werden.</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
-        <translation>
-            <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
-            <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
-        </translation>
-    </message>
     <message>
         <source>The server has ended the session.</source>
         <translation>Der Server hat die Sitzung beendet.</translation>
-    </message>
-</context>
-<context>
-    <name>DeviceDiscovery</name>
-    <message>
-        <source>the session has ended</source>
-        <translation>die Sitzung ist beendet</translation>
-    </message>
-    <message>
-        <source>the client is busy, try again</source>
-        <translation>der Client ist beschäftigt, bitte erneut versuchen</translation>
     </message>
 </context>
 <context>
@@ -2207,6 +2184,39 @@
     </message>
 </context>
 <context>
+    <name>FailedHandOver</name>
+    <message numerus="yes">
+        <source>%1 on %n device(s) did not begin. %2</source>
+        <translation>
+            <numerusform>„%1“ hat auf %n Gerät nicht begonnen. %2</numerusform>
+            <numerusform>„%1“ hat auf %n Geräten nicht begonnen. %2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 on %n device(s) may have begun. %2</source>
+        <translation>
+            <numerusform>„%1“ hat auf %n Gerät vielleicht begonnen. %2</numerusform>
+            <numerusform>„%1“ hat auf %n Geräten vielleicht begonnen. %2</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 Look at the devices before you try again.</source>
+        <translation>%1 Sehen Sie sich die Geräte an, bevor Sie es erneut versuchen.</translation>
+    </message>
+    <message>
+        <source>%1 Its task in the list tells whether it has.</source>
+        <translation>%1 Ob es so ist, zeigt die Aufgabe in der Liste.</translation>
+    </message>
+    <message>
+        <source>%1 did not begin. %2</source>
+        <translation>„%1“ hat nicht begonnen. %2</translation>
+    </message>
+    <message>
+        <source>%1 may have begun. %2</source>
+        <translation>„%1“ hat vielleicht begonnen. %2</translation>
+    </message>
+</context>
+<context>
     <name>FailedTaskStrip</name>
     <message>
         <source>Start again</source>
@@ -2215,13 +2225,6 @@
     <message>
         <source>Dismiss</source>
         <translation>Ausblenden</translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 on %n device(s) did not begin. %2</source>
-        <translation>
-            <numerusform>„%1“ hat auf %n Gerät nicht begonnen. %2</numerusform>
-            <numerusform>„%1“ hat auf %n Geräten nicht begonnen. %2</numerusform>
-        </translation>
     </message>
     <message>
         <source>1 of %1</source>
@@ -2419,6 +2422,21 @@
     </message>
 </context>
 <context>
+    <name>JobEnd</name>
+    <message>
+        <source>the client is busy, try again</source>
+        <translation>der Client ist beschäftigt, bitte erneut versuchen</translation>
+    </message>
+    <message>
+        <source>something went wrong in the client, its log says what</source>
+        <translation>im Client ist ein Fehler aufgetreten, Näheres steht in seinem Protokoll</translation>
+    </message>
+    <message>
+        <source>the session has ended</source>
+        <translation>die Sitzung ist beendet</translation>
+    </message>
+</context>
+<context>
     <name>ListActions</name>
     <message>
         <source>The task could not be cancelled: %1.</source>
@@ -2431,10 +2449,6 @@
     <message>
         <source>The alarms could not be deleted: %1.</source>
         <translation>Die Alarme konnten nicht gelöscht werden: %1.</translation>
-    </message>
-    <message>
-        <source>the client is busy, try again</source>
-        <translation>der Client ist beschäftigt, bitte erneut versuchen</translation>
     </message>
 </context>
 <context>
@@ -2689,10 +2703,6 @@
     <message>
         <source>The time frame ends before it starts.</source>
         <translation>Der Zeitraum endet, bevor er beginnt.</translation>
-    </message>
-    <message>
-        <source>the client is busy, try again</source>
-        <translation>der Client ist beschäftigt, bitte erneut versuchen</translation>
     </message>
     <message>
         <source>Searching...</source>
@@ -3105,13 +3115,6 @@
             <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
         </translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
-        <translation>
-            <numerusform>%n Gerät wurde ausgelassen: der Server verwaltet es nicht mehr.</numerusform>
-            <numerusform>%n Geräte wurden ausgelassen: der Server verwaltet sie nicht mehr.</numerusform>
-        </translation>
-    </message>
 </context>
 <context>
     <name>QuickSetupDialog</name>
@@ -3510,10 +3513,6 @@
         <translation>Angehalten: die Aufgabe dieser Welle wurde abgebrochen.</translation>
     </message>
     <message>
-        <source>Stopped: the task of this wave is no longer in the list.</source>
-        <translation>Angehalten: die Aufgabe dieser Welle steht nicht mehr in der Liste.</translation>
-    </message>
-    <message>
         <source>Stopped: this wave did not begin. %1</source>
         <translation>Angehalten: diese Welle wurde nicht begonnen. %1</translation>
     </message>
@@ -3527,13 +3526,6 @@
     </message>
     <message numerus="yes">
         <source>Waiting for the second wave: %n device(s).</source>
-        <translation>
-            <numerusform>%n Gerät wartet auf die zweite Welle.</numerusform>
-            <numerusform>%n Geräte warten auf die zweite Welle.</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) wait for the second wave.</source>
         <translation>
             <numerusform>%n Gerät wartet auf die zweite Welle.</numerusform>
             <numerusform>%n Geräte warten auf die zweite Welle.</numerusform>
@@ -4045,10 +4037,6 @@
         <translation>Die Änderungen wurden zurückgenommen.</translation>
     </message>
     <message>
-        <source>The settings could not be read: the client is busy, try again.</source>
-        <translation>Die Einstellungen konnten nicht gelesen werden: der Client ist beschäftigt, bitte erneut versuchen.</translation>
-    </message>
-    <message>
         <source>Loading settings...</source>
         <translation>Einstellungen werden geladen ...</translation>
     </message>
@@ -4059,10 +4047,6 @@
     <message>
         <source>The server offers no settings.</source>
         <translation>Der Server bietet keine Einstellungen an.</translation>
-    </message>
-    <message>
-        <source>The settings could not be saved: the client is busy, try again.</source>
-        <translation>Die Einstellungen konnten nicht gespeichert werden: der Client ist beschäftigt, bitte erneut versuchen.</translation>
     </message>
     <message>
         <source>Saving settings...</source>
@@ -5466,46 +5450,6 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>Norvell Device Manager</source>
         <translation>Norvell Device Manager</translation>
-    </message>
-</context>
-<context>
-    <name>DevicePlacement</name>
-    <message>
-        <source>The devices are not managed any more.</source>
-        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
-    </message>
-</context>
-<context>
-    <name>FailedHandOver</name>
-    <message numerus="yes">
-        <source>%1 on %n device(s) did not begin. %2</source>
-        <translation>
-            <numerusform>„%1“ hat auf %n Gerät nicht begonnen. %2</numerusform>
-            <numerusform>„%1“ hat auf %n Geräten nicht begonnen. %2</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 on %n device(s) may have begun. %2</source>
-        <translation>
-            <numerusform>„%1“ hat auf %n Gerät vielleicht begonnen. %2</numerusform>
-            <numerusform>„%1“ hat auf %n Geräten vielleicht begonnen. %2</numerusform>
-        </translation>
-    </message>
-    <message>
-        <source>%1 Look at the devices before you try again.</source>
-        <translation>%1 Sehen Sie sich die Geräte an, bevor Sie es erneut versuchen.</translation>
-    </message>
-    <message>
-        <source>%1 Its task in the list tells whether it has.</source>
-        <translation>%1 Ob es so ist, zeigt die Aufgabe in der Liste.</translation>
-    </message>
-    <message>
-        <source>%1 did not begin. %2</source>
-        <translation>„%1“ hat nicht begonnen. %2</translation>
-    </message>
-    <message>
-        <source>%1 may have begun. %2</source>
-        <translation>„%1“ hat vielleicht begonnen. %2</translation>
     </message>
 </context>
 </TS>

@@ -396,27 +396,15 @@
             <numerusform>%n 台のデバイスが応答しましたが、既に管理されています。</numerusform>
         </translation>
     </message>
+    <message numerus="yes">
+        <source>%n device(s) without a good MAC address answered, which cannot be added.</source>
+        <translation>
+            <numerusform>有効な MAC アドレスのないデバイス %n 台が応答しましたが、追加できません。</numerusform>
+        </translation>
+    </message>
     <message>
-        <source>The device(s) found there are managed or listed already.</source>
-        <translation>見つかったデバイスは既に管理されているか、一覧にあります。</translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) of the file are managed or listed already.</source>
-        <translation>
-            <numerusform>ファイルの %n 台のデバイスは既に管理されているか、一覧にあります。</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) answered, which are managed already.</source>
-        <translation>
-            <numerusform>%n 台のデバイスが応答しましたが、既に管理されています。</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) were managed already and stay as they are.</source>
-        <translation>
-            <numerusform>%n 台のデバイスはすでに管理されているため、そのままです。</numerusform>
-        </translation>
+        <source>The first %1 are listed.</source>
+        <translation>最初の %1 件を表示しています。</translation>
     </message>
 </context>
 <context>
@@ -618,10 +606,6 @@
         <translation>機密情報を暗号化できませんでした</translation>
     </message>
     <message>
-        <source>nobody is logged in</source>
-        <translation>ログインしていません</translation>
-    </message>
-    <message>
         <source>the file exists already or cannot be written</source>
         <translation>ファイルが既に存在するか、書き込めません</translation>
     </message>
@@ -632,6 +616,18 @@
     <message>
         <source>the server&apos;s key has changed</source>
         <translation>サーバーの鍵が変わっています</translation>
+    </message>
+    <message>
+        <source>nothing was sent, because something in it is missing or not allowed</source>
+        <translation>必要な項目がないか許可されていない項目があるため、何も送信されませんでした</translation>
+    </message>
+    <message>
+        <source>the server does not know the session any more</source>
+        <translation>サーバーがこのセッションを認識しなくなりました</translation>
+    </message>
+    <message>
+        <source>the server takes no more sessions</source>
+        <translation>サーバーはこれ以上セッションを受け付けません</translation>
     </message>
 </context>
 <context>
@@ -743,6 +739,14 @@
     <message>
         <source>The assignment could not be started.</source>
         <translation>割り当てを開始できませんでした。</translation>
+    </message>
+    <message>
+        <source>The addresses in use could not be read. Press Apply to try again.</source>
+        <translation>使用中のアドレスを読み取れませんでした。「適用」 を押して再試行してください。</translation>
+    </message>
+    <message>
+        <source>Some of the addresses were taken meanwhile, so others are given now. Look at them and press Apply again.</source>
+        <translation>一部のアドレスがその間に使用されたため、別のアドレスを割り当てます。確認してからもう一度 「適用」 を押してください。</translation>
     </message>
 </context>
 <context>
@@ -1556,8 +1560,12 @@
         </translation>
     </message>
     <message>
-        <source>The row has %1 column(s) in place of %2.</source>
-        <translation>行の列数が %2 ではなく %1 です。</translation>
+        <source>The row is longer than %1 characters.</source>
+        <translation>行が %1 文字を超えています。</translation>
+    </message>
+    <message>
+        <source>it has more than %1 rows</source>
+        <translation>行数が %1 を超えています</translation>
     </message>
 </context>
 <context>
@@ -1580,10 +1588,6 @@
     <message>
         <source>%1 of %2 devices are authorized so far. %3.</source>
         <translation>これまでに %2 台中 %1 台のデバイスが認証済みです。%3。</translation>
-    </message>
-    <message>
-        <source>%1 could not be started: the client is busy, try again.</source>
-        <translation>「%1」を開始できませんでした: クライアントがビジー状態です。もう一度お試しください。</translation>
     </message>
     <message>
         <source>Authorize Device</source>
@@ -1683,32 +1687,9 @@
             <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
         </translation>
     </message>
-    <message numerus="yes">
-        <source>%n device record(s) could not be read.</source>
-        <translation>
-            <numerusform>%n 件のデバイスレコードを読み取れませんでした。</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
-        <translation>
-            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
-        </translation>
-    </message>
     <message>
         <source>The server has ended the session.</source>
         <translation>サーバーがセッションを終了しました。</translation>
-    </message>
-</context>
-<context>
-    <name>DeviceDiscovery</name>
-    <message>
-        <source>the session has ended</source>
-        <translation>セッションが終了しました</translation>
-    </message>
-    <message>
-        <source>the client is busy, try again</source>
-        <translation>クライアントがビジー状態です。もう一度お試しください</translation>
     </message>
 </context>
 <context>
@@ -2169,6 +2150,37 @@
     </message>
 </context>
 <context>
+    <name>FailedHandOver</name>
+    <message numerus="yes">
+        <source>%1 on %n device(s) did not begin. %2</source>
+        <translation>
+            <numerusform>%n 台のデバイスで「%1」を開始できませんでした。%2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 on %n device(s) may have begun. %2</source>
+        <translation>
+            <numerusform>%n 台のデバイスで「%1」が開始された可能性があります。%2</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 Look at the devices before you try again.</source>
+        <translation>%1 再試行する前にデバイスを確認してください。</translation>
+    </message>
+    <message>
+        <source>%1 Its task in the list tells whether it has.</source>
+        <translation>%1 開始されたかどうかは一覧のタスクで確認できます。</translation>
+    </message>
+    <message>
+        <source>%1 did not begin. %2</source>
+        <translation>「%1」は開始されませんでした。%2</translation>
+    </message>
+    <message>
+        <source>%1 may have begun. %2</source>
+        <translation>「%1」が開始された可能性があります。%2</translation>
+    </message>
+</context>
+<context>
     <name>FailedTaskStrip</name>
     <message>
         <source>Start again</source>
@@ -2177,12 +2189,6 @@
     <message>
         <source>Dismiss</source>
         <translation>閉じる</translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 on %n device(s) did not begin. %2</source>
-        <translation>
-            <numerusform>%n 台のデバイスで「%1」を開始できませんでした。%2</numerusform>
-        </translation>
     </message>
     <message>
         <source>1 of %1</source>
@@ -2376,6 +2382,21 @@
     </message>
 </context>
 <context>
+    <name>JobEnd</name>
+    <message>
+        <source>the client is busy, try again</source>
+        <translation>クライアントがビジー状態です。もう一度お試しください</translation>
+    </message>
+    <message>
+        <source>something went wrong in the client, its log says what</source>
+        <translation>クライアントで問題が発生しました。詳細はログを確認してください</translation>
+    </message>
+    <message>
+        <source>the session has ended</source>
+        <translation>セッションが終了しました</translation>
+    </message>
+</context>
+<context>
     <name>ListActions</name>
     <message>
         <source>The task could not be cancelled: %1.</source>
@@ -2388,10 +2409,6 @@
     <message>
         <source>The alarms could not be deleted: %1.</source>
         <translation>アラームを削除できませんでした: %1。</translation>
-    </message>
-    <message>
-        <source>the client is busy, try again</source>
-        <translation>クライアントがビジー状態です。もう一度お試しください</translation>
     </message>
 </context>
 <context>
@@ -2646,10 +2663,6 @@
     <message>
         <source>The time frame ends before it starts.</source>
         <translation>期間の終了が開始より前です。</translation>
-    </message>
-    <message>
-        <source>the client is busy, try again</source>
-        <translation>クライアントがビジー状態です。もう一度お試しください</translation>
     </message>
     <message>
         <source>Searching...</source>
@@ -3057,12 +3070,6 @@
             <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
         </translation>
     </message>
-    <message numerus="yes">
-        <source>%n device(s) were left out: the server does not manage them any more.</source>
-        <translation>
-            <numerusform>%n 台のデバイスを除外しました: サーバーで管理されなくなっています。</numerusform>
-        </translation>
-    </message>
 </context>
 <context>
     <name>QuickSetupDialog</name>
@@ -3456,10 +3463,6 @@
         <translation>停止: この段階のタスクがキャンセルされました。</translation>
     </message>
     <message>
-        <source>Stopped: the task of this wave is no longer in the list.</source>
-        <translation>停止: この段階のタスクが一覧にありません。</translation>
-    </message>
-    <message>
         <source>Stopped: this wave did not begin. %1</source>
         <translation>停止: この段階は開始されませんでした。%1</translation>
     </message>
@@ -3473,12 +3476,6 @@
     </message>
     <message numerus="yes">
         <source>Waiting for the second wave: %n device(s).</source>
-        <translation>
-            <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%n device(s) wait for the second wave.</source>
         <translation>
             <numerusform>%n 台のデバイスが第 2 段階を待っています。</numerusform>
         </translation>
@@ -3988,10 +3985,6 @@
         <translation>変更を元に戻しました。</translation>
     </message>
     <message>
-        <source>The settings could not be read: the client is busy, try again.</source>
-        <translation>設定を読み取れませんでした: クライアントがビジー状態です。もう一度お試しください。</translation>
-    </message>
-    <message>
         <source>Loading settings...</source>
         <translation>設定を読み込んでいます...</translation>
     </message>
@@ -4002,10 +3995,6 @@
     <message>
         <source>The server offers no settings.</source>
         <translation>サーバーに設定項目がありません。</translation>
-    </message>
-    <message>
-        <source>The settings could not be saved: the client is busy, try again.</source>
-        <translation>設定を保存できませんでした: クライアントがビジー状態です。もう一度お試しください。</translation>
     </message>
     <message>
         <source>Saving settings...</source>
@@ -5400,44 +5389,6 @@ What is done to devices shows here.</source>
     <message>
         <source>Norvell Device Manager</source>
         <translation>Norvell Device Manager</translation>
-    </message>
-</context>
-<context>
-    <name>DevicePlacement</name>
-    <message>
-        <source>The devices are not managed any more.</source>
-        <translation>デバイスは管理されなくなっています。</translation>
-    </message>
-</context>
-<context>
-    <name>FailedHandOver</name>
-    <message numerus="yes">
-        <source>%1 on %n device(s) did not begin. %2</source>
-        <translation>
-            <numerusform>%n 台のデバイスで「%1」を開始できませんでした。%2</numerusform>
-        </translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 on %n device(s) may have begun. %2</source>
-        <translation>
-            <numerusform>%n 台のデバイスで「%1」が開始された可能性があります。%2</numerusform>
-        </translation>
-    </message>
-    <message>
-        <source>%1 Look at the devices before you try again.</source>
-        <translation>%1 再試行する前にデバイスを確認してください。</translation>
-    </message>
-    <message>
-        <source>%1 Its task in the list tells whether it has.</source>
-        <translation>%1 開始されたかどうかは一覧のタスクで確認できます。</translation>
-    </message>
-    <message>
-        <source>%1 did not begin. %2</source>
-        <translation>「%1」は開始されませんでした。%2</translation>
-    </message>
-    <message>
-        <source>%1 may have begun. %2</source>
-        <translation>「%1」が開始された可能性があります。%2</translation>
     </message>
 </context>
 </TS>
