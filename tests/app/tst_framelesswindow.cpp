@@ -399,6 +399,8 @@ private slots:
         QCOMPARE(m_window->findChild<BadgeButton *>("alarmButton")->badge(), 0);
         QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
                           list->visualRect(list->model()->index(0, 0)).center());
+        QCOMPARE(m_window->findChild<DeviceWindow *>()->selectedDevices().size(), 0u);
+        QTest::keyClick(list, Qt::Key_Return);
         const auto &selected = m_window->findChild<DeviceWindow *>()->selectedDevices();
         QCOMPARE(selected.size(), 1u);
         QVERIFY(list->model()->index(0, 0).data().toString().startsWith("Lost connection to "));
