@@ -153,10 +153,14 @@ private slots:
         TaskRepeats::instance().find(tid)->again({id});
         QTRY_COMPARE_WITH_TIMEOUT(pool.taskList()->records().size(), 2u, patienceMs);
         QCOMPARE(pool.taskList()->records()[0]->devices[0].target->id, id);
+        // From now on the second one is the one to repeat.
+        const QString next = pool.taskList()->records()[0]->tid;
+        QTRY_VERIFY(TaskRepeats::instance().find(next));
+        QVERIFY(!TaskRepeats::instance().find(tid));
 
         QSignalSpy message(m_window.get(), &DeviceWindow::onShowAnimatedMsgDlg);
         tell("fault code=5@/v1/task/init");
-        TaskRepeats::instance().find(tid)->again({id});
+        TaskRepeats::instance().find(next)->again({id});
         QTRY_COMPARE_WITH_TIMEOUT(message.size(), 1, patienceMs);
         QCOMPARE(message[0][0].toString(),
                  QStringLiteral("Restart Device could not be started: the server refused it."));
