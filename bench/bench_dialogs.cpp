@@ -2,21 +2,21 @@
 // user-interface thread, what follows from it in the event loop included.
 //   bench_dialogs [DEVICES]
 
-#include "certificatemodel.h"
-#include "exportdebuginfodialog.h"
-#include "filefield.h"
-#include "localstore.h"
-#include "modelgroupmodel.h"
-#include "nettask.h"
-#include "quicksetupdialog.h"
-#include "rolloutmgr.h"
-#include "theme.h"
-#include "uploadconfigurationdialog.h"
-#include "uploadfirmwaredialog.h"
-#include "uploadhttpsdialog.h"
-#include "uploadieeedialog.h"
-#include "uploadpackagedialog.h"
-#include "uploadtaskmgr.h"
+#include "api/session/nettask.h"
+#include "devices/operations/certificates/certificatemodel.h"
+#include "devices/operations/certificates/uploadhttpsdialog.h"
+#include "devices/operations/certificates/uploadieeedialog.h"
+#include "devices/operations/files/exportdebuginfodialog.h"
+#include "devices/operations/files/filefield.h"
+#include "devices/operations/files/uploadconfigurationdialog.h"
+#include "devices/operations/files/uploadpackagedialog.h"
+#include "devices/operations/firmware/modelgroupmodel.h"
+#include "devices/operations/firmware/uploadfirmwaredialog.h"
+#include "devices/operations/quicksetup/quicksetupdialog.h"
+#include "devices/operations/rollout/rolloutmgr.h"
+#include "store/localstore.h"
+#include "tasks/queue/uploadtaskmgr.h"
+#include "widgets/style/theme.h"
 
 #include <QApplication>
 #include <QCheckBox>
@@ -39,7 +39,7 @@ constexpr double limitMs = 16;
 constexpr int models = 20;
 constexpr int filesAtATime = 2000; ///< about what is read before it is shown
 constexpr int quietMs = 200;
-constexpr int longestStepMs = 10000;
+constexpr int maxStepMs = 10000;
 
 /// What this thread has worked, in ms: other programs do not count.
 double threadTime() {
@@ -59,15 +59,15 @@ public:
         m_isBusy = true;
         const double begin = threadTime();
         const bool handled = QApplication::notify(receiver, event);
-        m_longest = std::max(m_longest, threadTime() - begin);
+        m_max = std::max(m_max, threadTime() - begin);
         m_isBusy = false;
         return handled;
     }
-    double takeLongest() { return std::exchange(m_longest, 0); }
+    double takeLongest() { return std::exchange(m_max, 0); }
 
 private:
     bool m_isBusy = false;
-    double m_longest = 0;
+    double m_max = 0;
 };
 
 TimedApplication *application() {
@@ -81,7 +81,7 @@ void settle(const std::function<bool()> &isOver) {
     QElapsedTimer timer;
     timer.start();
     const auto isDue = [&] { return timer.elapsed() >= quietMs && isOver(); };
-    while (!isDue() && timer.elapsed() < longestStepMs)
+    while (!isDue() && timer.elapsed() < maxStepMs)
         QApplication::processEvents(QEventLoop::WaitForMoreEvents);
 }
 
@@ -250,6 +250,6 @@ int main(int argc, char *argv[]) {
     measureSmall(targets, folder, image);
     measureFirmware(targets, image);
     measureCertificates(targets, devices);
-    NetTask::waitForAll(longestStepMs);
+    NetTask::waitForAll(maxStepMs);
     return isAllAccepted ? 0 : 1;
 }

@@ -19,7 +19,7 @@ constexpr int patienceMs = 300000;
 struct Cost {
     double processorSeconds = 0;
     double megabytes = 0;
-    double longestTurnMs = 0;
+    double maxTurnMs = 0;
     double busiestTurnMs = 0;
 };
 
@@ -47,7 +47,7 @@ public:
         const qsizetype at = text.lastIndexOf("bench_idle: ");
         if (at < 0 ||
             std::sscanf(text.constData() + at, "bench_idle: %lf %lf %lf %lf", &cost.processorSeconds,
-                        &cost.megabytes, &cost.longestTurnMs, &cost.busiestTurnMs) != 4)
+                        &cost.megabytes, &cost.maxTurnMs, &cost.busiestTurnMs) != 4)
             qFatal("%s did not come to rest with its devices", qPrintable(m_process.program()));
         return cost;
     }
@@ -110,8 +110,8 @@ int main(int argc, char *argv[]) {
                   beside.processorSeconds, fleet.time);
         printLine("resident after a minute", fleet.devices, own.megabytes, "MB", compared, beside.megabytes,
                   fleet.memory);
-        printLine("longest event loop turn", fleet.devices, own.longestTurnMs, "ms", compared,
-                  beside.longestTurnMs, "at most 33");
+        printLine("longest event loop turn", fleet.devices, own.maxTurnMs, "ms", compared, beside.maxTurnMs,
+                  "at most 33");
         printLine("busiest event loop turn", fleet.devices, own.busiestTurnMs, "ms", compared,
                   beside.busiestTurnMs, "of processor time");
         service.kill();

@@ -2,11 +2,11 @@
 // it the sorting of a plain table widget of the same rows.
 //   bench_logs [ENTRIES]
 
-#include "logexport.h"
-#include "loglist.h"
-#include "logtable.h"
-#include "logwindow.h"
-#include "theme.h"
+#include "pages/log/logexport.h"
+#include "pages/log/loglist.h"
+#include "pages/log/logtable.h"
+#include "pages/log/logwindow.h"
+#include "widgets/style/theme.h"
 
 #include <QApplication>
 #include <QComboBox>
@@ -34,7 +34,7 @@ double milliseconds(const std::function<void()> &work) {
     return static_cast<double>(timer.nsecsElapsed()) / 1e6;
 }
 
-JSON makeTable(int entries, const LogFrame &frame) {
+JSON makeTable(int entries, const TimeRange &frame) {
     JSON table = JSON::array();
     for (int i = 0; i < entries; ++i) {
         const std::string number = std::to_string(static_cast<unsigned>(i) * 2654435761u % 50000u);
@@ -95,7 +95,7 @@ int main(int argc, char *argv[]) {
     application.setStyleSheet(Theme::styleSheet());
     const int entries = argc > 1 ? std::max(std::atoi(argv[1]), 1) : 100000;
     const qint64 now = QDateTime::currentMSecsSinceEpoch();
-    const LogFrame frame{now - spanMs, now};
+    const TimeRange frame{now - spanMs, now};
     const JSON table = makeTable(entries, frame);
     LogListPtr list;
     const double parsed = milliseconds([&] { list = LogList::parse(table); });

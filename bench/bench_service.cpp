@@ -1,14 +1,14 @@
 // One request against a bare call of the transport, and the road from a login to a filled table.
 //   bench_service PORT ACCOUNT PASSWORD
 
-#include "apiclient.h"
-#include "ciphers.h"
-#include "devicewindow.h"
-#include "localstore.h"
-#include "mainconsoletable.h"
-#include "messagelog.h"
-#include "nettask.h"
-#include "theme.h"
+#include "api/client/apiclient.h"
+#include "api/session/nettask.h"
+#include "devices/page/devicewindow.h"
+#include "devices/page/mainconsoletable.h"
+#include "platform/crypto/ciphers.h"
+#include "platform/log/messagelog.h"
+#include "store/localstore.h"
+#include "widgets/style/theme.h"
 
 #include <QApplication>
 #include <QElapsedTimer>
@@ -85,7 +85,7 @@ void measureLogin(int port, const char *account, const char *password) {
     window.show();
     QApplication::processEvents();
     const auto *table = window.findChild<MainConsoleTable *>(QStringLiteral("cameraTable"));
-    double longestTurn = 0;
+    double maxTurn = 0;
     const double time = milliseconds([&] {
         CApiClient client("127.0.0.1", static_cast<std::uint32_t>(port));
         client.loginServer(account, password);
@@ -93,11 +93,11 @@ void measureLogin(int port, const char *account, const char *password) {
                                              QString::fromUtf8(account), CLocalStore::instance().access());
         window.startWork();
         while (table->rowCount() == 0 || !table->item(0, 0)) {
-            longestTurn = std::max(longestTurn, milliseconds([] { QApplication::processEvents(); }));
+            maxTurn = std::max(maxTurn, milliseconds([] { QApplication::processEvents(); }));
             QThread::usleep(100);
         }
     });
-    std::printf("%-32s %9.2f ms   of the event loop meanwhile\n", "longest turn", longestTurn);
+    std::printf("%-32s %9.2f ms   of the event loop meanwhile\n", "longest turn", maxTurn);
     std::printf("%-32s %9.2f ms   %d cameras in the table; resident %.0f MB (%.0f MB before)\n",
                 "login to filled table", time, table->rowCount(), residentMegabytes(), before);
     window.stopWork();

@@ -1,11 +1,11 @@
 // A device table against a plain table widget filled item by item, and against a view on a bare array model.
 //   bench_tables [DEVICES…]
 
-#include "deviceexport.h"
-#include "deviceinventory.h"
-#include "mainconsoletable.h"
-#include "sitetree.h"
-#include "theme.h"
+#include "devices/inventory/deviceexport.h"
+#include "devices/inventory/deviceinventory.h"
+#include "devices/page/mainconsoletable.h"
+#include "devices/sites/sitetree.h"
+#include "widgets/style/theme.h"
 
 #include <QAbstractTableModel>
 #include <QApplication>
@@ -143,14 +143,14 @@ double fillPlainWidget(const std::vector<DeviceRecordPtr> &records) {
 }
 
 /// Lets the event loop run until the items of the view are there, and notes the longest turn of it.
-void finishFill(MainConsoleTable &table, double &longestTurn) {
+void finishFill(MainConsoleTable &table, double &maxTurn) {
     while (table.rowCount() > 0 && !table.item(0, 0))
-        longestTurn = std::max(longestTurn, milliseconds([] { QApplication::processEvents(); }));
+        maxTurn = std::max(maxTurn, milliseconds([] { QApplication::processEvents(); }));
 }
 
 struct Times {
     double fill = 0;
-    double longestTurn = 0;
+    double maxTurn = 0;
     double sort = 0;
     double poll = 0;
 };
@@ -163,11 +163,11 @@ Times measureDeviceTable(const std::vector<DeviceRecordPtr> &records) {
     Times times;
     const auto snapshot = std::make_shared<const DeviceSnapshot>(records);
     times.fill = fillTime(table, [&] {
-        times.longestTurn = milliseconds([&] {
+        times.maxTurn = milliseconds([&] {
             inventory.replace(snapshot, {});
             table.refill();
         });
-        finishFill(table, times.longestTurn);
+        finishFill(table, times.maxTurn);
     });
     times.sort = milliseconds([&] {
         emit table.horizontalHeader()->sectionClicked(static_cast<int>(DeviceColumn::Ip));
@@ -282,7 +282,7 @@ void measure(int devices) {
     row("poll, a tenth changes", devices, middle(ours, &Times::poll), "(b) array model",
         middle(bare, &Times::poll), "at most 3, and 16 ms");
     std::printf("%-22s %7d  %9.2f ms   of the event loop while filling\n", "longest turn", devices,
-                middle(ours, &Times::longestTurn));
+                middle(ours, &Times::maxTurn));
     measureUse(records);
 }
 

@@ -1,14 +1,14 @@
 // A poll of ten thousand tasks with the panel that shows them, and the texts of state codes.
 //   bench_tasks EMULATOR FOLDER
 
-#include "apiclient.h"
-#include "localstore.h"
-#include "messagelog.h"
-#include "nettask.h"
-#include "taskinfopool.h"
-#include "taskpanel.h"
-#include "taskstate.h"
-#include "theme.h"
+#include "api/client/apiclient.h"
+#include "api/session/nettask.h"
+#include "platform/log/messagelog.h"
+#include "store/localstore.h"
+#include "tasks/panels/taskpanel.h"
+#include "tasks/service/taskinfopool.h"
+#include "tasks/service/taskstate.h"
+#include "widgets/style/theme.h"
 
 #include <QAbstractEventDispatcher>
 #include <QApplication>
@@ -42,14 +42,14 @@ public:
         connect(loop, &QAbstractEventDispatcher::awake, this, [this] { m_turn.start(); });
         connect(loop, &QAbstractEventDispatcher::aboutToBlock, this, [this] {
             if (m_turn.isValid())
-                m_longest = std::max(m_longest, m_turn.nsecsElapsed());
+                m_max = std::max(m_max, m_turn.nsecsElapsed());
         });
     }
-    double take() { return static_cast<double>(std::exchange(m_longest, 0)) / 1e6; }
+    double take() { return static_cast<double>(std::exchange(m_max, 0)) / 1e6; }
 
 private:
     QElapsedTimer m_turn;
-    qint64 m_longest = 0;
+    qint64 m_max = 0;
 };
 
 int startEmulator(QProcess &emulator, const QString &program, const QString &folder) {

@@ -3,8 +3,8 @@
 // Each upload is a process of its own; the client's is this program again:
 //   bench_uploads --send PORT ACCOUNT TASK FILE, the token on standard input
 
-#include "apiclient.h"
-#include "ciphers.h"
+#include "api/client/apiclient.h"
+#include "platform/crypto/ciphers.h"
 
 #include <QCoreApplication>
 #include <QElapsedTimer>

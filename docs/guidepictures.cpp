@@ -2,13 +2,13 @@
 // pictures that its pages show.
 //   guide-pictures FOLDER
 
-#include "devicewindow.h"
-#include "filefield.h"
-#include "mainconsoletable.h"
-#include "mainwindow.h"
-#include "program.h"
-#include "sidepanel.h"
-#include "titlebar.h"
+#include "app/frame/mainwindow.h"
+#include "app/frame/sidepanel.h"
+#include "app/frame/titlebar.h"
+#include "app/program.h"
+#include "devices/operations/files/filefield.h"
+#include "devices/page/devicewindow.h"
+#include "devices/page/mainconsoletable.h"
 
 #include <QAbstractButton>
 #include <QAction>

@@ -1,14 +1,14 @@
 #include "control.h"
 
-#include "answer.h"
-#include "clock.h"
-#include "device_commit.h"
-#include "faults.h"
-#include "fleet.h"
+#include "devices/devicecommit.h"
+#include "http/answer.h"
+#include "http/faults.h"
 #include "platform.h"
-#include "random.h"
 #include "service.h"
-#include "stop_signal.h"
+#include "simulation/clock.h"
+#include "simulation/fleet.h"
+#include "simulation/random.h"
+#include "stopsignal.h"
 
 #include <algorithm>
 #include <charconv>
@@ -62,7 +62,7 @@ void hold(Model &model, Device &device, bool reachable) {
     changeConnection(model, device, reachable);
 }
 
-void letIn(Model &model, Device &device) {
+void authorize(Model &model, Device &device) {
     hold(model, device, true);
     model.authorization.admit(device);
 }
@@ -70,7 +70,7 @@ void letIn(Model &model, Device &device) {
 std::size_t admitAll(Model &model) {
     Transaction transaction(model.store.database());
     for (std::size_t i = 0; i < model.devices.size(); ++i) {
-        letIn(model, model.devices.at(i));
+        authorize(model, model.devices.at(i));
     }
     transaction.commit();
     return model.devices.size();
@@ -251,7 +251,7 @@ std::string Control::admit(const std::string &what) {
         if (what == "all") {
             return admitAll(model);
         }
-        letIn(model, model.devices.get(what));
+        authorize(model, model.devices.get(what));
         return std::size_t{1};
     }));
 }
@@ -276,7 +276,7 @@ std::string Control::tick(const std::string &count) {
         throw std::runtime_error("tick takes a number of ticks");
     }
     for (std::size_t i = 0; i < *number; ++i) {
-        m_service.liveTick();
+        m_service.step();
     }
     return "ok";
 }

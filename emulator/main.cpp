@@ -1,14 +1,14 @@
 #include "control.h"
-#include "credentials.h"
-#include "faults.h"
-#include "https_server.h"
-#include "nvlcrypto.h"
+#include "http/faults.h"
+#include "http/httpsserver.h"
+#include "http/utf8path.h"
 #include "options.h"
 #include "platform.h"
+#include "platform/crypto/nvlcrypto.h"
 #include "service.h"
-#include "service_files.h"
-#include "stop_signal.h"
-#include "utf8_path.h"
+#include "stopsignal.h"
+#include "tables/credentials.h"
+#include "tables/servicefiles.h"
 
 #include <cstdlib>
 #include <filesystem>
@@ -32,9 +32,9 @@ void useKeyOf(const std::filesystem::path &folder) {
 }
 
 void live(emulator::Service &service, const emulator::StopSignal &stop) {
-    while (!stop.waitFor(service.restTime())) {
+    while (!stop.waitFor(service.timeUntilNextWork())) {
         try {
-            service.lookAfter();
+            service.runDueWork();
         } catch (const std::exception &error) {
             std::cerr << std::string("nvldm-emulator: a tick failed: ") + error.what() + "\n";
         }

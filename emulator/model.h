@@ -1,18 +1,18 @@
 #pragma once
 
-#include "accounts.h"
-#include "alarm_table.h"
-#include "batches.h"
-#include "device_authorization.h"
-#include "device_table.h"
-#include "log_table.h"
-#include "orb.h"
-#include "scans.h"
-#include "sessions.h"
-#include "settings.h"
-#include "site_tree.h"
-#include "store.h"
-#include "task_engine.h"
+#include "devices/deviceauthorization.h"
+#include "devices/scans.h"
+#include "http/sessions.h"
+#include "tables/accounts.h"
+#include "tables/alarmtable.h"
+#include "tables/batches.h"
+#include "tables/devicetable.h"
+#include "tables/logtable.h"
+#include "tables/orb.h"
+#include "tables/settings.h"
+#include "tables/sitetree.h"
+#include "tables/store.h"
+#include "tasks/taskengine.h"
 
 #include <filesystem>
 

@@ -1,6 +1,6 @@
 #include "options.h"
 
-#include "utf8_path.h"
+#include "http/utf8path.h"
 
 #include <charconv>
 #include <functional>
@@ -167,8 +167,8 @@ OrbUser orbUserOf(const std::string &text) {
 using Setters = std::map<std::string, std::function<void(const std::string &)>>;
 
 Setters valueSetters(Options &options) {
-    constexpr int longestMs = 3600000;
-    constexpr std::int64_t longestHold = 3600000;
+    constexpr int maxMs = 3600000;
+    constexpr std::int64_t maxHold = 3600000;
     return {
         {"--host", [&](const std::string &text) { options.host = text; }},
         {"--port", numberInto("--port", options.port, 65535)},
@@ -176,22 +176,22 @@ Setters valueSetters(Options &options) {
         {"--sites", numberInto<std::size_t>("--sites", options.sites, 5000)},
         {"--seed", numberInto<std::uint64_t>("--seed", options.seed, UINT64_MAX)},
         {"--root", [&](const std::string &text) { options.root = pathOf(text); }},
-        {"--latency", numberInto("--latency", options.latencyMs, longestMs)},
+        {"--latency", numberInto("--latency", options.latencyMs, maxMs)},
         {"--upload-limit", numberInto<std::uint64_t>("--upload-limit", options.uploadLimit, UINT64_MAX)},
-        {"--life", numberInto("--life", options.lifeMs, longestMs)},
+        {"--life", numberInto("--life", options.lifeMs, maxMs)},
         {"--session-limit", numberInto<std::size_t>("--session-limit", options.sessionLimit, 1000000)},
-        {"--batch-timeout", numberInto("--batch-timeout", options.batchTimeoutMs, longestHold)},
-        {"--token-grace", numberInto("--token-grace", options.tokenGraceMs, longestHold)},
-        {"--block-time", numberInto("--block-time", options.blockMs, longestHold)},
-        {"--task-pace", numberInto("--task-pace", options.taskPaceMs, longestHold)},
-        {"--task-work-timeout", numberInto("--task-work-timeout", options.taskWorkTimeoutMs, longestHold)},
+        {"--batch-timeout", numberInto("--batch-timeout", options.batchTimeoutMs, maxHold)},
+        {"--token-grace", numberInto("--token-grace", options.tokenGraceMs, maxHold)},
+        {"--block-time", numberInto("--block-time", options.blockMs, maxHold)},
+        {"--task-pace", numberInto("--task-pace", options.taskPaceMs, maxHold)},
+        {"--task-work-timeout", numberInto("--task-work-timeout", options.taskWorkTimeoutMs, maxHold)},
         {"--task-failures", numberInto("--task-failures", options.taskFailures, 1.0)},
         {"--tasks", numberInto<std::size_t>("--tasks", options.tasks, 20000)},
         {"--task-devices", numberInto<std::size_t>("--task-devices", options.taskDevices, 1000)},
         {"--alarms", numberInto<std::size_t>("--alarms", options.alarms, 5000)},
         {"--log-entries", numberInto<std::size_t>("--log-entries", options.logEntries, 200000)},
         {"--fault", [&](const std::string &text) { options.faults.push_back(text); }},
-        {"--orb-sign-in", numberInto("--orb-sign-in", options.orbSignInMs, longestHold)},
+        {"--orb-sign-in", numberInto("--orb-sign-in", options.orbSignInMs, maxHold)},
         {"--orb-user", [&](const std::string &text) { options.orbUsers.push_back(orbUserOf(text)); }},
         {"--account", [&](const std::string &text) { options.accounts.push_back(accountOf(text)); }},
     };

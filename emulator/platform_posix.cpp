@@ -1,6 +1,6 @@
 #include "platform.h"
 
-#include "utf8_path.h"
+#include "http/utf8path.h"
 
 #include <fcntl.h>
 #include <poll.h>

@@ -1,7 +1,7 @@
 #include "platform.h"
 
-#include "owneraccess.h"
-#include "utf8_path.h"
+#include "http/utf8path.h"
+#include "platform/windows/windowsacl.h"
 
 #include <windows.h>
 #include <winsock2.h>
@@ -70,13 +70,13 @@ std::optional<std::string> readInput(std::chrono::milliseconds time) {
 }
 
 void makePrivateFolder(const std::filesystem::path &folder) {
-    if (!OwnerAccess::makeFolder(folder.wstring()) && !std::filesystem::is_directory(folder)) {
+    if (!WindowsAcl::makeFolder(folder.wstring()) && !std::filesystem::is_directory(folder)) {
         throw std::runtime_error("cannot make the folder " + utf8(folder));
     }
 }
 
 void makePrivateFile(const std::filesystem::path &path) {
-    if (!OwnerAccess::makeFile(path.wstring()) && !std::filesystem::exists(path)) {
+    if (!WindowsAcl::makeFile(path.wstring()) && !std::filesystem::exists(path)) {
         throw std::runtime_error("cannot open " + utf8(path));
     }
 }

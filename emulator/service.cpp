@@ -1,9 +1,9 @@
 #include "service.h"
 
-#include "clock.h"
-#include "fleet.h"
-#include "history.h"
 #include "options.h"
+#include "simulation/clock.h"
+#include "simulation/fleet.h"
+#include "simulation/history.h"
 
 #include <algorithm>
 #include <iostream>
@@ -39,10 +39,10 @@ Service::Service(const Options &options, const std::filesystem::path &storePath)
                               m_model.seed()};
     m_model.alarms.raise(AlarmKind::ServerStarted, nullptr, nowMs());
     m_model.scans.seedNeighbours(m_model.seed());
-    m_life = std::make_unique<Life>(m_model);
+    m_life = std::make_unique<FleetSimulator>(m_model);
 }
 
-void Service::lookAfter() {
+void Service::runDueWork() {
     const std::lock_guard lock(m_mutex);
     m_model.authorization.settle(nowMs());
     m_model.batches.dropOverdue(nowMs());
@@ -58,7 +58,7 @@ void Service::lookAfter() {
     }
 }
 
-std::chrono::milliseconds Service::restTime() {
+std::chrono::milliseconds Service::timeUntilNextWork() {
     using std::chrono::milliseconds;
     const std::lock_guard lock(m_mutex);
     const milliseconds pace(m_model.engine.rules().paceMs);
@@ -66,7 +66,7 @@ std::chrono::milliseconds Service::restTime() {
     return std::clamp(std::min(pace, untilTick), milliseconds(10), milliseconds(1000));
 }
 
-void Service::liveTick() {
+void Service::step() {
     const std::lock_guard lock(m_mutex);
     m_life->tick();
 }

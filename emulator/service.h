@@ -1,8 +1,8 @@
 #pragma once
 
-#include "generic_token.h"
-#include "life.h"
+#include "http/generictoken.h"
 #include "model.h"
+#include "simulation/fleetsimulator.h"
 
 #include <chrono>
 #include <filesystem>
@@ -31,11 +31,11 @@ public:
     const GenericTokenJudge &genericTokens() const { return m_genericTokens; }
 
     /// Does what has fallen due and, unless life is off, lives a tick when it is time for one.
-    void lookAfter();
+    void runDueWork();
     /// How long nothing needs to be looked after.
-    std::chrono::milliseconds restTime();
+    std::chrono::milliseconds timeUntilNextWork();
     /// Lives one tick, life off or not.
-    void liveTick();
+    void step();
     void letLive(bool lives);
     /// To be called once, before the program ends in good order.
     void noteStop();
@@ -48,7 +48,7 @@ private:
     GenericTokenJudge m_genericTokens;
     std::mutex m_mutex;
     Model m_model;
-    std::unique_ptr<Life> m_life;
+    std::unique_ptr<FleetSimulator> m_life;
     bool m_lives;
     std::chrono::milliseconds m_tickLength;
     std::chrono::steady_clock::time_point m_nextTick;

@@ -1,6 +1,6 @@
 # What ./run, ./test and ./bench/run share. Sourced from the project's folder.
 
-project_packages="cmake g++ ninja-build pkg-config qt6-base-dev qt6-svg-dev
+project_packages="cmake g++ lld ninja-build pkg-config python3 qt6-base-dev qt6-svg-dev
     qt6-tools-dev qt6-l10n-tools qt6-tools-dev-tools qt6-translations-l10n
     libcpp-httplib-dev libsqlitecpp-dev libsqlite3-dev nlohmann-json3-dev libyaml-cpp-dev libssl-dev dbus-daemon
     fonts-inter fonts-symbola"

@@ -1477,7 +1477,7 @@
     </message>
 </context>
 <context>
-    <name>ConsoleCorner</name>
+    <name>DeviceTabsCorner</name>
     <message>
         <source>Search devices</source>
         <translation>Geräte suchen</translation>
@@ -2184,7 +2184,7 @@
     </message>
 </context>
 <context>
-    <name>FailedHandOver</name>
+    <name>FailedSubmission</name>
     <message numerus="yes">
         <source>%1 on %n device(s) did not begin. %2</source>
         <translation>
@@ -2217,7 +2217,7 @@
     </message>
 </context>
 <context>
-    <name>FailedTaskStrip</name>
+    <name>FailedTaskBanner</name>
     <message>
         <source>Start again</source>
         <translation>Erneut starten</translation>
@@ -2422,7 +2422,7 @@
     </message>
 </context>
 <context>
-    <name>JobEnd</name>
+    <name>JobOutcome</name>
     <message>
         <source>the client is busy, try again</source>
         <translation>der Client ist beschäftigt, bitte erneut versuchen</translation>
@@ -3100,14 +3100,14 @@
     </message>
 </context>
 <context>
-    <name>PolicyView</name>
+    <name>PasswordChecklist</name>
     <message>
         <source>The devices have no policy of their own.</source>
         <translation>Die Geräte haben keine eigene Richtlinie.</translation>
     </message>
 </context>
 <context>
-    <name>QueueStrips</name>
+    <name>QueueBanners</name>
     <message numerus="yes">
         <source>Left out: %n device(s) that the server does not manage any more.</source>
         <translation>
@@ -3442,7 +3442,7 @@
     </message>
 </context>
 <context>
-    <name>RolloutRow</name>
+    <name>RolloutBannerRow</name>
     <message>
         <source>Continue</source>
         <translation>Fortsetzen</translation>
@@ -4355,7 +4355,7 @@
     </message>
 </context>
 <context>
-    <name>TargetBox</name>
+    <name>TargetSummary</name>
     <message>
         <source>Show</source>
         <translation>Anzeigen</translation>
@@ -5150,7 +5150,7 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     </message>
 </context>
 <context>
-    <name>TransferStrip</name>
+    <name>TransferBanner</name>
     <message>
         <source>Upload progress</source>
         <translation>Fortschritt des Hochladens</translation>

@@ -1455,7 +1455,7 @@
     </message>
 </context>
 <context>
-    <name>ConsoleCorner</name>
+    <name>DeviceTabsCorner</name>
     <message>
         <source>Search devices</source>
         <translation>デバイスを検索</translation>
@@ -2150,7 +2150,7 @@
     </message>
 </context>
 <context>
-    <name>FailedHandOver</name>
+    <name>FailedSubmission</name>
     <message numerus="yes">
         <source>%1 on %n device(s) did not begin. %2</source>
         <translation>
@@ -2181,7 +2181,7 @@
     </message>
 </context>
 <context>
-    <name>FailedTaskStrip</name>
+    <name>FailedTaskBanner</name>
     <message>
         <source>Start again</source>
         <translation>もう一度開始</translation>
@@ -2382,7 +2382,7 @@
     </message>
 </context>
 <context>
-    <name>JobEnd</name>
+    <name>JobOutcome</name>
     <message>
         <source>the client is busy, try again</source>
         <translation>クライアントがビジー状態です。もう一度お試しください</translation>
@@ -3056,14 +3056,14 @@
     </message>
 </context>
 <context>
-    <name>PolicyView</name>
+    <name>PasswordChecklist</name>
     <message>
         <source>The devices have no policy of their own.</source>
         <translation>デバイスに固有のポリシーはありません。</translation>
     </message>
 </context>
 <context>
-    <name>QueueStrips</name>
+    <name>QueueBanners</name>
     <message numerus="yes">
         <source>Left out: %n device(s) that the server does not manage any more.</source>
         <translation>
@@ -3394,7 +3394,7 @@
     </message>
 </context>
 <context>
-    <name>RolloutRow</name>
+    <name>RolloutBannerRow</name>
     <message>
         <source>Continue</source>
         <translation>続行</translation>
@@ -4303,7 +4303,7 @@
     </message>
 </context>
 <context>
-    <name>TargetBox</name>
+    <name>TargetSummary</name>
     <message>
         <source>Show</source>
         <translation>表示</translation>
@@ -5093,7 +5093,7 @@ What is done to devices shows here.</source>
     </message>
 </context>
 <context>
-    <name>TransferStrip</name>
+    <name>TransferBanner</name>
     <message>
         <source>Upload progress</source>
         <translation>アップロードの進行状況</translation>

@@ -1,10 +1,10 @@
-#include "startcheck.h"
+#include "app/startcheck.h"
 
-#include "apilocalclient.h"
-#include "clientstore.h"
-#include "configstore.h"
-#include "localstore.h"
-#include "netjob.h"
+#include "api/client/apilocalclient.h"
+#include "api/session/netjob.h"
+#include "store/clientstore.h"
+#include "store/configstore.h"
+#include "store/localstore.h"
 
 #include <QDebug>
 
@@ -109,8 +109,8 @@ void StartCheck::askService() {
             else
                 emit loginNeeded(service.state == LocalService::State::Silent ? silent : QString());
         },
-        [this, requests = m_requests](JobEnd end) {
-            if (end != JobEnd::Delivered && !requests.isCut())
+        [this, requests = m_requests](JobOutcome end) {
+            if (end != JobOutcome::Delivered && !requests.isCut())
                 emitUnchecked();
         });
     if (!started)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "requestgroup.h"
+#include "api/session/requestgroup.h"
 
 #include <QObject>
 

@@ -1,4 +1,4 @@
-#include "ipv4.h"
+#include "base/ipv4.h"
 
 namespace Ipv4 {
 

@@ -1,4 +1,4 @@
-#include "macaddress.h"
+#include "base/macaddress.h"
 
 #include <charconv>
 

@@ -1,4 +1,4 @@
-#include "spreadsheetcell.h"
+#include "base/spreadsheetcell.h"
 
 namespace SpreadsheetCell {
 

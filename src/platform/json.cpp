@@ -1,6 +1,6 @@
-#include "json.h"
+#include "platform/json.h"
 
-#include "elementtexts.h"
+#include "platform/elementtexts.h"
 
 #include <nlohmann/json.hpp>
 

@@ -1,7 +1,7 @@
-#include "basestore.h"
+#include "store/basestore.h"
 
-#include "json.h"
-#include "nvldmstore.h"
+#include "platform/files/nvldmstore.h"
+#include "platform/json.h"
 
 #include <nlohmann/json.hpp>
 

@@ -1,8 +1,8 @@
-#include "clientstore.h"
+#include "store/clientstore.h"
 
-#include "apppaths.h"
-#include "ciphers.h"
-#include "nvldmstore.h"
+#include "platform/crypto/ciphers.h"
+#include "platform/files/apppaths.h"
+#include "platform/files/nvldmstore.h"
 
 #include <QDebug>
 

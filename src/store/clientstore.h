@@ -1,7 +1,7 @@
 #pragma once
 
-#include "basestore.h"
-#include "json.h"
+#include "platform/json.h"
+#include "store/basestore.h"
 
 /// An account as the login dialog offers it again. The password is kept in cipher form.
 struct AccountInfo {

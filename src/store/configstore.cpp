@@ -1,7 +1,7 @@
-#include "configstore.h"
+#include "store/configstore.h"
 
-#include "apppaths.h"
-#include "json.h"
+#include "platform/files/apppaths.h"
+#include "platform/json.h"
 
 #include <nlohmann/json.hpp>
 

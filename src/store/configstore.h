@@ -1,6 +1,6 @@
 #pragma once
 
-#include "basestore.h"
+#include "store/basestore.h"
 
 #include <QtGlobal>
 

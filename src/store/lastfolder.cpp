@@ -1,7 +1,7 @@
-#include "lastfolder.h"
+#include "store/lastfolder.h"
 
-#include "localstore.h"
-#include "storewriter.h"
+#include "store/localstore.h"
+#include "store/storewriter.h"
 
 #include <QDir>
 #include <QFileInfo>

@@ -1,9 +1,9 @@
-#include "localstore.h"
+#include "store/localstore.h"
 
-#include "apppaths.h"
-#include "ciphers.h"
-#include "messagelog.h"
-#include "serverkeys.h"
+#include "platform/crypto/ciphers.h"
+#include "platform/files/apppaths.h"
+#include "platform/log/messagelog.h"
+#include "store/serverkeys.h"
 
 #include <QDebug>
 
@@ -17,7 +17,7 @@ const QString kFwUploadOnlyApplyFail = QStringLiteral("kFwUploadOnlyApplyFail");
 const QString kFWUploadScheduleOnOff = QStringLiteral("kFWUploadScheduleOnOff");
 const QString kFwRolloutsPrefix = QStringLiteral("kFwRollouts_");
 
-constexpr qsizetype mostSpares = 8;
+constexpr qsizetype maxSpares = 8;
 
 QByteArray cipherOf(const QByteArray &rawToken) {
     qDebug("CLocalStore::setAccess > strRawToken: %s", MessageLog::secret(rawToken).constData());
@@ -96,7 +96,7 @@ void CLocalStore::renewAccess(const QByteArray &rawToken, const QByteArray &carr
         return;
     if (m_login.token == carried)
         m_spares.clear();
-    else if (m_spares.size() < mostSpares)
+    else if (m_spares.size() < maxSpares)
         m_spares.append(m_login.token);
     m_access = token;
     m_login.token = token;

@@ -1,9 +1,9 @@
-#include "serverkeys.h"
+#include "store/serverkeys.h"
 
-#include "apppaths.h"
-#include "json.h"
-#include "nvldmstore.h"
-#include "storewriter.h"
+#include "platform/files/apppaths.h"
+#include "platform/files/nvldmstore.h"
+#include "platform/json.h"
+#include "store/storewriter.h"
 
 #include <QStringList>
 

@@ -1,4 +1,4 @@
-#include "storewriter.h"
+#include "store/storewriter.h"
 
 #include <QCoreApplication>
 #include <QThreadPool>

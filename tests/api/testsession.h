@@ -1,8 +1,8 @@
 #pragma once
 
-#include "apiclient.h"
-#include "ciphers.h"
-#include "nvlcrypto.h"
+#include "api/client/apiclient.h"
+#include "platform/crypto/ciphers.h"
+#include "platform/crypto/nvlcrypto.h"
 
 #include <nlohmann/json.hpp>
 

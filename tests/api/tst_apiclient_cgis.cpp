@@ -1,6 +1,7 @@
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "scriptedpeer.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
 
 #include <QTest>
@@ -156,5 +157,5 @@ void TestApiClientCgis::generalAnswerIsLoggedBeforeItIsJudged() {
     QCOMPARE(log.count(QString(4097, u'x')), 0);
 }
 
-QTEST_GUILESS_MAIN(TestApiClientCgis)
+NVLDM_GUILESS_TEST(TestApiClientCgis)
 #include "tst_apiclient_cgis.moc"

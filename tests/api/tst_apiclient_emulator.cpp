@@ -1,14 +1,15 @@
-#include "apiclient.h"
-#include "clientstore.h"
-#include "configstore.h"
-#include "emulatorprocess.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "pagereader.h"
-#include "processsetup.h"
-#include "servicecontrol.h"
-#include "servicerequest.h"
+#include "api/client/apiclient.h"
+#include "api/session/pagereader.h"
+#include "api/session/servicerequest.h"
+#include "platform/system/processsetup.h"
+#include "platform/system/servicecontrol.h"
+#include "store/clientstore.h"
+#include "store/configstore.h"
+#include "store/localstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QTest>
 
@@ -341,5 +342,5 @@ void TestApiClientEmulator::serviceThatDies() {
     QCOMPARE(online, 0u);
 }
 
-QTEST_GUILESS_MAIN(TestApiClientEmulator)
+NVLDM_GUILESS_TEST(TestApiClientEmulator)
 #include "tst_apiclient_emulator.moc"

@@ -1,13 +1,14 @@
-#include "apilocalclient.h"
-#include "certificatemaker.h"
-#include "clientidentity.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "nettask.h"
-#include "requestdeadline.h"
-#include "scriptedpeer.h"
-#include "serverkeycheck.h"
+#include "api/client/apilocalclient.h"
+#include "api/session/nettask.h"
+#include "api/transport/clientidentity.h"
+#include "api/transport/requestdeadline.h"
+#include "api/transport/serverkeycheck.h"
+#include "store/localstore.h"
+#include "support/certificatemaker.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
 
 #include <QDir>
@@ -590,5 +591,5 @@ void TestApiClientJudging::endOfTheProgramCutsRequests() {
     QCOMPARE(client(m_peer.port())->removeSite("SR1"), unsigned(ApiTransportError));
 }
 
-QTEST_GUILESS_MAIN(TestApiClientJudging)
+NVLDM_GUILESS_TEST(TestApiClientJudging)
 #include "tst_apiclient_judging.moc"

@@ -1,7 +1,8 @@
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "orbservicestatus.h"
-#include "scriptedpeer.h"
+#include "api/client/orbservicestatus.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
 
 #include <QTest>
@@ -303,5 +304,5 @@ void TestApiClientRequests::tokens() {
     QCOMPARE(log.count("CApiClient::setAccessToken > fail to create szRawToken"), 2);
 }
 
-QTEST_GUILESS_MAIN(TestApiClientRequests)
+NVLDM_GUILESS_TEST(TestApiClientRequests)
 #include "tst_apiclient_requests.moc"

@@ -1,8 +1,9 @@
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "scriptedpeer.h"
+#include "api/transport/transfer.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
-#include "transfer.h"
 
 #include <QElapsedTimer>
 #include <QTest>
@@ -234,5 +235,5 @@ void TestApiClientTransfers::progressCountsAndNotTime() {
     QCOMPARE(m_transfer->failure(), TransferFailure::Stalled);
 }
 
-QTEST_GUILESS_MAIN(TestApiClientTransfers)
+NVLDM_GUILESS_TEST(TestApiClientTransfers)
 #include "tst_apiclient_transfers.moc"

@@ -1,10 +1,11 @@
-#include "clientstore.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "scriptedpeer.h"
+#include "api/transport/transfer.h"
+#include "store/clientstore.h"
+#include "store/localstore.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
-#include "transfer.h"
 
 #include <QTest>
 
@@ -271,5 +272,5 @@ void TestApiClientUploads::exportTargets() {
     QCOMPARE(m_root.read("report.zip"), "old");
 }
 
-QTEST_GUILESS_MAIN(TestApiClientUploads)
+NVLDM_GUILESS_TEST(TestApiClientUploads)
 #include "tst_apiclient_uploads.moc"

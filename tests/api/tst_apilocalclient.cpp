@@ -1,10 +1,11 @@
-#include "apilocalclient.h"
-#include "configstore.h"
-#include "emulatorprocess.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "scriptedpeer.h"
+#include "api/client/apilocalclient.h"
+#include "store/configstore.h"
+#include "store/localstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
 
 #include <QTest>
@@ -123,5 +124,5 @@ void TestApiLocalClient::accountsOfAService() {
     QCOMPARE(client().memberList(0, 10, members), unsigned(ApiTransportError));
 }
 
-QTEST_GUILESS_MAIN(TestApiLocalClient)
+NVLDM_GUILESS_TEST(TestApiLocalClient)
 #include "tst_apilocalclient.moc"

@@ -1,11 +1,12 @@
-#include "ciphers.h"
-#include "emulatorprocess.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "orbservicestatus.h"
-#include "scriptedpeer.h"
-#include "servicesession.h"
+#include "api/client/orbservicestatus.h"
+#include "api/session/servicesession.h"
+#include "platform/crypto/ciphers.h"
+#include "store/localstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
 
 #include <QTest>
@@ -199,5 +200,5 @@ void TestApiRemote::whoseSessionCode105Ends() {
     QCOMPARE(m_peer.takeRequests().size(), std::size_t(2));
 }
 
-QTEST_GUILESS_MAIN(TestApiRemote)
+NVLDM_GUILESS_TEST(TestApiRemote)
 #include "tst_apiremote.moc"

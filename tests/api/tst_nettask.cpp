@@ -1,6 +1,7 @@
-#include "logcapture.h"
-#include "netjob.h"
-#include "requestturn.h"
+#include "api/session/netjob.h"
+#include "api/session/requestturn.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QCoreApplication>
 #include <QPointer>
@@ -67,7 +68,7 @@ void TestNetTask::oneJobAtATime() {
             --inside;
             return 0;
         };
-        QVERIFY(NetJob::post(NetJob::createRunner("test"), this, work, {}, [&](JobEnd) { ++ended; }));
+        QVERIFY(NetJob::post(NetJob::createRunner("test"), this, work, {}, [&](JobOutcome) { ++ended; }));
     }
     QTRY_COMPARE(ended, runners);
     QCOMPARE(meetings.load(), 0);
@@ -134,8 +135,9 @@ void TestNetTask::resultComesHome() {
         QCOMPARE(QThread::currentThread(), qApp->thread());
     };
     const QPointer<NetTask> runner = NetJob::createRunner("test");
-    QVERIFY(NetJob::post(runner.data(), &receiver, work, done,
-                         [&](JobEnd end) { steps << (end == JobEnd::Delivered ? "delivered" : "other"); }));
+    QVERIFY(NetJob::post(runner.data(), &receiver, work, done, [&](JobOutcome end) {
+        steps << (end == JobOutcome::Delivered ? "delivered" : "other");
+    }));
     QTRY_COMPARE(steps, QStringList({"result", "delivered"}));
     QVERIFY(workThread != qApp->thread());
     QTRY_VERIFY2(!runner, "a runner of one job deletes itself");
@@ -148,7 +150,7 @@ void TestNetTask::runnerTakesTheNextJob() {
         bool ended = false;
         QVERIFY(NetJob::post(
             &runner, this, [i] { return i; }, [&](int result) { sum += result; },
-            [&](JobEnd) { ended = true; }));
+            [&](JobOutcome) { ended = true; }));
         QTRY_VERIFY(ended);
         QVERIFY(runner.wait(10000));
     }
@@ -160,8 +162,9 @@ void TestNetTask::busyRunnerRefuses() {
     holdTurn(runner);
     bool touched = false;
     const auto touch = [&] { return touched = true; };
-    QVERIFY(!NetJob::post(&runner, this, touch, {}, [&](JobEnd) { touched = true; }));
-    QVERIFY(!NetJob::post(static_cast<NetTask *>(nullptr), this, touch, {}, [&](JobEnd) { touched = true; }));
+    QVERIFY(!NetJob::post(&runner, this, touch, {}, [&](JobOutcome) { touched = true; }));
+    QVERIFY(
+        !NetJob::post(static_cast<NetTask *>(nullptr), this, touch, {}, [&](JobOutcome) { touched = true; }));
     m_release.release();
     QVERIFY(runner.wait(10000));
     QCoreApplication::processEvents();
@@ -181,11 +184,11 @@ void TestNetTask::jobThatThrows() {
     QFETCH(QString, message);
     const LogCapture log;
     NetTask runner;
-    QList<JobEnd> ends;
+    QList<JobOutcome> ends;
     bool delivered = false;
     const auto done = [&](int) { delivered = true; };
-    QVERIFY(NetJob::post(&runner, this, work, done, [&](JobEnd end) { ends << end; }));
-    QTRY_COMPARE(ends, QList<JobEnd>{JobEnd::Failed});
+    QVERIFY(NetJob::post(&runner, this, work, done, [&](JobOutcome end) { ends << end; }));
+    QTRY_COMPARE(ends, QList<JobOutcome>{JobOutcome::Failed});
     QVERIFY(!delivered);
     QCOMPARE(log.count("Encountered unexpected error in NetTask: " + message), 1);
     QVERIFY(runner.wait(10000));
@@ -196,23 +199,23 @@ void TestNetTask::jobThatThrows() {
 
 void TestNetTask::jobThatNeverGotItsTurn() {
     const LogCapture log;
-    QList<JobEnd> ends;
+    QList<JobOutcome> ends;
     bool touched = false;
     const auto touch = [&] { return touched = true; };
     QVERIFY(NetJob::post(
         NetJob::createRunner("test"), this, touch, [&](bool) { touched = true; },
-        [&](JobEnd end) { ends << end; }, [] { throw std::runtime_error("no such host"); }));
-    QTRY_COMPARE(ends, QList<JobEnd>{JobEnd::NotRun});
+        [&](JobOutcome end) { ends << end; }, [] { throw std::runtime_error("no such host"); }));
+    QTRY_COMPARE(ends, QList<JobOutcome>{JobOutcome::NotRun});
     QVERIFY(!touched);
 }
 
 void TestNetTask::resultNobodyWants() {
-    QList<JobEnd> ends;
+    QList<JobOutcome> ends;
     bool delivered = false;
     QVERIFY(NetJob::post(
         NetJob::createRunner("test"), this, [] { return 1; }, [&](int) { delivered = true; },
-        [&](JobEnd end) { ends << end; }, {}, [] { return false; }));
-    QTRY_COMPARE(ends, QList<JobEnd>{JobEnd::SessionGone});
+        [&](JobOutcome end) { ends << end; }, {}, [] { return false; }));
+    QTRY_COMPARE(ends, QList<JobOutcome>{JobOutcome::SessionGone});
     QVERIFY(!delivered);
 }
 
@@ -225,7 +228,7 @@ void TestNetTask::receiverDestroyedWhileTheJobRuns() {
     const QPointer<NetTask> runner = NetJob::createRunner("test");
     QVERIFY(NetJob::post(
         runner.data(), receiver.get(), [&] { return ran = true; }, [&](bool) { told = true; },
-        [&](JobEnd) { told = true; }));
+        [&](JobOutcome) { told = true; }));
     receiver.reset();
     m_release.release();
     QTRY_VERIFY(!runner);
@@ -238,7 +241,7 @@ void TestNetTask::receiverDestroyedByTheResult() {
     int ended = 0;
     QVERIFY(NetJob::post(
         NetJob::createRunner("test"), receiver.get(), [] { return 1; }, [&](int) { receiver.reset(); },
-        [&](JobEnd) { ++ended; }));
+        [&](JobOutcome) { ++ended; }));
     QTRY_COMPARE(ended, 1);
     QVERIFY(!receiver);
 }
@@ -268,5 +271,5 @@ void TestNetTask::runAndWaitPassesTheTurn() {
     m_release.release();
 }
 
-QTEST_GUILESS_MAIN(TestNetTask)
+NVLDM_GUILESS_TEST(TestNetTask)
 #include "tst_nettask.moc"

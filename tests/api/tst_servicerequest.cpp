@@ -1,8 +1,9 @@
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "scriptedpeer.h"
-#include "serverkeys.h"
-#include "servicerequest.h"
+#include "api/session/servicerequest.h"
+#include "store/serverkeys.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 #include "testsession.h"
 
 #include <QElapsedTimer>
@@ -90,14 +91,14 @@ private:
     bool post() {
         return ServiceRequest::post(
             NetJob::createRunner("test"), this, removeSite, [this](unsigned result) { m_results << result; },
-            [this](JobEnd end) { m_ends << end; });
+            [this](JobOutcome end) { m_ends << end; });
     }
 
     IsolatedRoot m_root;
     ScriptedPeer m_peer;
     std::unique_ptr<LogCapture> m_log;
     QList<unsigned> m_results;
-    QList<JobEnd> m_ends;
+    QList<JobOutcome> m_ends;
 };
 
 void TestServiceRequest::init() {
@@ -116,7 +117,7 @@ void TestServiceRequest::cleanup() {
 void TestServiceRequest::renewedTokenIsStored() {
     m_peer.answer(ScriptedPeer::json({{"code", 0}}, {std::string("Authorization: ") + renewed}));
     QVERIFY(post());
-    QTRY_COMPARE(m_ends, QList<JobEnd>{JobEnd::Delivered});
+    QTRY_COMPARE(m_ends, QList<JobOutcome>{JobOutcome::Delivered});
     QCOMPARE(m_results, QList<unsigned>{ApiOk});
     QCOMPARE(m_peer.takeRequests().at(0).header("authorization"), TestSession::token);
     QCOMPARE(storedToken(), renewed);
@@ -160,7 +161,7 @@ void TestServiceRequest::answerAfterTheLogOff() {
     if (newSession)
         logIn();
     answered.release();
-    QTRY_COMPARE(m_ends, QList<JobEnd>{JobEnd::SessionGone});
+    QTRY_COMPARE(m_ends, QList<JobOutcome>{JobOutcome::SessionGone});
     QVERIFY(m_results.isEmpty());
     QCOMPARE(storedToken(), newSession ? TestSession::token : "");
     QVERIFY2(lost.isEmpty(), "an earlier session's end is nobody's concern");
@@ -174,7 +175,7 @@ void TestServiceRequest::nothingIsSentAfterTheLogOff() {
     QVERIFY(!session.isPresent());
     QCOMPARE(removeSite(session), unsigned(ApiInvalidArgument));
     QVERIFY(post());
-    QTRY_COMPARE(m_ends, QList<JobEnd>{JobEnd::Delivered});
+    QTRY_COMPARE(m_ends, QList<JobOutcome>{JobOutcome::Delivered});
     QCOMPARE(m_results, QList<unsigned>{ApiInvalidArgument});
     QCOMPARE(m_peer.connections(), before);
 }
@@ -209,7 +210,7 @@ void TestServiceRequest::endOfTheSessionCutsItsRequests() {
     QElapsedTimer clock;
     clock.start();
     ServiceSession::end();
-    QTRY_COMPARE(m_ends, QList<JobEnd>(2, JobEnd::SessionGone));
+    QTRY_COMPARE(m_ends, QList<JobOutcome>(2, JobOutcome::SessionGone));
     QVERIFY2(clock.elapsed() < 1000, "the end of the session was waited for");
     QCOMPARE(other, unsigned(ApiOk));
     login.cut();
@@ -220,7 +221,7 @@ void TestServiceRequest::lostSessionIsReportedOnce() {
     m_peer.answer(ScriptedPeer::json({{"code", 105}}));
     const QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
     QVERIFY(post() && post() && post());
-    QTRY_COMPARE(m_ends, QList<JobEnd>(3, JobEnd::SessionGone));
+    QTRY_COMPARE(m_ends, QList<JobOutcome>(3, JobOutcome::SessionGone));
     QCOMPARE(lost.size(), 1);
     QVERIFY(m_results.isEmpty());
 
@@ -319,7 +320,7 @@ void TestServiceRequest::failureIsAResult() {
     m_peer.answer(ScriptedPeer::Reply{});
     const QSignalSpy lost(&SessionEvents::instance(), &SessionEvents::sessionLost);
     QVERIFY(post());
-    QTRY_COMPARE(m_ends, QList<JobEnd>{JobEnd::Delivered});
+    QTRY_COMPARE(m_ends, QList<JobOutcome>{JobOutcome::Delivered});
     QCOMPARE(m_results, QList<unsigned>{ApiTransportError});
     m_peer.answer(ScriptedPeer::json({{"code", 108}}));
     QVERIFY(post());
@@ -327,5 +328,5 @@ void TestServiceRequest::failureIsAResult() {
     QVERIFY(lost.isEmpty());
 }
 
-QTEST_GUILESS_MAIN(TestServiceRequest)
+NVLDM_GUILESS_TEST(TestServiceRequest)
 #include "tst_servicerequest.moc"

@@ -1,10 +1,11 @@
-#include "accountmanagementdialog.h"
-#include "clientstore.h"
-#include "emulatorprocess.h"
+#include "api/session/nettask.h"
+#include "app/login/accountmanagementdialog.h"
 #include "form.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "nettask.h"
+#include "store/clientstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QCheckBox>
 #include <QSignalSpy>
@@ -178,5 +179,5 @@ private:
     std::unique_ptr<AccountManagementDialog> m_dialog;
 };
 
-QTEST_MAIN(TestAccountManagementDialog)
+NVLDM_TEST(TestAccountManagementDialog)
 #include "tst_accountmanagementdialog.moc"

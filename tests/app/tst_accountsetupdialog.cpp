@@ -1,9 +1,10 @@
-#include "accountsetupdialog.h"
-#include "clientstore.h"
-#include "emulatorprocess.h"
+#include "api/session/nettask.h"
+#include "app/login/accountsetupdialog.h"
 #include "form.h"
-#include "isolatedroot.h"
-#include "nettask.h"
+#include "store/clientstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/testmain.h"
 
 #include <QSignalSpy>
 
@@ -112,5 +113,5 @@ private:
     std::unique_ptr<QSignalSpy> m_created;
 };
 
-QTEST_MAIN(TestAccountSetupDialog)
+NVLDM_TEST(TestAccountSetupDialog)
 #include "tst_accountsetupdialog.moc"

@@ -1,4 +1,5 @@
-#include "idlewatch.h"
+#include "app/frame/idlewatch.h"
+#include "support/testmain.h"
 
 #include <QElapsedTimer>
 #include <QSignalSpy>
@@ -41,5 +42,5 @@ private slots:
     }
 };
 
-QTEST_GUILESS_MAIN(TestIdleWatch)
+NVLDM_GUILESS_TEST(TestIdleWatch)
 #include "tst_idlewatch.moc"

@@ -1,14 +1,15 @@
-#include "clientstore.h"
-#include "emulatorprocess.h"
+#include "api/session/nettask.h"
+#include "app/login/logindialog.h"
+#include "app/login/remoteconnectiondialog.h"
+#include "app/login/serverkeydialog.h"
 #include "form.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "logindialog.h"
-#include "nettask.h"
-#include "remoteconnectiondialog.h"
-#include "scriptedpeer.h"
-#include "serverkeydialog.h"
+#include "store/clientstore.h"
+#include "store/localstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
 
 #include <QAbstractItemView>
 #include <QComboBox>
@@ -433,5 +434,5 @@ private:
     std::unique_ptr<QSignalSpy> m_success;
 };
 
-QTEST_MAIN(TestLoginDialog)
+NVLDM_TEST(TestLoginDialog)
 #include "tst_logindialog.moc"

@@ -1,17 +1,18 @@
-#include "apiclient.h"
-#include "badgebutton.h"
-#include "confirmdialog.h"
-#include "devicewindow.h"
-#include "emulatorprocess.h"
-#include "exetaskmgr.h"
+#include "api/client/apiclient.h"
+#include "api/session/nettask.h"
+#include "app/frame/mainwindow.h"
+#include "devices/page/devicewindow.h"
 #include "form.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logwindow.h"
-#include "mainwindow.h"
-#include "nettask.h"
-#include "settingwindow.h"
-#include "taskinfopool.h"
+#include "pages/log/logwindow.h"
+#include "pages/settings/settingwindow.h"
+#include "store/localstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/testmain.h"
+#include "tasks/queue/exetaskmgr.h"
+#include "tasks/service/taskinfopool.h"
+#include "widgets/controls/badgebutton.h"
+#include "widgets/dialogs/confirmdialog.h"
 
 #include <QLabel>
 #include <QSpinBox>
@@ -156,5 +157,5 @@ private:
     std::unique_ptr<MainWindow> m_window;
 };
 
-QTEST_MAIN(TestMainWindow)
+NVLDM_TEST(TestMainWindow)
 #include "tst_mainwindow.moc"

@@ -1,4 +1,5 @@
-#include "passwordrule.h"
+#include "app/login/passwordrule.h"
+#include "support/testmain.h"
 
 #include <QTest>
 
@@ -28,5 +29,5 @@ private slots:
     }
 };
 
-QTEST_APPLESS_MAIN(TestPasswordRule)
+NVLDM_APPLESS_TEST(TestPasswordRule)
 #include "tst_passwordrule.moc"

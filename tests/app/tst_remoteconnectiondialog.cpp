@@ -1,12 +1,13 @@
-#include "clientstore.h"
-#include "customtable.h"
+#include "app/login/remoteconnectiondialog.h"
+#include "app/login/serverdialog.h"
 #include "form.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "nvldmstore.h"
-#include "remoteconnectiondialog.h"
-#include "serverdialog.h"
-#include "serverkeys.h"
+#include "platform/files/nvldmstore.h"
+#include "store/clientstore.h"
+#include "store/serverkeys.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
+#include "widgets/lists/customtable.h"
 
 #include <QCheckBox>
 #include <QRegularExpression>
@@ -214,5 +215,5 @@ private:
     CustomTable *m_table = nullptr;
 };
 
-QTEST_MAIN(TestRemoteConnectionDialog)
+NVLDM_TEST(TestRemoteConnectionDialog)
 #include "tst_remoteconnectiondialog.moc"

@@ -1,4 +1,5 @@
-#include "serveraddress.h"
+#include "app/login/serveraddress.h"
+#include "support/testmain.h"
 
 #include <QHostInfo>
 #include <QTest>
@@ -56,5 +57,5 @@ private slots:
     }
 };
 
-QTEST_GUILESS_MAIN(TestServerAddress)
+NVLDM_GUILESS_TEST(TestServerAddress)
 #include "tst_serveraddress.moc"

@@ -1,19 +1,20 @@
-#include "clientstore.h"
-#include "confirmdialog.h"
-#include "emulatorprocess.h"
+#include "api/session/nettask.h"
+#include "api/session/servicesession.h"
+#include "api/session/sessionevents.h"
+#include "app/remote/servicemanagement.h"
+#include "app/remote/servicemanagementaddservicedialog.h"
+#include "app/remote/servicemanagementstatusdialog.h"
 #include "form.h"
-#include "isolatedroot.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "nettask.h"
-#include "scriptedpeer.h"
-#include "servicemanagement.h"
-#include "servicemanagementaddservicedialog.h"
-#include "servicemanagementstatusdialog.h"
-#include "servicesession.h"
-#include "sessionevents.h"
-#include "toggleswitch.h"
-#include "transientmessage.h"
+#include "store/clientstore.h"
+#include "store/localstore.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/scriptedpeer.h"
+#include "support/testmain.h"
+#include "widgets/controls/toggleswitch.h"
+#include "widgets/dialogs/confirmdialog.h"
+#include "widgets/dialogs/transientmessage.h"
 
 #include <QComboBox>
 #include <QDesktopServices>
@@ -41,7 +42,7 @@ const QString unknown = QStringLiteral(
     "assistance.");
 const QString expired =
     QStringLiteral("Session expired. Click 'Back' to go to the previous step and try again.");
-const QString noPlace =
+const QString noIndex =
     QStringLiteral("No organization or site exist. Create an organization first or site.");
 const QString noAccess = QStringLiteral("One or more customers do not have remote access permission.");
 
@@ -103,67 +104,12 @@ private slots:
         QCOMPARE(asked.size(), 1);
         QCOMPARE(asked[0][0].toString(), QStringLiteral("connecting to ORB..."));
         QCOMPARE(answered.size(), 1);
-        auto *add = Form::visible<AddDialog>();
-        QCOMPARE(add->windowTitle(), QStringLiteral("Norvell Service Management"));
+        QCOMPARE(Form::visible<AddDialog>()->windowTitle(), QStringLiteral("Norvell Service Management"));
 
-        // With the keyboard alone.
-        QVERIFY(QTest::qWaitForWindowActive(add));
-        QCOMPARE(add->focusWidget()->objectName(), QStringLiteral("serviceComboBox"));
-        QTest::keyClick(add->focusWidget(), Qt::Key_Down);
-        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
-        QTest::keyClicks(add->focusWidget(), partner);
-        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
-        QTest::keyClicks(add->focusWidget(), partnerPassword);
-        QTest::keyClick(add->focusWidget(), Qt::Key_Return);
-        QTRY_VERIFY_WITH_TIMEOUT(atLocation(add), patienceMs);
-        QCOMPARE(errorOf(add), noAccess);
-        QTRY_COMPARE(add->focusWidget()->objectName(), QStringLiteral("organizationComboBox"));
-        auto *organizations = Form::part<QComboBox>(add, "organizationComboBox");
-        QStringList names;
-        for (int i = 0; i < organizations->count(); ++i)
-            names << organizations->itemText(i);
-        QCOMPARE(names, QStringList({"Alder Retail", "Harbour Logistics", "Riverside Schools"}));
-        QTest::keyClicks(organizations, "har");
-        QCOMPARE(errorOf(add), QString());
-        QVERIFY(!Form::part(add, "applyButton")->isEnabled());
-        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
-        QTest::keyClicks(add->focusWidget(), "ware");
-        for (int clicks = 0; clicks < 2; ++clicks)
-            Form::click(add, "applyButton");
-        QCOMPARE(message(add), QStringLiteral("Applying..."));
-        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<StatusDialog>(), patienceMs);
-        QCOMPARE(message(m_frame.get()), QStringLiteral("Applied successfully"));
-        QVERIFY(!Form::visible<AddDialog>());
-        QVERIFY(m_service.command("orb status").contains("\"connected\":true"));
-
-        auto *status = Form::visible<StatusDialog>();
-        auto *toggle = Form::part<ToggleSwitch>(status, "remoteAccessSwitch");
-        QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
-        QVERIFY(!toggle->isChecked());
-        QCOMPARE(Form::text(status, "linkStateLabel"), QStringLiteral("Connected"));
-        toggle->setFocus();
-        QTest::keyClick(toggle, Qt::Key_Space);
-        QCOMPARE(message(status), QStringLiteral("Set Remote Access..."));
-        QVERIFY(!toggle->isEnabled() && !Form::part(status, "disconnectButton")->isEnabled());
-        QTRY_COMPARE_WITH_TIMEOUT(message(status), QStringLiteral("Set remote access successfully!"),
-                                  patienceMs);
-        QVERIFY(toggle->isChecked() && toggle->isEnabled());
-        QVERIFY(m_service.command("orb status").contains("\"enable\":true"));
-
-        for (const char *answer : {"cancelButton", "acceptButton"}) {
-            Form::click(status, "disconnectButton");
-            QTRY_VERIFY(Form::visible<ConfirmDialog>());
-            QCOMPARE(
-                Form::text(Form::visible<ConfirmDialog>(), "messageLabel"),
-                QStringLiteral("Are you sure you want to disconnect from this service?\n\nDisconnecting will "
-                               "stop the synchronization of all devices managed by this Device Manager. You "
-                               "will need to set up the connection again to restore synchronization."));
-            Form::click(Form::visible<ConfirmDialog>(), answer);
-            QTRY_VERIFY(!Form::visible<ConfirmDialog>());
-        }
-        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<AddDialog>(), patienceMs);
-        QCOMPARE(message(m_frame.get()), QStringLiteral("Disconnected successfully!"));
-        QVERIFY(m_service.command("orb status").contains("added=0"));
+        signInWithTheKeyboard();
+        chooseOrganization();
+        switchRemoteAccess();
+        disconnectAfterAsking();
         QCOMPARE(added.size(), 3);
         QCOMPARE(added.last()[0].toBool(), false);
     }
@@ -199,8 +145,8 @@ private slots:
     }
 
     void locationsThatCannotBeChosen_data() {
-        rows({{"none", "orb orgs 0", "", noPlace},
-              {"no sites", "", "Alder Retail", noPlace},
+        rows({{"none", "orb orgs 0", "", noIndex},
+              {"no sites", "", "Alder Retail", noIndex},
               {"no remote access", "", "Riverside Schools", noAccess},
               {"the list is not answered", "fault reset@/v1/orb/orgs", "", unable},
               {"the list is no list", "fault wrong-types=data@/v1/orb/orgs", "", unknown},
@@ -407,6 +353,76 @@ private slots:
     }
 
 private:
+    void signInWithTheKeyboard() {
+        auto *add = Form::visible<AddDialog>();
+        QVERIFY(QTest::qWaitForWindowActive(add));
+        QCOMPARE(add->focusWidget()->objectName(), QStringLiteral("serviceComboBox"));
+        QTest::keyClick(add->focusWidget(), Qt::Key_Down);
+        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
+        QTest::keyClicks(add->focusWidget(), partner);
+        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
+        QTest::keyClicks(add->focusWidget(), partnerPassword);
+        QTest::keyClick(add->focusWidget(), Qt::Key_Return);
+        QTRY_VERIFY_WITH_TIMEOUT(atLocation(add), patienceMs);
+        QCOMPARE(errorOf(add), noAccess);
+        QTRY_COMPARE(add->focusWidget()->objectName(), QStringLiteral("organizationComboBox"));
+    }
+
+    void chooseOrganization() {
+        auto *add = Form::visible<AddDialog>();
+        auto *organizations = Form::part<QComboBox>(add, "organizationComboBox");
+        QStringList names;
+        for (int i = 0; i < organizations->count(); ++i)
+            names << organizations->itemText(i);
+        QCOMPARE(names, QStringList({"Alder Retail", "Harbour Logistics", "Riverside Schools"}));
+        QTest::keyClicks(organizations, "har");
+        QCOMPARE(errorOf(add), QString());
+        QVERIFY(!Form::part(add, "applyButton")->isEnabled());
+        QTest::keyClick(add->focusWidget(), Qt::Key_Tab);
+        QTest::keyClicks(add->focusWidget(), "ware");
+        for (int clicks = 0; clicks < 2; ++clicks)
+            Form::click(add, "applyButton");
+        QCOMPARE(message(add), QStringLiteral("Applying..."));
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<StatusDialog>(), patienceMs);
+        QCOMPARE(message(m_frame.get()), QStringLiteral("Applied successfully"));
+        QVERIFY(!Form::visible<AddDialog>());
+        QVERIFY(m_service.command("orb status").contains("\"connected\":true"));
+    }
+
+    void switchRemoteAccess() {
+        auto *status = Form::visible<StatusDialog>();
+        auto *toggle = Form::part<ToggleSwitch>(status, "remoteAccessSwitch");
+        QTRY_VERIFY_WITH_TIMEOUT(toggle->isEnabled(), patienceMs);
+        QVERIFY(!toggle->isChecked());
+        QCOMPARE(Form::text(status, "linkStateLabel"), QStringLiteral("Connected"));
+        toggle->setFocus();
+        QTest::keyClick(toggle, Qt::Key_Space);
+        QCOMPARE(message(status), QStringLiteral("Set Remote Access..."));
+        QVERIFY(!toggle->isEnabled() && !Form::part(status, "disconnectButton")->isEnabled());
+        QTRY_COMPARE_WITH_TIMEOUT(message(status), QStringLiteral("Set remote access successfully!"),
+                                  patienceMs);
+        QVERIFY(toggle->isChecked() && toggle->isEnabled());
+        QVERIFY(m_service.command("orb status").contains("\"enable\":true"));
+    }
+
+    void disconnectAfterAsking() {
+        auto *status = Form::visible<StatusDialog>();
+        for (const char *answer : {"cancelButton", "acceptButton"}) {
+            Form::click(status, "disconnectButton");
+            QTRY_VERIFY(Form::visible<ConfirmDialog>());
+            QCOMPARE(
+                Form::text(Form::visible<ConfirmDialog>(), "messageLabel"),
+                QStringLiteral("Are you sure you want to disconnect from this service?\n\nDisconnecting will "
+                               "stop the synchronization of all devices managed by this Device Manager. You "
+                               "will need to set up the connection again to restore synchronization."));
+            Form::click(Form::visible<ConfirmDialog>(), answer);
+            QTRY_VERIFY(!Form::visible<ConfirmDialog>());
+        }
+        QTRY_VERIFY_WITH_TIMEOUT(Form::visible<AddDialog>(), patienceMs);
+        QCOMPARE(message(m_frame.get()), QStringLiteral("Disconnected successfully!"));
+        QVERIFY(m_service.command("orb status").contains("added=0"));
+    }
+
     /// Each begins with its name.
     static void rows(const QList<QStringList> &all) {
         QTest::addColumn<QStringList>("texts");
@@ -476,5 +492,5 @@ private:
     ServiceManagement *m_management = nullptr;
 };
 
-QTEST_MAIN(TestServiceManagement)
+NVLDM_TEST(TestServiceManagement)
 #include "tst_servicemanagement.moc"

@@ -1,4 +1,4 @@
-#include "interfacelanguage.h"
+#include "app/help/interfacelanguage.h"
 
 #include <QFile>
 #include <QLocale>

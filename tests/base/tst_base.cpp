@@ -1,6 +1,7 @@
-#include "ipv4.h"
-#include "macaddress.h"
-#include "spreadsheetcell.h"
+#include "base/ipv4.h"
+#include "base/macaddress.h"
+#include "base/spreadsheetcell.h"
+#include "support/testmain.h"
 
 #include <QTest>
 
@@ -56,5 +57,5 @@ private slots:
     }
 };
 
-QTEST_APPLESS_MAIN(TestBase)
+NVLDM_APPLESS_TEST(TestBase)
 #include "tst_base.moc"

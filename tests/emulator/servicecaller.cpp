@@ -1,6 +1,6 @@
 #include "servicecaller.h"
 
-#include "nvlcrypto.h"
+#include "platform/crypto/nvlcrypto.h"
 
 #include <httplib.h>
 

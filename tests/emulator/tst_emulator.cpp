@@ -1,6 +1,7 @@
 #include "emulatorprocess.h"
-#include "nvlcrypto.h"
+#include "platform/crypto/nvlcrypto.h"
 #include "servicecaller.h"
+#include "support/testmain.h"
 
 #include <QDir>
 #include <QFile>
@@ -298,5 +299,5 @@ void EmulatorTest::commands() {
     QCOMPARE(caller.call("/v1/config/get").code, 105);
 }
 
-QTEST_GUILESS_MAIN(EmulatorTest)
+NVLDM_GUILESS_TEST(EmulatorTest)
 #include "tst_emulator.moc"

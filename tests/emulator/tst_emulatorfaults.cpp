@@ -1,5 +1,6 @@
 #include "emulatorprocess.h"
 #include "servicecaller.h"
+#include "support/testmain.h"
 
 #include <QElapsedTimer>
 #include <QTest>
@@ -212,5 +213,5 @@ void EmulatorFaultsTest::badSpec() {
     QCOMPARE(ServiceCaller(m_emulator.port()).post("/v1/accm/list", aPage).code, 0);
 }
 
-QTEST_GUILESS_MAIN(EmulatorFaultsTest)
+NVLDM_GUILESS_TEST(EmulatorFaultsTest)
 #include "tst_emulatorfaults.moc"

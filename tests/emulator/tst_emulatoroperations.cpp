@@ -1,4 +1,5 @@
 #include "fleettest.h"
+#include "support/testmain.h"
 
 #include <QTest>
 
@@ -289,5 +290,5 @@ private:
     }
 };
 
-QTEST_GUILESS_MAIN(EmulatorOperationsTest)
+NVLDM_GUILESS_TEST(EmulatorOperationsTest)
 #include "tst_emulatoroperations.moc"

@@ -1,5 +1,6 @@
 #include "emulatorprocess.h"
 #include "servicecaller.h"
+#include "support/testmain.h"
 
 #include <QElapsedTimer>
 #include <QTest>
@@ -435,5 +436,5 @@ void EmulatorServiceTest::overdueBatch() {
     QCOMPARE(boss.list("/v1/dev/list").size(), std::size_t{20});
 }
 
-QTEST_GUILESS_MAIN(EmulatorServiceTest)
+NVLDM_GUILESS_TEST(EmulatorServiceTest)
 #include "tst_emulatorservice.moc"

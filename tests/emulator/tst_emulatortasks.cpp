@@ -1,4 +1,5 @@
 #include "fleettest.h"
+#include "support/testmain.h"
 
 #include <QTest>
 
@@ -15,14 +16,14 @@ private slots:
         COMPARE_JSON(runUnder(task)[0], Json({{"id", m_devices[0].at("id")}, {"status", 0}, {"body", ""}}));
         COMPARE_JSON(newest().at("status"), "pTaskQueueState");
         QCOMPARE(code("/v1/task/rm", {{"tids", tids}}), 3);
-        std::size_t mostAway = 0, mostRunning = 0;
+        std::size_t maxUnreachable = 0, maxRunning = 0;
         for (Json last = newest(), now = last; now.at("active"); last = now, now = newest()) {
-            mostAway = std::max(mostAway, withStatus("connect_status", "Unreachable"));
-            mostRunning = std::max(mostRunning, withStatus("action_status", "deviceRestart"));
+            maxUnreachable = std::max(maxUnreachable, withStatus("connect_status", "Unreachable"));
+            maxRunning = std::max(maxRunning, withStatus("action_status", "deviceRestart"));
             QVERIFY(now.at("progress") >= last.at("progress"));
         }
-        QVERIFY(mostAway > 0 && mostAway <= 20);
-        QCOMPARE(mostRunning, std::size_t{20});
+        QVERIFY(maxUnreachable > 0 && maxUnreachable <= 20);
+        QCOMPARE(maxRunning, std::size_t{20});
         COMPARE_JSON(newest().at("state"), "pTaskDone");
         QCOMPARE(count(newest().at("devices"), "progress", 100), std::size_t{30});
         QCOMPARE(withStatus("connect_status", "Connected") + withStatus("action_status", "Standby"), 80UL);
@@ -138,5 +139,5 @@ private:
     Json alarms() { return m_caller.call("/v1/alarm/list", {{"start", 0}, {"count", 1000}}).data; }
 };
 
-QTEST_GUILESS_MAIN(EmulatorTasksTest)
+NVLDM_GUILESS_TEST(EmulatorTasksTest)
 #include "tst_emulatortasks.moc"

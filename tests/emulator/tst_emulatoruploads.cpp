@@ -1,4 +1,5 @@
 #include "fleettest.h"
+#include "support/testmain.h"
 
 #include <QCryptographicHash>
 #include <QFile>
@@ -380,5 +381,5 @@ private:
     }
 };
 
-QTEST_GUILESS_MAIN(EmulatorUploadsTest)
+NVLDM_GUILESS_TEST(EmulatorUploadsTest)
 #include "tst_emulatoruploads.moc"

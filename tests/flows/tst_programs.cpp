@@ -1,5 +1,5 @@
-#include "emulatorprocess.h"
-#include "isolatedroot.h"
+#include "support/emulatorprocess.h"
+#include "support/isolatedroot.h"
 
 #include <QDate>
 #include <QDir>

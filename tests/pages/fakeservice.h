@@ -1,8 +1,8 @@
 #pragma once
 
-#include "ciphers.h"
-#include "localstore.h"
-#include "scriptedpeer.h"
+#include "platform/crypto/ciphers.h"
+#include "store/localstore.h"
+#include "support/scriptedpeer.h"
 
 #include <mutex>
 

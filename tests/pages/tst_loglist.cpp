@@ -1,8 +1,9 @@
-#include "isolatedroot.h"
-#include "logbins.h"
-#include "logcapture.h"
-#include "logexport.h"
-#include "loglist.h"
+#include "pages/log/logexport.h"
+#include "pages/log/loghistogram.h"
+#include "pages/log/loglist.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QDateTime>
 #include <QTest>
@@ -120,7 +121,7 @@ private slots:
         const LogListPtr list = sample();
         const std::vector<char> matches = filter.matches(*list);
         QTEST(shown(*list, list->order(LogColumn::Time, Qt::DescendingOrder, matches)), "matching");
-        const LogFrame span{local(2026, 5, 10), local(2026, 5, 10, 8)};
+        const TimeRange span{local(2026, 5, 10), local(2026, 5, 10, 8)};
         const QString within = shown(*list, list->order(LogColumn::Time, Qt::DescendingOrder, matches, span));
         QFETCH(QString, matching);
         QCOMPARE(within, matching.contains("gamma") ? QStringLiteral("gamma") : QString());
@@ -129,25 +130,25 @@ private slots:
     void binsCoverTheFrame_data() {
         QTest::addColumn<qint64>("from");
         QTest::addColumn<qint64>("to");
-        QTest::addColumn<LogBins::Unit>("unit");
+        QTest::addColumn<LogHistogram::Unit>("unit");
         QTest::addColumn<int>("bins");
         QTest::addColumn<int>("counted");
         const qint64 may = local(2026, 5, 10);
-        QTest::newRow("a day by hours") << may << may + day - 1 << LogBins::Unit::Hour << 24 << 2;
+        QTest::newRow("a day by hours") << may << may + day - 1 << LogHistogram::Unit::Hour << 24 << 2;
         QTest::newRow("from within an hour")
-            << may + hour / 2 << may + hour + 1 << LogBins::Unit::Hour << 2 << 0;
-        QTest::newRow("an instant") << may + 8 * hour << may + 8 * hour << LogBins::Unit::Hour << 1 << 1;
+            << may + hour / 2 << may + hour + 1 << LogHistogram::Unit::Hour << 2 << 0;
+        QTest::newRow("an instant") << may + 8 * hour << may + 8 * hour << LogHistogram::Unit::Hour << 1 << 1;
         QTest::newRow("two weeks by days")
-            << local(2026, 5, 1) << local(2026, 5, 15) - 1 << LogBins::Unit::Day << 14 << 3;
+            << local(2026, 5, 1) << local(2026, 5, 15) - 1 << LogHistogram::Unit::Day << 14 << 3;
         // Cut to where there are entries.
-        QTest::newRow("all time") << qint64(0) << local(2100, 1, 1) << LogBins::Unit::Day << 9 << 3;
-        QTest::newRow("ends before it starts") << may << may - 1 << LogBins::Unit::Hour << 0 << 0;
+        QTest::newRow("all time") << qint64(0) << local(2100, 1, 1) << LogHistogram::Unit::Day << 9 << 3;
+        QTest::newRow("ends before it starts") << may << may - 1 << LogHistogram::Unit::Hour << 0 << 0;
     }
     void binsCoverTheFrame() {
         QFETCH(qint64, from);
         QFETCH(qint64, to);
         const LogListPtr list = sample();
-        LogBins bins({from, to}, *list);
+        LogHistogram bins({from, to}, *list);
         bins.count(*list, list->order(LogColumn::Time, Qt::AscendingOrder));
         QTEST(bins.unit(), "unit");
         QTEST(bins.size(), "bins");
@@ -163,9 +164,9 @@ private slots:
     void wideFramesShareBins() {
         const LogListPtr list = LogList::parse({row(local(1990, 1, 1), "Device", "Alarm", "", ""),
                                                 row(local(2020, 1, 1, 5), "Device", "Event", "", "")});
-        LogBins bins({0, local(2100, 1, 1)}, *list);
+        LogHistogram bins({0, local(2100, 1, 1)}, *list);
         bins.count(*list, list->order(LogColumn::Time, Qt::AscendingOrder));
-        QCOMPARE(bins.unit(), LogBins::Unit::Days);
+        QCOMPARE(bins.unit(), LogHistogram::Unit::Days);
         QVERIFY(bins.size() > 180 && bins.size() <= 366);
         QCOMPARE(bins.counts(0)[0], 1);
         QCOMPARE(bins.counts(bins.size() - 1)[1], 1);
@@ -200,5 +201,5 @@ private slots:
     }
 };
 
-QTEST_GUILESS_MAIN(TestLogList)
+NVLDM_GUILESS_TEST(TestLogList)
 #include "tst_loglist.moc"

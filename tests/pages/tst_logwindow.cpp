@@ -1,11 +1,12 @@
+#include "api/session/nettask.h"
 #include "fakeservice.h"
-#include "isolatedroot.h"
-#include "lastfolder.h"
-#include "logcapture.h"
-#include "logchart.h"
-#include "logtable.h"
-#include "logwindow.h"
-#include "nettask.h"
+#include "pages/log/logchart.h"
+#include "pages/log/logtable.h"
+#include "pages/log/logwindow.h"
+#include "store/lastfolder.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QComboBox>
 #include <QDateEdit>
@@ -364,5 +365,5 @@ private:
     std::unique_ptr<LogWindow> m_window;
 };
 
-QTEST_MAIN(TestLogWindow)
+NVLDM_TEST(TestLogWindow)
 #include "tst_logwindow.moc"

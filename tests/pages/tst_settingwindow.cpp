@@ -1,13 +1,14 @@
+#include "api/session/nettask.h"
 #include "fakeservice.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "nettask.h"
-#include "notifier.h"
-#include "settingschangeddialog.h"
-#include "settingwindow.h"
-#include "storewriter.h"
-#include "toast.h"
-#include "waitingspinner.h"
+#include "pages/settings/settingschangeddialog.h"
+#include "pages/settings/settingwindow.h"
+#include "platform/toast/toast.h"
+#include "store/storewriter.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
+#include "tasks/notify/notifier.h"
+#include "widgets/controls/waitingspinner.h"
 
 #include <QApplication>
 #include <QCheckBox>
@@ -334,5 +335,5 @@ private:
     std::unique_ptr<SettingWindow> m_window;
 };
 
-QTEST_MAIN(TestSettingWindow)
+NVLDM_TEST(TestSettingWindow)
 #include "tst_settingwindow.moc"

@@ -1,10 +1,10 @@
-#include "apppaths.h"
-#include "crashcatcher.h"
-#include "crashreport.h"
-#include "isolatedroot.h"
-#include "messagelog.h"
-#include "processsetup.h"
-#include "secondlife.h"
+#include "platform/files/apppaths.h"
+#include "platform/log/crashcatcher.h"
+#include "platform/log/crashreport.h"
+#include "platform/log/messagelog.h"
+#include "platform/system/processsetup.h"
+#include "support/isolatedroot.h"
+#include "support/secondlife.h"
 
 #include <QCoreApplication>
 #include <QDateTime>
@@ -141,7 +141,7 @@ private slots:
                      qUtf8Printable(lines[i]));
     }
 
-    void usualEndLeavesNothing() {
+    void normalEndLeavesNothing() {
         const SecondLife::Outcome outcome = SecondLife::run({"end"});
         QVERIFY(outcome.exited);
         QCOMPARE(outcome.status, 0);

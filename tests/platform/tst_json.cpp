@@ -1,5 +1,6 @@
-#include "elementtexts.h"
-#include "json.h"
+#include "platform/elementtexts.h"
+#include "platform/json.h"
+#include "support/testmain.h"
 
 #include <QElapsedTimer>
 #include <QTest>
@@ -112,5 +113,5 @@ void TestJson::elementsOfAnArray() {
     QCOMPARE(found, elements);
 }
 
-QTEST_APPLESS_MAIN(TestJson)
+NVLDM_APPLESS_TEST(TestJson)
 #include "tst_json.moc"

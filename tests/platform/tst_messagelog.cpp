@@ -1,8 +1,8 @@
-#include "apppaths.h"
-#include "isolatedroot.h"
-#include "messagelog.h"
-#include "repeatedlines.h"
-#include "secondlife.h"
+#include "platform/files/apppaths.h"
+#include "platform/log/messagelog.h"
+#include "platform/log/repeatedlines.h"
+#include "support/isolatedroot.h"
+#include "support/secondlife.h"
 
 #include <QCoreApplication>
 #include <QDateTime>

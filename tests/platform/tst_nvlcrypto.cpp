@@ -1,5 +1,6 @@
-#include "isolatedroot.h"
-#include "nvlcrypto.h"
+#include "platform/crypto/nvlcrypto.h"
+#include "support/isolatedroot.h"
+#include "support/testmain.h"
 
 #include <QDateTime>
 #include <QDir>
@@ -248,5 +249,5 @@ void TestNvlcrypto::nullPointers() {
     nvlcryptoFree(nullptr);
 }
 
-QTEST_GUILESS_MAIN(TestNvlcrypto)
+NVLDM_GUILESS_TEST(TestNvlcrypto)
 #include "tst_nvlcrypto.moc"

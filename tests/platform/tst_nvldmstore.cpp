@@ -1,8 +1,8 @@
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "nvldmstore.h"
-#include "secondlife.h"
-#include "storetrouble.h"
+#include "platform/files/nvldmstore.h"
+#include "platform/files/storetrouble.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/secondlife.h"
 
 #include <QCoreApplication>
 #include <QDir>

@@ -1,6 +1,7 @@
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "servicecontrol.h"
+#include "platform/system/servicecontrol.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QFile>
 #include <QTest>
@@ -66,5 +67,5 @@ void TestServiceControl::stateFileStandsForTheService() {
     QCOMPARE(ServiceControl::queryLocalService(), LocalServiceState::NotInstalled);
 }
 
-QTEST_GUILESS_MAIN(TestServiceControl)
+NVLDM_GUILESS_TEST(TestServiceControl)
 #include "tst_servicecontrol.moc"

@@ -1,8 +1,8 @@
-#include "apppaths.h"
-#include "isolatedroot.h"
-#include "processsetup.h"
-#include "secondlife.h"
-#include "singleinstance.h"
+#include "platform/files/apppaths.h"
+#include "platform/system/processsetup.h"
+#include "platform/system/singleinstance.h"
+#include "support/isolatedroot.h"
+#include "support/secondlife.h"
 
 #include <QCoreApplication>
 #include <QDir>

@@ -1,6 +1,6 @@
-#include "logcapture.h"
-#include "notificationservice.h"
-#include "toast.h"
+#include "platform/toast/toast.h"
+#include "support/logcapture.h"
+#include "support/notificationservice.h"
 
 #include <QScopeGuard>
 #include <QTest>
@@ -43,7 +43,7 @@ private slots:
     void serviceComesLater();
     void serviceDies();
     void refusedToastFails();
-    void mostWaitingIsBounded();
+    void pendingIsBounded();
     void noSessionBus_data();
     void noSessionBus();
 
@@ -215,7 +215,7 @@ void TestToast::refusedToastFails() {
     QCOMPARE(m_incompatible, 0);
 }
 
-void TestToast::mostWaitingIsBounded() {
+void TestToast::pendingIsBounded() {
     QVERIFY(start());
     for (int i = 0; i < 65; ++i)
         show("a");

@@ -1,13 +1,14 @@
-#include "ciphers.h"
-#include "clientstore.h"
-#include "configstore.h"
-#include "isolatedroot.h"
-#include "lastfolder.h"
-#include "localstore.h"
-#include "logcapture.h"
-#include "nvldmstore.h"
-#include "serverkeys.h"
-#include "storewriter.h"
+#include "platform/crypto/ciphers.h"
+#include "platform/files/nvldmstore.h"
+#include "store/clientstore.h"
+#include "store/configstore.h"
+#include "store/lastfolder.h"
+#include "store/localstore.h"
+#include "store/serverkeys.h"
+#include "store/storewriter.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
 
 #include <QDir>
 #include <QTest>
@@ -370,5 +371,5 @@ void TestStores::noPlainPasswordInAnyFile() {
     QVERIFY(!bytes.contains("raw-token-of-a-session"));
 }
 
-QTEST_GUILESS_MAIN(TestStores)
+NVLDM_GUILESS_TEST(TestStores)
 #include "tst_stores.moc"

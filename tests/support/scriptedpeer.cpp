@@ -1,6 +1,6 @@
 #include "scriptedpeer.h"
 
-#include "nvlcrypto.h"
+#include "platform/crypto/nvlcrypto.h"
 
 #include <QByteArray>
 #include <QCryptographicHash>

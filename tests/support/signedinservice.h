@@ -1,10 +1,10 @@
 #pragma once
 
+#include "api/session/nettask.h"
+#include "api/session/servicesession.h"
 #include "emulatorprocess.h"
 #include "isolatedroot.h"
-#include "localstore.h"
-#include "nettask.h"
-#include "servicesession.h"
+#include "store/localstore.h"
 
 #include <QTest>
 

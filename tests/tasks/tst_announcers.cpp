@@ -1,5 +1,6 @@
-#include "alarmannouncer.h"
-#include "taskannouncer.h"
+#include "support/testmain.h"
+#include "tasks/notify/alarmannouncer.h"
+#include "tasks/notify/taskannouncer.h"
 
 #include <QTest>
 
@@ -100,5 +101,5 @@ private slots:
     }
 };
 
-QTEST_MAIN(TestAnnouncers)
+NVLDM_TEST(TestAnnouncers)
 #include "tst_announcers.moc"

@@ -1,15 +1,16 @@
-#include "alarmpanel.h"
-#include "confirmdialog.h"
-#include "exetaskmgr.h"
-#include "fakelists.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "notifier.h"
-#include "taskinfopool.h"
-#include "taskpanel.h"
-#include "taskrepeats.h"
-#include "toast.h"
-#include "uploadtaskmgr.h"
+#include "platform/toast/toast.h"
+#include "support/fakelists.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
+#include "tasks/notify/notifier.h"
+#include "tasks/panels/alarmpanel.h"
+#include "tasks/panels/taskpanel.h"
+#include "tasks/queue/exetaskmgr.h"
+#include "tasks/queue/uploadtaskmgr.h"
+#include "tasks/service/retryregistry.h"
+#include "tasks/service/taskinfopool.h"
+#include "widgets/dialogs/confirmdialog.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
@@ -126,8 +127,8 @@ private slots:
                    task("theirs", "pTaskFailed", {device(3, "pTaskFailed")}),
                    task("whole", "pTaskFailed", {device(4, "pTaskDone"), device(5, "pTaskInitState")})});
         QStringList repeated;
-        TaskRepeats::instance().remember("whole", {[&](const QStringList &ids) { repeated = ids; }});
-        TaskRepeats::instance().remember("mine", {[&](const QStringList &ids) { repeated = ids; }});
+        RetryRegistry::instance().remember("whole", {[&](const QStringList &ids) { repeated = ids; }});
+        RetryRegistry::instance().remember("mine", {[&](const QStringList &ids) { repeated = ids; }});
         auto *retry = m_tasks->findChild<QToolButton *>("retryTaskButton");
         select(1);
         QVERIFY(!retry->isEnabled());
@@ -388,5 +389,5 @@ private:
     NotedToasts *m_toasts = nullptr;
 };
 
-QTEST_MAIN(TestPanels)
+NVLDM_TEST(TestPanels)
 #include "tst_panels.moc"

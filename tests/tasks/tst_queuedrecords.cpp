@@ -1,4 +1,5 @@
-#include "queuedrecords.h"
+#include "support/testmain.h"
+#include "tasks/queue/queuedrecords.h"
 
 #include <QTest>
 
@@ -51,7 +52,7 @@ private slots:
                     if (n % 100 == 0)
                         records.wipeSecret(ctid);
                     if (n % 1000 == 0)
-                        records.leaveBehind(quint64(i));
+                        records.abandonOtherSessions(quint64(i));
                 }
                 --inserting;
             });
@@ -61,7 +62,7 @@ private slots:
         walker.join();
         QCOMPARE(taken.size(), std::size_t(inserters * each));
         QCOMPARE(std::set<std::string>(taken.begin(), taken.end()).size(), taken.size());
-        QVERIFY(!records.isUnwalked());
+        QVERIFY(!records.hasPending());
     }
 
     void secretsOfOtherSessionsAreWiped() {
@@ -71,7 +72,7 @@ private slots:
         const std::string present = records.append({{"pass", "c"}}, "type", "id_", session(2));
         QVERIFY(records.setState(atWork, "uploading", QueuedRecords::Secret::Keep));
         QVERIFY(!records.setState(atWork, "uploading", QueuedRecords::Secret::Keep));
-        const std::vector<JSON> waiting = records.leaveBehind(2);
+        const std::vector<JSON> waiting = records.abandonOtherSessions(2);
         QCOMPARE(waiting.size(), 1u);
         QCOMPARE(waiting[0].at("ctid").get<std::string>(), left);
         QVERIFY(!records.find(left).contains("pass"));
@@ -82,5 +83,5 @@ private slots:
     }
 };
 
-QTEST_APPLESS_MAIN(TestQueuedRecords)
+NVLDM_APPLESS_TEST(TestQueuedRecords)
 #include "tst_queuedrecords.moc"

@@ -1,8 +1,9 @@
-#include "fakelists.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "servicesession.h"
-#include "taskinfopool.h"
+#include "api/session/servicesession.h"
+#include "support/fakelists.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
+#include "tasks/service/taskinfopool.h"
 
 #include <QSignalSpy>
 #include <QTest>
@@ -221,5 +222,5 @@ private:
     std::unique_ptr<FakeLists> m_service;
 };
 
-QTEST_MAIN(TestTaskInfoPool)
+NVLDM_TEST(TestTaskInfoPool)
 #include "tst_taskinfopool.moc"

@@ -1,8 +1,9 @@
-#include "rowdiff.h"
-#include "taskfilter.h"
-#include "taskmodel.h"
-#include "taskrecord.h"
-#include "tasktexts.h"
+#include "support/testmain.h"
+#include "tasks/panels/taskmodel.h"
+#include "tasks/panels/tasktexts.h"
+#include "tasks/service/taskfilter.h"
+#include "tasks/service/taskrecord.h"
+#include "widgets/lists/rowdiff.h"
 
 #include <QAbstractItemModelTester>
 #include <QPersistentModelIndex>
@@ -187,5 +188,5 @@ private:
     TaskList m_shown;
 };
 
-QTEST_MAIN(TestTaskLists)
+NVLDM_TEST(TestTaskLists)
 #include "tst_tasklists.moc"

@@ -1,11 +1,12 @@
-#include "exetaskmgr.h"
-#include "fakelists.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "selfsignedcert.h"
-#include "taskinfopool.h"
-#include "transfer.h"
-#include "uploadtaskmgr.h"
+#include "api/transport/transfer.h"
+#include "support/fakelists.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
+#include "tasks/queue/exetaskmgr.h"
+#include "tasks/queue/selfsignedcert.h"
+#include "tasks/queue/uploadtaskmgr.h"
+#include "tasks/service/taskinfopool.h"
 
 #include <QCoreApplication>
 #include <QElapsedTimer>
@@ -382,12 +383,12 @@ void TestTaskMgrs::taskAbortedInTheListIsNotSentOn() {
 void TestTaskMgrs::fileThatIsGoneIsToldByItsName() {
     QString reason;
     const auto connection = connect(&uploads(), &TaskQueue::handOverFailed, this,
-                                    [&](const FailedHandOver &failure) { reason = failure.reason; });
+                                    [&](const FailedSubmission &failure) { reason = failure.reason; });
     QVERIFY(uploads().insertNewFWUploadTask("auto", "/nowhere/f.bin", "f.bin", ids, "FW7", ""));
     uploads().handlingTask();
     QTRY_VERIFY(reason.contains("f.bin"));
     disconnect(connection);
 }
 
-QTEST_GUILESS_MAIN(TestTaskMgrs)
+NVLDM_GUILESS_TEST(TestTaskMgrs)
 #include "tst_taskmgrs.moc"

@@ -1,13 +1,14 @@
-#include "failedoperations.h"
-#include "fakelists.h"
-#include "isolatedroot.h"
-#include "logcapture.h"
-#include "servicesession.h"
-#include "sessionevents.h"
-#include "taskinfopool.h"
-#include "taskqueue.h"
-#include "taskrepeats.h"
-#include "tasktargets.h"
+#include "api/session/servicesession.h"
+#include "api/session/sessionevents.h"
+#include "support/fakelists.h"
+#include "support/isolatedroot.h"
+#include "support/logcapture.h"
+#include "support/testmain.h"
+#include "tasks/queue/failedoperations.h"
+#include "tasks/queue/taskqueue.h"
+#include "tasks/service/retryregistry.h"
+#include "tasks/service/taskinfopool.h"
+#include "tasks/service/tasktargets.h"
 
 #include <QCoreApplication>
 #include <QSemaphore>
@@ -21,17 +22,17 @@ using nlohmann::json;
 namespace {
 
 /// What the test's records do when their turn comes.
-std::function<unsigned(TaskStep &)> work;
+std::function<unsigned(TaskContext &)> work;
 
-constexpr TaskFamily::Lines lines = {"failed (%d)", "worked", "threw: ", "no update: "};
+constexpr TaskKind::Lines lines = {"failed (%d)", "worked", "threw: ", "no update: "};
 constexpr auto plainIds = [](const JSON &record) { return TaskTargets::ids(record.at("devices")); };
 constexpr auto withPass = [](const JSON &record) {
     return TaskTargets::withMembers(record.at("devices"), record, {"pass"});
 };
-constexpr auto announce = [](const TaskStep &) {};
-constexpr auto doWork = [](TaskStep &step) { return work(step); };
+constexpr auto announce = [](const TaskContext &) {};
+constexpr auto doWork = [](TaskContext &step) { return work(step); };
 
-constexpr TaskFamily families[] = {
+constexpr TaskKind families[] = {
     {"plain", "deviceRestart", "plain_", "devices", false, false, nullptr, lines, plainIds, announce, doWork},
     {"secret", "deviceChangePass", "secret_", "devices", false, true, nullptr, lines, withPass, announce,
      doWork},
@@ -51,7 +52,7 @@ public:
 
 } // namespace
 
-Q_DECLARE_METATYPE(FailedHandOver)
+Q_DECLARE_METATYPE(FailedSubmission)
 Q_DECLARE_METATYPE(ScriptedPeer::Reply)
 
 /// The queue of both task managers, with families of the test's own.
@@ -63,13 +64,13 @@ private slots:
         m_log = std::make_unique<LogCapture>();
         m_service = std::make_unique<FakeLists>();
         m_queue = std::make_unique<Queue>();
-        work = [](TaskStep &) { return unsigned(ApiOk); };
+        work = [](TaskContext &) { return unsigned(ApiOk); };
     }
     void cleanup() {
         m_queue.reset();
         m_service.reset();
         CTaskInfoPool::instance().clear();
-        TaskRepeats::instance().clear();
+        RetryRegistry::instance().clear();
         QCoreApplication::processEvents();
         m_log.reset();
     }
@@ -77,7 +78,7 @@ private slots:
     void recordsRunInOrderAndLateOnesInTheSameWalk() {
         QStringList done;
         QSemaphore begun, goOn;
-        work = [&](TaskStep &step) {
+        work = [&](TaskContext &step) {
             begun.release();
             goOn.acquire();
             done += QString::fromStdString(step.text("ctid"));
@@ -103,7 +104,7 @@ private slots:
         std::atomic<quint32> error = 99;
         std::atomic<quintptr> context = 0;
         m_queue->setCompletionCallback(7, [&](quintptr c, quint32 e) { context = c, error = e; });
-        work = [](TaskStep &step) {
+        work = [](TaskContext &step) {
             return step.text("ctid").starts_with("plain_") &&
                            CTaskInfoPool::instance().taskList()->find(QString::fromStdString(step.tid))
                        ? unsigned(ApiServerError)
@@ -137,12 +138,12 @@ private slots:
         m_service->setTaskMade(json::parse(made));
         QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
         bool worked = false;
-        work = [&](TaskStep &) { return worked = true, unsigned(ApiOk); };
+        work = [&](TaskContext &) { return worked = true, unsigned(ApiOk); };
         const QString ctid = m_queue->add("secret");
         m_queue->handlingTask();
         m_queue->handlingTask();
         QTRY_COMPARE(failed.count(), 1);
-        const auto failure = failed[0][0].value<FailedHandOver>();
+        const auto failure = failed[0][0].value<FailedSubmission>();
         QCOMPARE(failure.ctid, ctid);
         QCOMPARE(failure.serviceType, QString("deviceChangePass"));
         QCOMPARE(failure.devices, 2);
@@ -167,7 +168,7 @@ private slots:
         QSignalSpy leftOut(m_queue.get(), &TaskQueue::devicesLeftOut);
         QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
         JSON files;
-        work = [&](TaskStep &step) { return files = step.record["pkey"], unsigned(ApiOk); };
+        work = [&](TaskContext &step) { return files = step.record["pkey"], unsigned(ApiOk); };
         QString ctid;
         m_queue->insert("plain",
                         {{"devices", {"DV1", "DV2", "DV3"}},
@@ -191,18 +192,18 @@ private slots:
     void nothingIsToldOfAnEndedSession() {
         QSignalSpy made(m_queue.get(), &TaskQueue::serviceTaskMade);
         QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
-        work = [](TaskStep &) { return unsigned(ApiServerError); };
+        work = [](TaskContext &) { return unsigned(ApiServerError); };
         m_queue->add();
         m_queue->handlingTask();
         // The worker is done, and the session ends before anybody has heard of it.
         m_service->logIn();
         QCoreApplication::processEvents();
         QCOMPARE(made.count() + failed.count(), 0);
-        QVERIFY(!TaskRepeats::instance().find("T1"));
+        QVERIFY(!RetryRegistry::instance().find("T1"));
     }
 
     void repeatOutlivesAListThatSkipsItsTask() {
-        TaskRepeats &repeats = TaskRepeats::instance();
+        RetryRegistry &repeats = RetryRegistry::instance();
         const auto task = std::make_shared<TaskRecord>();
         task->tid = "T1";
         const TaskList with({task}), without;
@@ -225,7 +226,7 @@ private slots:
     }
     void failedHandOverIsTold() {
         QFETCH(bool, throws);
-        work = [throws](TaskStep &) -> unsigned {
+        work = [throws](TaskContext &) -> unsigned {
             if (throws)
                 throw std::runtime_error("no luck");
             return ApiTransportError;
@@ -239,7 +240,7 @@ private slots:
         QCOMPARE(m_queue->stateOf(plain), QString("apply_fail"));
         QCOMPARE(m_log->count(throws ? "threw: no luck" : "failed (12)"), 2);
         QCOMPARE(m_log->count("failed (12)"), throws ? 0 : 2);
-        work = [](TaskStep &) { return unsigned(ApiOk); };
+        work = [](TaskContext &) { return unsigned(ApiOk); };
         m_queue->startAgain(plain);
         m_queue->startAgain(secret);
         m_queue->handlingTask();
@@ -256,7 +257,7 @@ private slots:
     void logOffDropsWhatIsQueued() {
         QFETCH(bool, again);
         QSemaphore begun, goOn;
-        work = [&](TaskStep &step) {
+        work = [&](TaskContext &step) {
             begun.release();
             goOn.acquire();
             return step.session.call([](CApiClient &client) { return client.runCustomCgis({}, {}); });
@@ -301,7 +302,7 @@ private slots:
         json task = taskFor("T1", "pTaskInitState");
         m_service->setTaskMade(task);
         m_service->setTasks({task});
-        work = [](TaskStep &step) {
+        work = [](TaskContext &step) {
             return step.session.call([](CApiClient &client) {
                 return client.runCustomCgis(json::array({"/cgi-bin/x"}), json::array({"DV1"}));
             });
@@ -314,7 +315,7 @@ private slots:
         QCOMPARE(failures.first()->failure.tid, "T1");
         QCOMPARE(static_cast<bool>(failures.first()->startAgain), !mayHaveBegun);
         QVERIFY(failures.first()->failure.text().contains(mayHaveBegun ? "may have begun" : "did not begin"));
-        QVERIFY(TaskRepeats::instance().find("T1"));
+        QVERIFY(RetryRegistry::instance().find("T1"));
         // The list tells by itself that it has begun.
         task["status"] = "pTaskProcessing";
         m_service->setTasks({task});
@@ -323,7 +324,7 @@ private slots:
         QCoreApplication::processEvents();
         QCOMPARE(failures.count(), mayHaveBegun ? 0 : 1);
         failures.startFirstAgain();
-        QVERIFY2(mayHaveBegun || !TaskRepeats::instance().find("T1"), "offered in one place only");
+        QVERIFY2(mayHaveBegun || !RetryRegistry::instance().find("T1"), "offered in one place only");
     }
 
     void taskOfALostAnswerIsLookedUp_data() {
@@ -342,7 +343,7 @@ private slots:
         m_service->setTasks({task});
         m_service->reply("/v1/task/init", ScriptedPeer::Reply{});
         std::vector<std::string> tids;
-        work = [&](TaskStep &step) { return tids.push_back(step.tid), unsigned(ApiOk); };
+        work = [&](TaskContext &step) { return tids.push_back(step.tid), unsigned(ApiOk); };
         m_queue->add();
         m_queue->handlingTask();
         QCOMPARE(tids, std::vector<std::string>(works, "T7"));
@@ -378,7 +379,7 @@ private slots:
         QVERIFY(
             failures.first()->failure.text().contains("did not begin. The server has ended the session."));
         int worked = 0;
-        work = [&](TaskStep &) { return ++worked, unsigned(ApiOk); };
+        work = [&](TaskContext &) { return ++worked, unsigned(ApiOk); };
         failures.startFirstAgain();
         failures.dismissFirst();
         m_queue->handlingTask();
@@ -406,14 +407,14 @@ private slots:
         QVERIFY(m_queue->insert("plain", record));
         m_queue->add("secret");
         JSON files;
-        work = [&](TaskStep &step) { return files = step.record.value("cert", files), unsigned(ApiOk); };
+        work = [&](TaskContext &step) { return files = step.record.value("cert", files), unsigned(ApiOk); };
         m_queue->handlingTask();
         QTRY_COMPARE(made.count(), 2);
-        const TaskRepeats::Repeat *repeat = TaskRepeats::instance().find("T1");
-        QVERIFY(repeat && !repeat->needsDialog);
+        const RetryRegistry::Repeat *repeat = RetryRegistry::instance().find("T1");
+        QVERIFY(repeat && !repeat->needsInput);
         repeat->again({"DV2"});
-        const TaskRepeats::Repeat *asking = TaskRepeats::instance().find("T2");
-        QVERIFY(asking && asking->needsDialog);
+        const RetryRegistry::Repeat *asking = RetryRegistry::instance().find("T2");
+        QVERIFY(asking && asking->needsInput);
         asking->again({"DV1"});
         m_queue->handlingTask();
         const std::vector<json> sent = m_service->sentTo("/v1/task/init");
@@ -446,5 +447,5 @@ private:
     std::unique_ptr<Queue> m_queue;
 };
 
-QTEST_GUILESS_MAIN(TestTaskQueue)
+NVLDM_GUILESS_TEST(TestTaskQueue)
 #include "tst_taskqueue.moc"

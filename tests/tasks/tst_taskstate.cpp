@@ -1,4 +1,5 @@
-#include "taskstate.h"
+#include "support/testmain.h"
+#include "tasks/service/taskstate.h"
 
 #include <QTest>
 
@@ -64,5 +65,5 @@ private slots:
     }
 };
 
-QTEST_MAIN(TestTaskState)
+NVLDM_TEST(TestTaskState)
 #include "tst_taskstate.moc"

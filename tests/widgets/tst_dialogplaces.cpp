@@ -1,4 +1,5 @@
-#include "framelessdialog.h"
+#include "support/testmain.h"
+#include "widgets/dialogs/framelessdialog.h"
 
 #include <QAbstractItemView>
 #include <QComboBox>
@@ -76,5 +77,5 @@ private slots:
     }
 };
 
-QTEST_MAIN(TestDialogPlaces)
+NVLDM_TEST(TestDialogPlaces)
 #include "tst_dialogplaces.moc"

@@ -1,11 +1,12 @@
-#include "countedtabwidget.h"
-#include "framelessdialog.h"
-#include "icons.h"
-#include "passwordedit.h"
-#include "plaintext.h"
-#include "theme.h"
-#include "transientmessage.h"
-#include "warningline.h"
+#include "support/testmain.h"
+#include "widgets/controls/countedtabwidget.h"
+#include "widgets/controls/passwordedit.h"
+#include "widgets/dialogs/framelessdialog.h"
+#include "widgets/dialogs/transientmessage.h"
+#include "widgets/dialogs/warningline.h"
+#include "widgets/style/icons.h"
+#include "widgets/style/plaintext.h"
+#include "widgets/style/theme.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -174,5 +175,5 @@ private slots:
     }
 };
 
-QTEST_MAIN(TestWidgets)
+NVLDM_TEST(TestWidgets)
 #include "tst_widgets.moc"

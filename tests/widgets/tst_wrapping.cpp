@@ -1,5 +1,6 @@
-#include "flowlayout.h"
-#include "wrappingcheckbox.h"
+#include "support/testmain.h"
+#include "widgets/controls/flowlayout.h"
+#include "widgets/controls/wrappingcheckbox.h"
 
 #include <QHBoxLayout>
 #include <QTest>
@@ -58,6 +59,6 @@ private slots:
     }
 };
 
-QTEST_MAIN(TestWrapping)
+NVLDM_TEST(TestWrapping)
 
 #include "tst_wrapping.moc"

@@ -1,6 +1,6 @@
-#include "dbustoasts.h"
+#include "platform/toast/dbustoasts.h"
 
-#include "toasttext.h"
+#include "platform/toast/toasttext.h"
 
 #include <QDBusMessage>
 #include <QDBusPendingCallWatcher>
@@ -18,9 +18,9 @@ const QString bodyAction = QStringLiteral("default");
 constexpr uchar normalUrgency = 1;
 constexpr int timeOfTheService = -1;
 constexpr int answerMilliseconds = 5000;
-constexpr std::size_t mostWaiting = 64;
+constexpr std::size_t maxPending = 64;
 /// Some services never tell that a toast has gone.
-constexpr std::size_t mostOpen = 256;
+constexpr std::size_t maxOpen = 256;
 
 /// Left to itself, the bus library would start a bus of its own where there is none.
 QString sessionBusAddress() {
@@ -85,7 +85,7 @@ void DBusToasts::failOpenToasts() {
 }
 
 void DBusToasts::showToast(const Toast &toast, std::unique_ptr<ToastHandler> handler) {
-    if (!m_connection.isConnected() || m_waiting.size() >= mostWaiting) {
+    if (!m_connection.isConnected() || m_waiting.size() >= maxPending) {
         emit launchFailed();
         return;
     }
@@ -169,7 +169,7 @@ void DBusToasts::takeNumber(const QDBusPendingCall &call) {
         earlier->second.toast.subject.clear();
     const Entry replaced = std::exchange(m_open[reply.value()], std::move(shown));
     const Entry oldest =
-        m_open.size() > mostOpen ? std::move(m_open.extract(m_open.begin()).mapped()) : Entry();
+        m_open.size() > maxOpen ? std::move(m_open.extract(m_open.begin()).mapped()) : Entry();
     dismiss(replaced.handler);
     dismiss(oldest.handler);
 }

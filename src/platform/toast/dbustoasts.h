@@ -1,6 +1,6 @@
 #pragma once
 
-#include "toast.h"
+#include "platform/toast/toast.h"
 
 #include <QDBusConnection>
 #include <QVariantList>

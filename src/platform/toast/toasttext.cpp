@@ -1,4 +1,4 @@
-#include "toasttext.h"
+#include "platform/toast/toasttext.h"
 
 namespace {
 

@@ -1,5 +1,5 @@
-#include "toast.h"
-#include "toasttext.h"
+#include "platform/toast/toast.h"
+#include "platform/toast/toasttext.h"
 
 #include <QApplication>
 #include <QStyle>

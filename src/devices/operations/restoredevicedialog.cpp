@@ -1,0 +1,86 @@
+#include "devices/operations/restoredevicedialog.h"
+
+#include "devices/operations/targetsummary.h"
+
+#include <QCheckBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+
+namespace {
+
+struct Part {
+    const char *name;
+    const char *text;
+};
+
+constexpr Part parts[] = {
+    {"networkCheckBox", QT_TRANSLATE_NOOP("RestoreDeviceDialog", "Network")},
+    {"daylightCheckBox", QT_TRANSLATE_NOOP("RestoreDeviceDialog", "Daylight saving time")},
+    {"languageCheckBox", QT_TRANSLATE_NOOP("RestoreDeviceDialog", "Custom language")},
+    {"nadpCheckBox", QT_TRANSLATE_NOOP("RestoreDeviceDialog", "NADP")},
+    {"focusCheckBox", QT_TRANSLATE_NOOP("RestoreDeviceDialog", "Focus position")},
+    {"lensCheckBox", QT_TRANSLATE_NOOP("RestoreDeviceDialog", "Lens configuration")},
+};
+constexpr std::size_t networkPart = 0;
+
+} // namespace
+
+RestoreDeviceDialog::RestoreDeviceDialog(OperationTargets::List targets, QWidget *parent)
+    : OperationDialog(tr("Restore to Factory Default"), parent) {
+    setObjectName(QStringLiteral("RestoreDeviceDialog"));
+    auto *heading = label(tr("Restore all settings to factory default, including:"), "");
+    heading->setWordWrap(true);
+    addPart(heading);
+    for (std::size_t i = 0; i < m_parts.size(); ++i) {
+        m_parts[i] = new QCheckBox(tr(parts[i].text), body());
+        m_parts[i]->setObjectName(QLatin1String(parts[i].name));
+        addPart(m_parts[i]);
+    }
+    connect(m_parts[networkPart], &QCheckBox::toggled, this, &RestoreDeviceDialog::showRisk);
+    buildCountField();
+    finish(std::move(targets), OperationTargets::Need::Authorization, tr("Restore"), "restoreButton");
+    acceptButton()->setProperty("role", "danger");
+    m_parts[networkPart]->setFocus();
+}
+
+void RestoreDeviceDialog::buildCountField() {
+    m_count = new QLineEdit(body());
+    m_count->setObjectName(QStringLiteral("countEdit"));
+    m_count->setMaxLength(7);
+    m_countLabel = label({}, "caption");
+    m_countLabel->setBuddy(m_count);
+    m_countLabel->setWordWrap(true);
+    addPart(m_countLabel);
+    addPart(m_count);
+    connect(m_count, &QLineEdit::textChanged, this, &RestoreDeviceDialog::updateAccept);
+}
+
+QStringList RestoreDeviceDialog::deviceIds() const {
+    return targets().tickedIds();
+}
+
+void RestoreDeviceDialog::showRisk() {
+    setComplaint(
+        m_parts[networkPart]->isChecked()
+            ? tr("Devices whose network settings are restored may get another address and be cut off "
+                 "from the server.")
+            : QString());
+}
+
+bool RestoreDeviceDialog::isComplete() const {
+    const int count = targets().tickedCount();
+    const QString question =
+        tr("The settings of %n device(s) will be lost. Type %n to go on.", nullptr, count);
+    m_countLabel->setText(question);
+    m_count->setAccessibleName(question);
+    return m_count->text().trimmed() == QString::number(count);
+}
+
+void RestoreDeviceDialog::apply() {
+    std::array<int, 6> values{};
+    for (std::size_t i = 0; i < values.size(); ++i)
+        values[i] = m_parts[i]->isChecked() ? -1 : 1;
+    emit restoreDevice(values[0], values[1], values[2], values[3], values[4], values[5]);
+    accept();
+}

@@ -1,0 +1,155 @@
+#pragma once
+
+#include "devices/inventory/deviceinventory.h"
+#include "devices/inventory/inventoryreader.h"
+#include "devices/operations/deviceoperations.h"
+#include "devices/operations/operationtargets.h"
+#include "devices/operations/uploadkind.h"
+#include "widgets/dialogs/transientmessage.h"
+
+#include <QPointer>
+#include <QWidget>
+
+#include <memory>
+
+class DeviceActions;
+class DeviceFooter;
+class DeviceMonitor;
+class DeviceSiteActions;
+class DeviceTabs;
+class DeviceToolBar;
+class InventoryUpdater;
+class NoticeBar;
+class QSplitter;
+class QTimer;
+class ReconnectingDialog;
+class RefreshDeviceDialog;
+class SiteCommit;
+class SiteTree;
+
+/// The device console: the site tree, the tool bar, the three device tables and what keeps them current.
+class DeviceWindow : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit DeviceWindow(QWidget *parent = nullptr);
+    ~DeviceWindow() override;
+
+    /// Reads the inventory of the present session and begins to follow it.
+    void startWork();
+    /// Ends that and forgets everything that was shown.
+    void stopWork();
+
+    /// The devices of the last reading.
+    const DeviceSnapshotPtr &devices() const { return m_inventory.snapshot(); }
+    /// What operations have to know of those of the devices that are still managed.
+    OperationTargets::List targetsWith(const QStringList &ids) const;
+
+    /// True while there are changes of sites that were not sent.
+    bool hasPendingEdits() const;
+    void discardEdits();
+
+    /// The devices that operations work on, in the order of their rows as they are sorted now.
+    std::vector<DeviceRecordPtr> selectedDevices() const;
+
+public slots:
+    /// Sends the changes of sites.
+    void commitSites();
+    /// Reads sites and devices again.
+    void reload();
+    /// Puts a part between the tables and the footer.
+    void addStrip(QWidget *strip);
+    /// Selects the device with the id, or else the one with the address, and brings it into view.
+    void selectDevice(const QString &id, const QString &ip);
+    /// Shows a transient message.
+    void showDefAnimateMsgDlg(const QString &message,
+                              TransientMessage::Kind kind = TransientMessage::Kind::Plain);
+    void showSuccess(const QString &message);
+    void showError(const QString &message);
+    /// What shows until the outcome takes its place.
+    void showProgress(const QString &message);
+    /// Removes the devices that were selected when the user was asked: from the service, or from the site
+    /// that was selected then.
+    void removeDevices(bool fromOverview);
+
+signals:
+    /// No task is at work any more.
+    void allTasksDone();
+    void onShowAnimatedMsgDlg(const QString &message,
+                              TransientMessage::Kind kind = TransientMessage::Kind::Plain);
+    /// The user gives the lost server up.
+    void disconnectRequested();
+    /// A server of the saved list was chosen in place of the present one.
+    void remoteServerChosen(const QString &serverId);
+    /// An operation was chosen for the selected devices that is none of the console's own.
+    void uploadWanted(UploadKind kind, const OperationTargets::List &targets);
+
+private:
+    void buildLayout();
+    void connectParts();
+    void connectOperations();
+    void addShortcuts();
+
+    void onTaskListUpdated();
+    void openAddDialog();
+    void on_authorizeButton_clicked();
+    void onAuthDevices(const QStringList &ids, const QString &name, const QString &password);
+    void on_setPasswordButton_clicked();
+    void openSetPasswordDialog(const OperationTargets::List &targets);
+    void onSetPassword(JSON &devices, const QString &name, const QString &password);
+    void on_ipButton_clicked();
+    void on_quickSettingButton_clicked();
+    void onDeviceDrop(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
+                      const QString &sourceSiteId);
+    void on_restartButton_clicked();
+    void openRestoreDialog();
+    void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
+    void on_deleteButton_clicked();
+    void exportDeviceList();
+
+    void applySearch(const QString &text);
+    void followSiteNames();
+    void applyStatusFilter(std::optional<DeviceStatusGroup> status);
+    void clearFilter();
+    void onFilterChanged();
+
+    void onReading(const InventoryReader::Reading &reading);
+    void onUpdateDeviceStatus(const DeviceStatusUpdate &update);
+    void onServerAnswered();
+    void onServerLost();
+    void onSelectionChanged();
+    void onSiteChanged(const QString &siteId);
+    QHash<QString, QString> siteNames() const;
+    OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
+
+    void openRefreshDialog();
+    void onRefreshAll();
+    bool onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog);
+    void onRefreshDone();
+
+    void showContent();
+    void showStatusCounts();
+    void showSelectionCount();
+
+    DeviceInventory m_inventory;
+    std::unique_ptr<DeviceMonitor> m_monitor;
+
+    QSplitter *m_splitter;
+    QWidget *m_console; ///< right of the tree
+    SiteTree *m_siteTree;
+    SiteCommit *m_siteCommit;
+    InventoryUpdater *m_updater;
+    DeviceActions *m_actions;
+    DeviceSiteActions *m_placement;
+    DeviceToolBar *m_toolBar;
+    NoticeBar *m_noticeBar;
+    DeviceTabs *m_tabs;
+    DeviceFooter *m_footer;
+    QTimer *m_selectionLogDelay;
+
+    QPointer<ReconnectingDialog> m_reconnecting;
+    QPointer<RefreshDeviceDialog> m_refreshing;
+    QHash<QString, QString> m_searchedSites; ///< the names by which the search knows sites
+    bool m_tasksRunning = false;
+    bool m_online = false;
+};

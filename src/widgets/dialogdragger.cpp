@@ -1,7 +1,0 @@
-#include "dialogdragger.h"
-
-#include <QMouseEvent>
-
-void DialogDragger::mouseDoubleClickEvent(QMouseEvent *event) {
-    event->accept();
-}

@@ -1,6 +1,0 @@
-#include "popupmenu.h"
-
-PopupMenu::PopupMenu(QWidget *parent) : QMenu(parent) {
-    setWindowFlag(Qt::NoDropShadowWindowHint);
-    setToolTipsVisible(true);
-}
