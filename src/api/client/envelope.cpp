@@ -17,8 +17,11 @@ std::optional<std::string_view> takePlainString(std::string_view text, std::size
         return std::nullopt;
     const std::string_view content = text.substr(at + 1, end - at - 1);
     at = end + 1;
-    const auto isPlain = [](char c) { return c >= ' ' && c < '\x7f' && c != '\\'; };
-    return std::all_of(content.begin(), content.end(), isPlain) ? std::optional(content) : std::nullopt;
+    // Without a way out of the loop the compiler looks at many letters at a time.
+    int others = 0;
+    for (const char c : content)
+        others |= static_cast<int>(c < ' ') | static_cast<int>(c == '\x7f') | static_cast<int>(c == '\\');
+    return others == 0 ? std::optional(content) : std::nullopt;
 }
 
 /// The text of the member "data" of the outermost object. Nothing when anything about it is unusual; then the

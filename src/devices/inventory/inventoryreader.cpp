@@ -45,11 +45,11 @@ private:
     int m_next = 0;
 };
 
-bool isSame(const DeviceSnapshot &a, const DeviceSnapshot &b) {
-    if (a.size() != b.size())
+bool isSame(const std::vector<DeviceRecordPtr> &records, const DeviceSnapshot &previous) {
+    if (records.size() != static_cast<std::size_t>(previous.size()))
         return false;
-    for (int i = 0; i < a.size(); ++i) {
-        if (a.at(i) != b.at(i))
+    for (int i = 0; i < previous.size(); ++i) {
+        if (records[static_cast<std::size_t>(i)] != previous.at(i))
             return false;
     }
     return true;
@@ -165,8 +165,7 @@ DeviceSnapshotPtr readDevices(ServiceSession &session, const DeviceSnapshotPtr &
     // Nothing but garbage is no list, and certainly no empty one.
     if (unreadable > 0 && records.empty())
         return nullptr;
-    auto snapshot = std::make_shared<const DeviceSnapshot>(std::move(records));
-    return isSame(*snapshot, *previous) ? previous : snapshot;
+    return isSame(records, *previous) ? previous : std::make_shared<const DeviceSnapshot>(std::move(records));
 }
 
 unsigned readSites(ServiceSession &session, Sites::List &sites) {
