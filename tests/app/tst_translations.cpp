@@ -92,6 +92,7 @@ private slots:
         QProcess lupdate;
         lupdate.start(QStringLiteral(NVLDM_LUPDATE),
                       {QStringLiteral("-no-obsolete"), QStringLiteral("-locations"), QStringLiteral("none"),
+                       QStringLiteral("-I"), QStringLiteral(NVLDM_SOURCES "/src"),
                        QStringLiteral(NVLDM_SOURCES "/src"), QStringLiteral("-ts"), fresh});
         QVERIFY(lupdate.waitForFinished());
         QCOMPARE(lupdate.exitCode(), 0);

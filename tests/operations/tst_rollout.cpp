@@ -143,7 +143,7 @@ void TestRollout::goesFromWaveToWave() {
 }
 
 void TestRollout::firstWaveIsJudged_data() {
-    QTest::addColumn<int>("mostFailed");
+    QTest::addColumn<int>("maxFailed");
     QTest::addColumn<QString>("status");
     QTest::addColumn<QStringList>("states");
     QTest::addColumn<State>("state");

@@ -119,11 +119,14 @@ private:
         return m_devices.is_null() || std::all_of(asked.begin(), asked.end(), has);
     }
 
+    /// The last character of the id, which is a hex digit, tells devices apart.
+    static std::string macOf(const std::string &id) { return std::string("AA-00-00-00-00-D") + id.back(); }
+
     nlohmann::json makeTask(const nlohmann::json &asked) {
         nlohmann::json devices = nlohmann::json::array();
         for (const nlohmann::json &device : asked["devices"]) {
             const std::string id = device.is_object() ? device["id"] : device;
-            devices.push_back({{"id", id}, {"d_mac", "AA-" + id}, {"state", "pTaskFailed"}});
+            devices.push_back({{"id", id}, {"d_mac", macOf(id)}, {"state", "pTaskFailed"}});
         }
         nlohmann::json task = {
             {"tid", "T" + std::to_string(m_tasks.size() + 1)}, {"type", asked["type"]}, {"devices", devices}};

@@ -164,7 +164,7 @@ private slots:
     }
 
     void removedDevicesAreLeftOut() {
-        m_service->setDevices({{{"id", "DV1"}, {"d_mac", "AA:01"}}, {{"id", "DV3"}, {"d_mac", "AA:03"}}});
+        m_service->setDevices({{{"id", "DV1"}, {"d_mac", "AA:00:00:00:00:01"}}, {{"id", "DV3"}, {"d_mac", "AA:00:00:00:00:03"}}});
         QSignalSpy leftOut(m_queue.get(), &TaskQueue::devicesLeftOut);
         QSignalSpy failed(m_queue.get(), &TaskQueue::handOverFailed);
         JSON files;
@@ -172,7 +172,7 @@ private slots:
         QString ctid;
         m_queue->insert("plain",
                         {{"devices", {"DV1", "DV2", "DV3"}},
-                         {"pkey", {{{"d_mac", "aa-01"}}, {{"d_mac", "aa-02"}}, {{"fname", "all"}}}}},
+                         {"pkey", {{{"d_mac", "aa-00-00-00-00-01"}}, {{"d_mac", "aa-00-00-00-00-02"}}, {{"fname", "all"}}}}},
                         &ctid);
         m_queue->handlingTask();
         QTRY_COMPARE(leftOut.count(), 1);
@@ -180,7 +180,7 @@ private slots:
         const std::vector<json> sent = m_service->sentTo("/v1/task/init");
         QCOMPARE(sent.size(), 2u);
         QVERIFY(sent[1]["devices"] == (json{"DV1", "DV3"}));
-        QVERIFY(files == (json{{{"d_mac", "aa-01"}}, {{"fname", "all"}}}));
+        QVERIFY(files == (json{{{"d_mac", "aa-00-00-00-00-01"}}, {{"fname", "all"}}}));
         // Nobody is left of these, and the refusal is told as it is.
         m_queue->add("plain", {"DV7", "DV8"});
         m_queue->handlingTask();
@@ -403,7 +403,7 @@ private slots:
         QSignalSpy made(m_queue.get(), &TaskQueue::serviceTaskMade);
         QSignalSpy dialog(m_queue.get(), &TaskQueue::dialogNeeded);
         JSON record = {{"devices", {"DV1", "DV2"}},
-                       {"cert", {{{"d_mac", "aa:dv1"}}, {{"d_mac", "AADV2"}}, {{"fname", "all"}}}}};
+                       {"cert", {{{"d_mac", "aa:00:00:00:00:d1"}}, {{"d_mac", "AA00000000D2"}}, {{"fname", "all"}}}}};
         QVERIFY(m_queue->insert("plain", record));
         m_queue->add("secret");
         JSON files;
@@ -420,7 +420,7 @@ private slots:
         const std::vector<json> sent = m_service->sentTo("/v1/task/init");
         QCOMPARE(sent.size(), 3u);
         QVERIFY(sent[2]["devices"] == json::array({"DV2"}));
-        QVERIFY(files == (json{{{"d_mac", "AADV2"}}, {{"fname", "all"}}}));
+        QVERIFY(files == (json{{{"d_mac", "AA00000000D2"}}, {{"fname", "all"}}}));
         QCOMPARE(dialog.value(0), QVariantList({"deviceChangePass", QStringList{"DV1"}}));
     }
 

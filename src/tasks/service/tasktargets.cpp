@@ -70,8 +70,8 @@ JSON only(const JSON &devices, const QStringList &deviceIds) {
 
 JSON onlyFilesOf(const JSON &files, const QSet<QString> &macs) {
     return filtered(files, [&](const JSON &file) {
-        const QString mac = plainMac(stringMember(file, "d_mac"));
-        return mac.isEmpty() || macs.contains(mac);
+        const QString mac = stringMember(file, "d_mac");
+        return mac.isEmpty() || macs.contains(plainMac(mac));
     });
 }
 
