@@ -7,7 +7,6 @@
 
 namespace {
 
-constexpr QColor textColour{0xf5, 0xf5, 0xf5};
 constexpr QPoint cursorDistance{16, 18};
 constexpr QMargins padding{8, 4, 8, 4};
 
@@ -49,6 +48,6 @@ void DragTip::paintEvent(QPaintEvent *) {
     QPainter painter(this);
     painter.fillRect(rect(), Theme::accent);
     painter.setFont(tipFont());
-    painter.setPen(textColour);
+    painter.setPen(Theme::dragTipText);
     painter.drawText(rect(), Qt::AlignCenter | Qt::TextSingleLine, m_text);
 }

@@ -19,6 +19,7 @@ inline const QColor textDim{255, 255, 255, 191};
 inline const QColor textQuiet{255, 255, 255, 140};
 inline const QColor textOff{255, 255, 255, 64};
 inline const QColor switchOff{0x4A, 0x4A, 0x4A};
+inline const QColor dragTipText{0xF5, 0xF5, 0xF5};
 inline const QColor accent{0x29, 0x86, 0xFF};
 inline const QColor selection{0x29, 0x86, 0xFF, 38};
 /// Laid over the rows of a tree: the current one, and the one under the pointer.
