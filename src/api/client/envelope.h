@@ -2,6 +2,8 @@
 
 #include "platform/json.h"
 
+#include <nlohmann/json.hpp>
+
 #include <optional>
 #include <string_view>
 

@@ -2,6 +2,7 @@
 
 #include <csignal>
 #include <cstdlib>
+#include <initializer_list>
 
 #ifdef __unix__
 #include <sys/resource.h>
