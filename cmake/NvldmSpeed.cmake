@@ -2,10 +2,10 @@
 # installed. Neither is needed, and what is given to others (Release) is linked as always.
 find_program(CCACHE_PROGRAM ccache)
 if(CCACHE_PROGRAM AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
-    # Precompiled headers want these; the folder of the project is no part of what is compared.
+    # Precompiled headers want these. Paths are compared as they are: a release maps them to where they stand in the
+    # project, which a rewritten path would miss.
     set(CMAKE_CXX_COMPILER_LAUNCHER ${CMAKE_COMMAND} -E env CCACHE_DEPEND=1
-        CCACHE_SLOPPINESS=pch_defines,time_macros,include_file_mtime,include_file_ctime
-        CCACHE_BASEDIR=${PROJECT_SOURCE_DIR} CCACHE_NOHASHDIR=1 ${CCACHE_PROGRAM})
+        CCACHE_SLOPPINESS=pch_defines,time_macros,include_file_mtime,include_file_ctime ${CCACHE_PROGRAM})
 endif()
 
 if(UNIX AND NOT APPLE)
