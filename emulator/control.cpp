@@ -27,15 +27,13 @@ std::vector<std::string> wordsOf(const std::string &line) {
     bool inWord = false;
     for (const char c : line) {
         const bool blank = (c == ' ' || c == '\t' || c == '\r') && !quoted;
-        if (!blank && !inWord) {
+        if (!blank && !inWord)
             words.emplace_back();
-        }
         inWord = !blank;
-        if (c == '"') {
+        if (c == '"')
             quoted = !quoted;
-        } else if (!blank) {
+        else if (!blank)
             words.back() += c;
-        }
     }
     return words;
 }
@@ -69,9 +67,8 @@ void authorize(Model &model, Device &device) {
 
 std::size_t admitAll(Model &model) {
     Transaction transaction(model.store.database());
-    for (std::size_t i = 0; i < model.devices.size(); ++i) {
+    for (std::size_t i = 0; i < model.devices.size(); ++i)
         authorize(model, model.devices.at(i));
-    }
     transaction.commit();
     return model.devices.size();
 }
@@ -125,9 +122,8 @@ void Control::readInput() {
     while (!m_stop.raised() && !m_stopWasAsked) {
         // Waking up now and then keeps the reader from outliving the rest of the program.
         const auto chunk = platform::readInput(std::chrono::milliseconds(200));
-        if (!chunk) {
+        if (!chunk)
             return;
-        }
         pending += *chunk;
         for (auto end = pending.find('\n'); end != std::string::npos; end = pending.find('\n')) {
             const std::string line = pending.substr(0, end);
@@ -153,9 +149,8 @@ std::string Control::run(const Words &words) {
         m_stopWasAsked = true;
         return "ok";
     }
-    if (command == "counts" && words.size() == 1) {
+    if (command == "counts" && words.size() == 1)
         return counts();
-    }
     if (command == "expire-sessions" && words.size() == 1) {
         m_service.withModel([](Model &model) { model.sessions.closeAll(); });
         return "ok";
@@ -173,50 +168,39 @@ std::string Control::run(const Words &words) {
 
 std::string Control::runOnDevices(const Words &words) {
     const std::string command = words.empty() ? std::string() : words[0];
-    if (command == "fault" && words.size() == 2) {
+    if (command == "fault" && words.size() == 2)
         return fault(words[1]);
-    }
-    if (command == "drop" && words.size() == 2) {
+    if (command == "drop" && words.size() == 2)
         return drop(words[1]);
-    }
-    if (command == "restore" && words.size() == 2) {
+    if (command == "restore" && words.size() == 2)
         return restore(words[1]);
-    }
-    if (command == "admit" && words.size() == 2) {
+    if (command == "admit" && words.size() == 2)
         return admit(words[1]);
-    }
-    if (command == "remove" && words.size() == 2) {
+    if (command == "remove" && words.size() == 2)
         return remove(words[1]);
-    }
-    if (command == "add" && words.size() == 2) {
+    if (command == "add" && words.size() == 2)
         return add(words[1]);
-    }
-    if (command == "tick" && words.size() == 2) {
+    if (command == "tick" && words.size() == 2)
         return tick(words[1]);
-    }
-    if (command == "status" && words.size() == 5) {
+    if (command == "status" && words.size() == 5)
         return status(words);
-    }
     return runOnTasks(words);
 }
 
 std::string Control::runOnTasks(const Words &words) {
     const std::string command = words.empty() ? std::string() : words[0];
-    if (command == "task" && (words.size() == 3 || words.size() == 4)) {
+    if (command == "task" && (words.size() == 3 || words.size() == 4))
         return task(words);
-    }
-    if ((command == "task-pace" || command == "task-failures") && words.size() == 2) {
+    if ((command == "task-pace" || command == "task-failures") && words.size() == 2)
         return taskRule(command, words[1]);
-    }
     if (command == "touch-tasks" && words.size() == 2 && numberOf(words[1])) {
         const std::size_t count = *numberOf(words[1]);
         return "ok " +
                std::to_string(m_service.withModel([&](Model &model) { return model.tasks.touch(count); })) +
                " tasks";
     }
-    if (command == "alarm" && (words.size() == 2 || words.size() == 3)) {
+    if (command == "alarm" && (words.size() == 2 || words.size() == 3))
         return alarm(words);
-    }
     return runOnAccounts(words);
 }
 
@@ -228,9 +212,8 @@ std::string Control::fault(const std::string &text) {
 std::string Control::drop(const std::string &what) {
     const auto number = numberOf(what);
     return counted(m_service.withModel([&](Model &model) {
-        if (number) {
+        if (number)
             return dropSome(model, *number);
-        }
         hold(model, model.devices.get(what), false);
         return std::size_t{1};
     }));
@@ -238,9 +221,8 @@ std::string Control::drop(const std::string &what) {
 
 std::string Control::restore(const std::string &what) {
     return counted(m_service.withModel([&](Model &model) {
-        if (what == "all") {
+        if (what == "all")
             return restoreAll(model);
-        }
         hold(model, model.devices.get(what), true);
         return std::size_t{1};
     }));
@@ -248,9 +230,8 @@ std::string Control::restore(const std::string &what) {
 
 std::string Control::admit(const std::string &what) {
     return counted(m_service.withModel([&](Model &model) {
-        if (what == "all") {
+        if (what == "all")
             return admitAll(model);
-        }
         authorize(model, model.devices.get(what));
         return std::size_t{1};
     }));
@@ -263,40 +244,34 @@ std::string Control::remove(const std::string &id) {
 
 std::string Control::add(const std::string &count) {
     const auto number = numberOf(count);
-    if (!number || *number > 100000) {
+    if (!number || *number > 100000)
         throw std::runtime_error("add takes a number of devices");
-    }
     m_service.withModel([&](Model &model) { addDevices(model, *number); });
     return counted(*number);
 }
 
 std::string Control::tick(const std::string &count) {
     const auto number = numberOf(count);
-    if (!number || *number > 100000) {
+    if (!number || *number > 100000)
         throw std::runtime_error("tick takes a number of ticks");
-    }
-    for (std::size_t i = 0; i < *number; ++i) {
+    for (std::size_t i = 0; i < *number; ++i)
         m_service.step();
-    }
     return "ok";
 }
 
 std::string Control::status(const Words &words) {
     const std::string &id = words[1], &auth = words[2], &connect = words[3], &action = words[4];
     Authorization authorization{};
-    if (auth != "-" && !authorizationOf(auth, authorization)) {
+    if (auth != "-" && !authorizationOf(auth, authorization))
         throw std::runtime_error("no such authorization");
-    }
-    if (connect != "-" && connect != "Connected" && connect != "Unreachable") {
+    if (connect != "-" && connect != "Connected" && connect != "Unreachable")
         throw std::runtime_error("a device is Connected or Unreachable");
-    }
     m_service.withModel([&](Model &model) {
         Device &device = model.devices.get(id);
         const bool wasAuthorized = device.authorization == Authorization::Authorized;
         device.authorization = auth == "-" ? device.authorization : authorization;
-        if (wasAuthorized && device.authorization != Authorization::Authorized) {
+        if (wasAuthorized && device.authorization != Authorization::Authorized)
             model.alarms.raise(AlarmKind::AuthorizationLost, &device, nowMs());
-        }
         device.action = action == "-" ? device.action : action;
         const bool reachable = connect == "-" ? device.reachable : connect == "Connected";
         device.held = connect == "-" ? device.held : !reachable;
@@ -320,9 +295,8 @@ std::string Control::counts() {
 std::string Control::task(const Words &words) {
     const auto count = numberOf(words[2]);
     const auto delay = words.size() == 4 ? numberOf(words[3]) : std::optional<std::size_t>(0);
-    if (!count || !delay || *delay > 1000000000) {
+    if (!count || !delay || *delay > 1000000000)
         throw std::runtime_error("task takes a type, a number of devices and a delay");
-    }
     return "ok " + m_service.withModel([&](Model &model) {
         const std::int64_t now = nowMs();
         Json devices = Json::array();
@@ -347,16 +321,14 @@ std::string Control::taskRule(const std::string &rule, const std::string &value)
     double number = -1;
     const auto [end, error] = std::from_chars(value.data(), value.data() + value.size(), number);
     const double most = rule == "task-pace" ? 3600000 : 1;
-    if (error != std::errc() || end != value.data() + value.size() || !(number >= 0 && number <= most)) {
+    if (error != std::errc() || end != value.data() + value.size() || !(number >= 0 && number <= most))
         throw std::runtime_error(rule + " takes no such number");
-    }
     m_service.withModel([&](Model &model) {
         TaskRules &rules = model.engine.rules();
-        if (rule == "task-pace") {
+        if (rule == "task-pace")
             rules.paceMs = static_cast<std::int64_t>(number);
-        } else {
+        else
             rules.failures = number;
-        }
     });
     return "ok";
 }
@@ -364,9 +336,8 @@ std::string Control::taskRule(const std::string &rule, const std::string &value)
 std::string Control::alarm(const Words &words) {
     const auto kind = numberOf(words[1]);
     const auto count = words.size() == 3 ? numberOf(words[2]) : std::optional<std::size_t>(1);
-    if (!kind || *kind < 1 || *kind > 6 || !count || *count > 100000) {
+    if (!kind || *kind < 1 || *kind > 6 || !count || *count > 100000)
         throw std::runtime_error("alarm takes a number from 1 to 6 and how often");
-    }
     m_service.withModel([&](Model &model) {
         const auto what = static_cast<AlarmKind>(*kind);
         const bool ofServer = what == AlarmKind::ServerStarted || what == AlarmKind::ServerStopped;

@@ -26,9 +26,8 @@ constexpr int usageStatus = 2;
 void useKeyOf(const std::filesystem::path &folder) {
     const std::string path = emulator::utf8(folder);
     nvlcryptoSetKeyFolder(path.data(), path.size());
-    if (!emulator::ciphersWork()) {
+    if (!emulator::ciphersWork())
         throw std::runtime_error("the key file in " + path + " cannot be used");
-    }
 }
 
 void live(emulator::Service &service, const emulator::StopSignal &stop) {
@@ -45,24 +44,20 @@ void live(emulator::Service &service, const emulator::StopSignal &stop) {
 /// at any time.
 void leaveWithin(const std::future<void> &ended, const emulator::ServiceFiles &files) {
     files.writeStopped();
-    if (ended.wait_for(3s) != std::future_status::ready) {
+    if (ended.wait_for(3s) != std::future_status::ready)
         std::_Exit(0);
-    }
 }
 
 int serve(const emulator::Options &options) {
     const emulator::ServiceFiles files(options.root);
-    if (options.fresh) {
+    if (options.fresh)
         files.discardStore();
-    }
-    if (options.newKey) {
+    if (options.newKey)
         files.discardIdentity();
-    }
     useKeyOf(options.root);
     emulator::Faults faults(options.seed);
-    for (const std::string &fault : options.faults) {
+    for (const std::string &fault : options.faults)
         faults.add(fault);
-    }
     emulator::Service service(options, files.storePath());
     emulator::StopSignal stop;
     emulator::ServerRules rules;
@@ -95,9 +90,8 @@ int run(const emulator::Options &options) {
         std::cout << "nvldm-emulator " NVLDM_VERSION "\n";
         return 0;
     }
-    for (const std::string &fault : options.faults) {
+    for (const std::string &fault : options.faults)
         emulator::readFault(fault);
-    }
     return serve(options);
 }
 

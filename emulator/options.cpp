@@ -131,9 +131,8 @@ std::function<void(const std::string &)> numberInto(const std::string &name, Num
 
 StartAccount accountOf(const std::string &text) {
     const auto afterEmail = text.find(':');
-    if (afterEmail == 0 || afterEmail == std::string::npos) {
+    if (afterEmail == 0 || afterEmail == std::string::npos)
         throw UsageError("--account takes EMAIL:PASSWORD[:PERMISSION]");
-    }
     StartAccount account{text.substr(0, afterEmail), text.substr(afterEmail + 1), "admin"};
     // The permission is a closed set, so a password may hold colons.
     for (const std::string permission : {"admin", "operator", "viewer"}) {
@@ -144,9 +143,8 @@ StartAccount accountOf(const std::string &text) {
             break;
         }
     }
-    if (account.password.empty()) {
+    if (account.password.empty())
         throw UsageError("--account takes EMAIL:PASSWORD[:PERMISSION]");
-    }
     return account;
 }
 
@@ -158,9 +156,8 @@ OrbUser orbUserOf(const std::string &text) {
         user.password.erase(user.password.size() - suffix.size());
         user.expired = true;
     }
-    if (user.email.empty() || user.password.empty()) {
+    if (user.email.empty() || user.password.empty())
         throw UsageError("--orb-user takes EMAIL:PASSWORD[:expired]");
-    }
     return user;
 }
 
@@ -215,21 +212,19 @@ Options readOptions(const std::vector<std::string> &arguments) {
         const std::string &argument = arguments[i];
         const auto equals = argument.starts_with("--") ? argument.find('=') : std::string::npos;
         const std::string name = argument.substr(0, equals);
-        if (const auto flag = flags.find(argument); flag != flags.end()) {
+        if (const auto flag = flags.find(argument); flag != flags.end())
             *flag->second = true;
-        } else if (const auto value = values.find(name); value == values.end()) {
+        else if (const auto value = values.find(name); value == values.end())
             throw UsageError("unknown option " + argument);
-        } else if (equals != std::string::npos) {
+        else if (equals != std::string::npos)
             value->second(argument.substr(equals + 1));
-        } else if (i + 1 == arguments.size()) {
+        else if (i + 1 == arguments.size())
             throw UsageError(name + " needs a value");
-        } else {
+        else
             value->second(arguments[++i]);
-        }
     }
-    if (options.root.empty() && !options.help && !options.version) {
+    if (options.root.empty() && !options.help && !options.version)
         throw UsageError("a folder is needed: --root DIR");
-    }
     return options;
 }
 

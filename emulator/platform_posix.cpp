@@ -51,9 +51,8 @@ void requestStop() {
 
 std::optional<std::string> readInput(std::chrono::milliseconds time) {
     pollfd input{STDIN_FILENO, POLLIN, 0};
-    if (::poll(&input, 1, static_cast<int>(time.count())) <= 0) {
+    if (::poll(&input, 1, static_cast<int>(time.count())) <= 0)
         return std::string();
-    }
     std::array<char, 4096> chunk{};
     const ssize_t count = ::read(STDIN_FILENO, chunk.data(), chunk.size());
     return count > 0 ? std::optional(std::string(chunk.data(), static_cast<std::size_t>(count)))
@@ -61,16 +60,14 @@ std::optional<std::string> readInput(std::chrono::milliseconds time) {
 }
 
 void makePrivateFolder(const std::filesystem::path &folder) {
-    if (::mkdir(folder.c_str(), 0700) != 0 && !std::filesystem::is_directory(folder)) {
+    if (::mkdir(folder.c_str(), 0700) != 0 && !std::filesystem::is_directory(folder))
         throw std::runtime_error("cannot make the folder " + utf8(folder));
-    }
 }
 
 void makePrivateFile(const std::filesystem::path &path) {
     const int file = openPrivate(path, O_RDWR);
-    if (file < 0) {
+    if (file < 0)
         throw std::runtime_error("cannot open " + utf8(path));
-    }
     ::close(file);
 }
 
@@ -79,17 +76,15 @@ void writePrivateFile(const std::filesystem::path &path, const std::string &text
     const bool written =
         file >= 0 && ::write(file, text.data(), text.size()) == static_cast<ssize_t>(text.size());
     const bool closed = file >= 0 && ::close(file) == 0;
-    if (!written || !closed) {
+    if (!written || !closed)
         throw std::runtime_error("cannot write " + utf8(path));
-    }
 }
 
 FileClaim::FileClaim(const std::filesystem::path &path) {
     const int file = openPrivate(path, O_RDWR);
     if (file < 0 || ::flock(file, LOCK_EX | LOCK_NB) != 0) {
-        if (file >= 0) {
+        if (file >= 0)
             ::close(file);
-        }
         throw std::runtime_error("the folder " + utf8(path.parent_path()) + " cannot be used or is in use");
     }
     m_file = file;

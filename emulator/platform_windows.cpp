@@ -30,9 +30,8 @@ BOOL WINAPI onConsoleEvent(DWORD) {
 /// How many bytes a read would give; nothing when there is no telling, as at a console.
 std::optional<DWORD> bytesWaiting(HANDLE input) {
     DWORD count = 0;
-    if (::GetFileType(input) != FILE_TYPE_PIPE) {
+    if (::GetFileType(input) != FILE_TYPE_PIPE)
         return std::nullopt;
-    }
     // A pipe that nobody writes to any more is read as well: that tells its end.
     return ::PeekNamedPipe(input, nullptr, 0, nullptr, &count, nullptr) ? std::optional(count) : std::nullopt;
 }
@@ -56,9 +55,8 @@ void requestStop() {
 std::optional<std::string> readInput(std::chrono::milliseconds time) {
     const HANDLE input = ::GetStdHandle(STD_INPUT_HANDLE);
     if (::GetFileType(input) == FILE_TYPE_CHAR &&
-        ::WaitForSingleObject(input, static_cast<DWORD>(time.count())) != WAIT_OBJECT_0) {
+        ::WaitForSingleObject(input, static_cast<DWORD>(time.count())) != WAIT_OBJECT_0)
         return std::string();
-    }
     if (bytesWaiting(input) == DWORD{0}) {
         std::this_thread::sleep_for(time);
         return std::string();
@@ -70,31 +68,27 @@ std::optional<std::string> readInput(std::chrono::milliseconds time) {
 }
 
 void makePrivateFolder(const std::filesystem::path &folder) {
-    if (!WindowsAcl::makeFolder(folder.wstring()) && !std::filesystem::is_directory(folder)) {
+    if (!WindowsAcl::makeFolder(folder.wstring()) && !std::filesystem::is_directory(folder))
         throw std::runtime_error("cannot make the folder " + utf8(folder));
-    }
 }
 
 void makePrivateFile(const std::filesystem::path &path) {
-    if (!WindowsAcl::makeFile(path.wstring()) && !std::filesystem::exists(path)) {
+    if (!WindowsAcl::makeFile(path.wstring()) && !std::filesystem::exists(path))
         throw std::runtime_error("cannot open " + utf8(path));
-    }
 }
 
 void writePrivateFile(const std::filesystem::path &path, const std::string &text) {
     makePrivateFile(path);
     std::ofstream file(path, std::ios::binary | std::ios::trunc);
-    if (!file.write(text.data(), static_cast<std::streamsize>(text.size())).flush()) {
+    if (!file.write(text.data(), static_cast<std::streamsize>(text.size())).flush())
         throw std::runtime_error("cannot write " + utf8(path));
-    }
 }
 
 FileClaim::FileClaim(const std::filesystem::path &path) {
     const HANDLE file = ::CreateFileW(path.c_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, OPEN_ALWAYS,
                                       FILE_ATTRIBUTE_NORMAL, nullptr);
-    if (file == INVALID_HANDLE_VALUE) {
+    if (file == INVALID_HANDLE_VALUE)
         throw std::runtime_error("the folder " + utf8(path.parent_path()) + " cannot be used or is in use");
-    }
     m_file = reinterpret_cast<std::intptr_t>(file);
 }
 
@@ -112,9 +106,8 @@ void cutConnection(int descriptor) {
 
 bool callerHasLeft(int descriptor) {
     WSAPOLLFD watched{static_cast<SOCKET>(descriptor), POLLRDNORM, 0};
-    if (::WSAPoll(&watched, 1, 0) <= 0) {
+    if (::WSAPoll(&watched, 1, 0) <= 0)
         return false;
-    }
     char byte = 0;
     const bool hasEnded = (watched.revents & POLLRDNORM) != 0 &&
                           ::recv(static_cast<SOCKET>(descriptor), &byte, 1, MSG_PEEK) <= 0;

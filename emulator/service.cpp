@@ -32,9 +32,8 @@ Service::Service(const Options &options, const std::filesystem::path &storePath)
     const bool isNew = prepareFleet(options);
     prepareAccounts(options);
     prepareOrb(options);
-    if (isNew) {
+    if (isNew)
         makeHistory(m_model, {options.tasks, options.taskDevices, options.alarms, options.logEntries});
-    }
     m_model.engine.rules() = {options.taskPaceMs, options.taskWorkTimeoutMs, options.taskFailures,
                               m_model.seed()};
     m_model.alarms.raise(AlarmKind::ServerStarted, nullptr, nowMs());
@@ -48,14 +47,12 @@ void Service::runDueWork() {
     m_model.batches.dropOverdue(nowMs());
     m_model.engine.settle(nowMs());
     m_model.log.expire(nowMs(), m_model.settings.logDays());
-    if (Clock::now() < m_nextTick) {
+    if (Clock::now() < m_nextTick)
         return;
-    }
     // A tick that comes late is not made up for.
     m_nextTick = std::max(m_nextTick + m_tickLength, Clock::now());
-    if (m_lives) {
+    if (m_lives)
         m_life->tick();
-    }
 }
 
 std::chrono::milliseconds Service::timeUntilNextWork() {
@@ -92,9 +89,8 @@ bool Service::prepareFleet(const Options &options) {
 }
 
 void Service::prepareAccounts(const Options &options) {
-    if (m_model.accounts.all().empty()) {
+    if (m_model.accounts.all().empty())
         m_model.accounts.addFactoryAccount(hashPassword("admin"));
-    }
     for (const StartAccount &wanted : options.accounts) {
         if (!m_model.accounts.find(wanted.email)) {
             m_model.accounts.add(
@@ -104,9 +100,8 @@ void Service::prepareAccounts(const Options &options) {
 }
 
 void Service::prepareOrb(const Options &options) {
-    for (const OrbUser &user : options.orbUsers) {
+    for (const OrbUser &user : options.orbUsers)
         m_model.orb.setUser(user.email, {hashPassword(user.password), user.expired});
-    }
     if (!m_model.orb.hasUsers()) {
         const PasswordHash password = hashPassword("Partner-1");
         m_model.orb.setUser("partner@norvell.example", {password, false});

@@ -17,30 +17,25 @@ namespace {
 
 std::uint32_t addressMember(const Json &object, const char *name) {
     const auto number = addressNumber(textMember(object, name));
-    if (!number) {
+    if (!number)
         refuse(std::string("\"") + name + "\" is no address");
-    }
     return *number;
 }
 
 void checkNameServers(const Json &body) {
-    for (const char *name : {"dns1", "dns2"}) {
-        if (!optionalText(body, name).empty()) {
+    for (const char *name : {"dns1", "dns2"})
+        if (!optionalText(body, name).empty())
             addressMember(body, name);
-        }
-    }
 }
 
 } // namespace
 
 AddressAssignment::AddressAssignment(const Json &body)
     : m_mask(addressMember(body, "mask")), m_gateway(addressMember(body, "gate")) {
-    if (!isSubnetMask(m_mask)) {
+    if (!isSubnetMask(m_mask))
         refuse("\"mask\" is no subnet mask");
-    }
-    if (!Subnet{m_mask, m_gateway}.hasHost(m_gateway)) {
+    if (!Subnet{m_mask, m_gateway}.hasHost(m_gateway))
         refuse("\"gate\" is no address of a host");
-    }
     checkNameServers(body);
     readDevices(body);
 }
@@ -48,17 +43,14 @@ AddressAssignment::AddressAssignment(const Json &body)
 void AddressAssignment::readDevices(const Json &body) {
     std::unordered_set<std::uint32_t> given;
     for (const Json &element : arrayMember(body, "devices")) {
-        if (!element.is_object()) {
+        if (!element.is_object())
             refuse("an element of \"devices\" holds no address");
-        }
         const std::string id = filledTextMember(element, "id");
         const std::uint32_t address = addressMember(element, "ip");
-        if (!given.insert(address).second || !m_addresses.emplace(id, address).second) {
+        if (!given.insert(address).second || !m_addresses.emplace(id, address).second)
             refuse("an address or a device stands twice in \"devices\"");
-        }
-        if (!Subnet{m_mask, address}.hasHost(address)) {
+        if (!Subnet{m_mask, address}.hasHost(address))
             refuse(addressText(address) + " is the address of a network or of a broadcast");
-        }
         m_ids.push_back(id);
     }
 }

@@ -36,23 +36,20 @@ const std::string *AddressBook::holderOf(std::uint32_t address) {
 std::string AddressBook::lease(const Device &device) {
     read();
     const auto present = addressNumber(device.ip);
-    if (!present || isLeased(device, *present)) {
+    if (!present || isLeased(device, *present))
         return device.ip;
-    }
     // What is passed over once stays taken; a whole fleet asks at a time.
     for (std::uint32_t &next = m_next[*present & networkMask]; next < leases; ++next) {
         const std::uint32_t address = leasedAddress(*present, next);
-        if (m_holders.try_emplace(address, device.id).second) {
+        if (m_holders.try_emplace(address, device.id).second)
             return addressText(address);
-        }
     }
     return device.ip;
 }
 
 void AddressBook::read() {
-    if (m_isRead) {
+    if (m_isRead)
         return;
-    }
     m_isRead = true;
     for (std::size_t i = 0; i < m_model.devices.size(); ++i) {
         const Device &device = m_model.devices.at(i);
@@ -67,17 +64,15 @@ void AddressBook::readPromises() {
         for (const TaskDevice &device : task->devices) {
             const auto promised = device.work.changes.find("d_ip");
             const bool stands = device.phase != TaskDevice::Phase::Ended && device.work.failure.empty();
-            if (stands && promised != device.work.changes.end()) {
+            if (stands && promised != device.work.changes.end())
                 claim(promised->get<std::string>(), device.id);
-            }
         }
     }
 }
 
 void AddressBook::claim(const std::string &address, const std::string &deviceId) {
-    if (const auto number = addressNumber(address)) {
+    if (const auto number = addressNumber(address))
         m_holders.try_emplace(*number, deviceId);
-    }
 }
 
 } // namespace emulator

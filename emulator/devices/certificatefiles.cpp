@@ -32,9 +32,8 @@ Bio readerOf(const std::string &bytes) {
 /// The library would ask on the terminal otherwise.
 int givePassPhrase(char *buffer, int size, int, void *phrase) {
     const auto &text = *static_cast<const std::string *>(phrase);
-    if (text.empty() || text.size() > static_cast<std::size_t>(size)) {
+    if (text.empty() || text.size() > static_cast<std::size_t>(size))
         return -1;
-    }
     text.copy(buffer, text.size());
     return static_cast<int>(text.size());
 }
@@ -52,14 +51,12 @@ DeviceWork workOf(const Device &device, std::string failure) {
 
 /// The pass phrase or password that the task holds for a device.
 std::string passOf(const Json &parameters) {
-    if (optionalText(parameters, "identity").empty()) {
+    if (optionalText(parameters, "identity").empty())
         throw Refusal(Code::Malformed, "a device of the task has no \"identity\"");
-    }
     const std::string cipher = optionalText(parameters, "pass");
     const auto plain = cipher.empty() ? std::optional(std::string()) : plainPassword(cipher);
-    if (!plain) {
+    if (!plain)
         throw Refusal(Code::Malformed, "\"pass\" of a device of the task does not decipher");
-    }
     return *plain;
 }
 
@@ -105,24 +102,22 @@ std::string subjectOf(const X509 &certificate) {
 
 std::int64_t expiryOf(const X509 &certificate) {
     std::tm parts{};
-    if (ASN1_TIME_to_tm(X509_get0_notAfter(&certificate), &parts) != 1) {
+    if (ASN1_TIME_to_tm(X509_get0_notAfter(&certificate), &parts) != 1)
         return 0;
-    }
     return msOfUtc(parts);
 }
 
 CertificateFiles::CertificateFiles(std::span<const UploadedFile> files) {
     for (const UploadedFile &file : files) {
         const std::string mac = macKeyOf(file.part.size() > 5 ? file.part.substr(5) : std::string());
-        if (file.part == "ca_") {
+        if (file.part == "ca_")
             m_authority = &file;
-        } else if (file.part.starts_with("cert_") && !mac.empty()) {
+        else if (file.part.starts_with("cert_") && !mac.empty())
             m_certificates[mac] = &file;
-        } else if (file.part.starts_with("pkey_") && !mac.empty()) {
+        else if (file.part.starts_with("pkey_") && !mac.empty())
             m_keys[mac] = &file;
-        } else {
+        else
             throw Refusal(Code::Malformed, "a part of the form belongs to no device");
-        }
     }
 }
 
@@ -182,9 +177,8 @@ DeviceWork CertificateFiles::portSecurity(const Device &device, const Json &para
     passOf(parameters);
     const Certificate authority = certificateOf(m_authority->head);
     DeviceWork work = workOf(device, authority ? "" : unreadable);
-    if (authority) {
+    if (authority)
         secure(work, *authority);
-    }
     return work;
 }
 
@@ -192,9 +186,8 @@ DeviceWork CertificateFiles::portSecurityWithKey(const Device &device, const Jso
     DeviceWork work = portSecurity(device, parameters);
     if (work.failure.empty()) {
         const Certificate certificate = keyedCertificateFor(device, passOf(parameters), work.failure);
-        if (certificate) {
+        if (certificate)
             secure(work, *certificate);
-        }
     }
     return work;
 }
@@ -206,9 +199,8 @@ Json httpsChanges(const std::string &subject, std::int64_t expiresAt, const Json
                     {"d_has_matching_cert_request", false},
                     {"d_cert_subject", subject},
                     {"d_cert_expires", expiresAt}};
-    if (port.is_number_integer() && port >= 1 && port <= 65535) {
+    if (port.is_number_integer() && port >= 1 && port <= 65535)
         changes["d_https"] = port;
-    }
     return changes;
 }
 

@@ -27,9 +27,8 @@ std::string report(const Model &model, const Json &entry, const Task &task) {
     std::string text = "Debug information\n" + lineOf("task", task.id) + lineOf("taken_at", task.updatedAt);
     const Device *device = model.devices.find(entry.at("id"));
     const Json record = device ? Json::parse(device->body) : entry;
-    for (const auto &[name, value] : record.items()) {
+    for (const auto &[name, value] : record.items())
         text += lineOf(name, value);
-    }
     if (device) {
         text += lineOf("connect_status", device->reachable ? "Connected" : "Unreachable") +
                 lineOf("auth_status", std::string(nameOf(device->authorization)));
@@ -40,9 +39,8 @@ std::string report(const Model &model, const Json &entry, const Task &task) {
 } // namespace
 
 std::string debugExport(const Model &model, Task &task) {
-    if (task.type != "deviceExportDeviceInfo" || !isFinal(task.status)) {
+    if (task.type != "deviceExportDeviceInfo" || !isFinal(task.status))
         throw Refusal(Code::Malformed, "task " + task.id + " has exported nothing yet");
-    }
     ZipWriter zip(task.updatedAt);
     std::size_t told = 0;
     for (const Json &entry : Json::parse(task.devicesText)) {
@@ -51,9 +49,8 @@ std::string debugExport(const Model &model, Task &task) {
             ++told;
         }
     }
-    if (told == 0) {
+    if (told == 0)
         throw Refusal(Code::Malformed, "no device of task " + task.id + " told anything");
-    }
     return zip.finish();
 }
 

@@ -22,13 +22,11 @@ public:
     explicit PasswordTrial(const std::string &password) : m_password(password) {}
 
     bool opens(const Device &device) {
-        if (device.secret.empty()) {
+        if (device.secret.empty())
             return m_password.size() >= 8;
-        }
         const auto [known, isNew] = m_known.try_emplace(device.secret, false);
-        if (isNew) {
+        if (isNew)
             known->second = opensDevice(m_password, device.secret);
-        }
         return known->second;
     }
 
@@ -62,17 +60,15 @@ void DeviceAuthorization::settle(std::int64_t nowMs) {
 void DeviceAuthorization::applyDue(std::int64_t nowMs) {
     const auto due = std::stable_partition(m_pending.begin(), m_pending.end(),
                                            [&](const Pending &pending) { return pending.dueAt > nowMs; });
-    if (due == m_pending.end()) {
+    if (due == m_pending.end())
         return;
-    }
     const std::vector<Pending> ready(std::make_move_iterator(due), std::make_move_iterator(m_pending.end()));
     m_pending.erase(due, m_pending.end());
     Transaction transaction(m_store.database());
     for (const Pending &pending : ready) {
         Device *device = m_devices.find(pending.id);
-        if (device && device->reachable) {
+        if (device && device->reachable)
             apply(*device, pending.offer, nowMs);
-        }
     }
     transaction.commit();
 }
@@ -90,9 +86,8 @@ void DeviceAuthorization::unblockDue(std::int64_t nowMs) {
 
 void DeviceAuthorization::apply(Device &device, Offer offer, std::int64_t nowMs) {
     // A device that waits for its first password has no account yet to which anything could belong.
-    if (m_blockedUntil.contains(device.id) || device.authorization == Authorization::SetPassword) {
+    if (m_blockedUntil.contains(device.id) || device.authorization == Authorization::SetPassword)
         return;
-    }
     switch (offer) {
     case Offer::Right:
         admit(device);

@@ -72,12 +72,10 @@ void addRestore(DeviceWork &work, const Device &device, const DeviceCommand &com
                 AddressBook &addresses) {
     const bool all = restoresAll(command);
     work.changes.update(factorySettings());
-    if (all || !keeps(command, "net")) {
+    if (all || !keeps(command, "net"))
         work.changes.update(factoryNetwork(device, addresses));
-    }
-    if (all || !keeps(command, "dst")) {
+    if (all || !keeps(command, "dst"))
         work.changes["d_daylight"] = nullptr;
-    }
     work.forgetsAccount |= all;
     work.restarts = true;
 }
@@ -109,11 +107,10 @@ CommandSeries::CommandSeries(const std::vector<std::string> &commands) {
         const DeviceCommand &command = m_commands.emplace_back(readCommand(text));
         const std::string *password = command.path == editAccount ? command.find("userpass") : nullptr;
         m_secret = password ? deviceSecret(*password) : m_secret;
-        if (restoresAll(command) || restoresSome(command)) {
+        if (restoresAll(command) || restoresSome(command))
             m_action = "deviceRestore";
-        } else if (isSet(command, "system_reset", "0") && m_action.empty()) {
+        else if (isSet(command, "system_reset", "0") && m_action.empty())
             m_action = "deviceRestart";
-        }
     }
 }
 
@@ -121,15 +118,13 @@ DeviceWork CommandSeries::workFor(const Device &device, AddressBook &addresses) 
     DeviceWork work;
     work.id = device.id;
     work.restarts = !m_action.empty();
-    for (const DeviceCommand &command : m_commands) {
-        if (command.path == editAccount) {
+    for (const DeviceCommand &command : m_commands)
+        if (command.path == editAccount)
             judgeEdit(device, command, work);
-        } else if (restoresAll(command) || restoresSome(command)) {
+        else if (restoresAll(command) || restoresSome(command))
             addRestore(work, device, command, addresses);
-        } else if (!command.path.starts_with("/cgi-bin/")) {
+        else if (!command.path.starts_with("/cgi-bin/"))
             work.failure = "pTaskUnsupportedMethod";
-        }
-    }
     return work;
 }
 
@@ -139,14 +134,13 @@ void CommandSeries::judgeEdit(const Device &device, const DeviceCommand &command
     const std::string *password = command.find("userpass");
     const bool isNew = device.authorization == Authorization::SetPassword;
     work.access = Access::FirstOwner;
-    if (!method || *method != "edit") {
+    if (!method || *method != "edit")
         work.failure = "pTaskUnsupportedMethod";
-    } else if (!account || !password || !isDeviceAccount(*account) || (isNew && *account != ownerAccount) ||
-               !allowsPassword(device, *account, *password)) {
+    else if (!account || !password || !isDeviceAccount(*account) || (isNew && *account != ownerAccount) ||
+             !allowsPassword(device, *account, *password))
         work.failure = "pTaskFailedToSetPassword";
-    } else if (*account == ownerAccount) {
+    else if (*account == ownerAccount)
         work.secret = m_secret;
-    }
 }
 
 } // namespace emulator

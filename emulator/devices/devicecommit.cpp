@@ -60,30 +60,25 @@ bool fits(const Json &value, Json::value_t type) {
 void judgeMembers(const Json &record, const Json &known) {
     for (const auto &[name, value] : record.items()) {
         const auto type = knownMembers().find(name);
-        if (type == knownMembers().end() || fits(value, type->second)) {
+        if (type == knownMembers().end() || fits(value, type->second))
             continue;
-        }
         const auto held = known.find(name);
-        if (held == known.end() || *held != value) {
+        if (held == known.end() || *held != value)
             refuse("member \"" + name + "\" of a device has a wrong type");
-        }
     }
 }
 
 Sites sitesOf(const Json &record) {
     const auto found = record.find("siteid");
-    if (found == record.end()) {
+    if (found == record.end())
         return std::nullopt;
-    }
     const Json list = found->is_string() ? parseJson(found->get_ref<const std::string &>()) : *found;
-    if (!list.is_array()) {
+    if (!list.is_array())
         refuse("\"siteid\" of a device is no array");
-    }
     std::vector<std::string> sites;
     for (const Json &site : list) {
-        if (!site.is_string()) {
+        if (!site.is_string())
             refuse("\"siteid\" of a device holds something else than texts");
-        }
         sites.push_back(site.get<std::string>());
     }
     return sites;
@@ -91,9 +86,8 @@ Sites sitesOf(const Json &record) {
 
 /// A device that is managed at all is in the overview.
 std::vector<std::string> withOverview(std::vector<std::string> sites) {
-    if (std::find(sites.begin(), sites.end(), overviewId) == sites.end()) {
+    if (std::find(sites.begin(), sites.end(), overviewId) == sites.end())
         sites.insert(sites.begin(), overviewId);
-    }
     return sites;
 }
 
@@ -113,9 +107,8 @@ public:
     explicit DeviceCommit(Model &model) : m_model(model) {}
 
     void judge(const Json &record) {
-        if (!record.is_object()) {
+        if (!record.is_object())
             refuse("a device is no object");
-        }
         const Device *known = deviceOf(record);
         judgeMembers(record, known ? Json::parse(known->body) : Json::object());
         judgeMac(record, known);
@@ -140,39 +133,32 @@ public:
 private:
     Device *deviceOf(const Json &record) const {
         const std::string id = optionalText(record, "id");
-        if (!id.empty()) {
+        if (!id.empty())
             return &m_model.devices.get(id);
-        }
         const std::string key = macKeyOf(textMember(record, "d_mac"));
-        if (key.empty()) {
+        if (key.empty())
             refuse("a device has neither an id nor a MAC");
-        }
         return m_model.devices.findByMac(key);
     }
 
     /// A MAC has one holder, and within one commit one claimant.
     void judgeMac(const Json &record, const Device *known) {
         const auto mac = record.find("d_mac");
-        if (mac == record.end() || !mac->is_string()) {
+        if (mac == record.end() || !mac->is_string())
             return;
-        }
         const std::string key = macKeyOf(mac->get_ref<const std::string &>());
         const Device *holder = m_model.devices.findByMac(key);
         const auto claim = m_claims.try_emplace(key, known).first;
-        if ((holder && holder != known) || (claim->second != known && !key.empty())) {
+        if ((holder && holder != known) || (claim->second != known && !key.empty()))
             refuse("the MAC belongs to another device");
-        }
     }
 
     void judgeSites(const Sites &sites, const Device *known) const {
-        if (!known && sites && sites->empty()) {
+        if (!known && sites && sites->empty())
             throw Refusal(Code::UnknownId, "a device to be removed is unknown");
-        }
-        for (const std::string &site : sites.value_or(std::vector<std::string>())) {
-            if (site != overviewId && !m_model.sites.contains(site)) {
+        for (const std::string &site : sites.value_or(std::vector<std::string>()))
+            if (site != overviewId && !m_model.sites.contains(site))
                 throw Refusal(Code::UnknownId, "no site " + site);
-            }
-        }
     }
 
     void change(Device &known, const Json &record, const Sites &sites) {
@@ -206,21 +192,18 @@ private:
 
 void commitDevices(Model &model, const Json &records) {
     DeviceCommit commit(model);
-    for (const Json &record : records) {
+    for (const Json &record : records)
         commit.judge(record);
-    }
     Transaction transaction(model.store.database());
-    for (const Json &record : records) {
+    for (const Json &record : records)
         commit.apply(record);
-    }
     commit.finish();
     transaction.commit();
 }
 
 void removeDevices(Model &model, const std::vector<std::string> &ids) {
-    for (const std::string &id : ids) {
+    for (const std::string &id : ids)
         model.scans.release(model.devices.get(id));
-    }
     model.engine.forget({ids.begin(), ids.end()}, nowMs());
     model.devices.remove({ids.begin(), ids.end()});
 }

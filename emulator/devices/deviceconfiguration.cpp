@@ -80,17 +80,14 @@ std::optional<Json> valueOf(const std::string &text, Kind kind) {
 
 void addChange(Json &changes, const YAML::Node &root, const Item &item) {
     const YAML::Node section = root[item.section];
-    if (item.kind == Kind::Shown || !section || !section.IsMap()) {
+    if (item.kind == Kind::Shown || !section || !section.IsMap())
         return;
-    }
     const YAML::Node node = section[item.name];
-    if (!node || node.IsNull()) {
+    if (!node || node.IsNull())
         return;
-    }
     const auto value = node.IsScalar() ? valueOf(node.Scalar(), item.kind) : std::nullopt;
-    if (!value) {
+    if (!value)
         refuse(std::string("item \"") + item.name + "\" of the template cannot have this value");
-    }
     changes[item.member] = *value;
 }
 
@@ -108,18 +105,15 @@ Json configurationOf(const Device &device) {
 }
 
 Json templateChanges(const std::string &yaml) {
-    if (yaml.size() > maxTemplateLength) {
+    if (yaml.size() > maxTemplateLength)
         refuse("the template is too long");
-    }
     try {
         const YAML::Node root = YAML::Load(yaml);
-        if (!root.IsMap()) {
+        if (!root.IsMap())
             refuse("the template holds no sections");
-        }
         Json changes = Json::object();
-        for (const Item &item : items) {
+        for (const Item &item : items)
             addChange(changes, root, item);
-        }
         return changes;
     } catch (const YAML::Exception &error) {
         refuse(std::string("the template is no YAML: ") + error.what());

@@ -21,9 +21,8 @@ void DeviceOutages::endOf(const std::string &deviceId, std::int64_t nowMs) {
 void DeviceOutages::endDue(std::int64_t nowMs) {
     std::erase_if(m_outages, [&](const auto &entry) {
         const bool ends = entry.second.endsAt <= nowMs;
-        if (ends) {
+        if (ends)
             end(entry.first, entry.second);
-        }
         return ends;
     });
 }

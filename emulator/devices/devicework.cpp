@@ -49,12 +49,10 @@ bool isPermitted(const Device &device, Access access) {
 }
 
 void apply(DeviceTable &devices, Device &device, const DeviceWork &work) {
-    if (!work.changes.empty()) {
+    if (!work.changes.empty())
         devices.update(device, withMembers(device, work.changes));
-    }
-    if (!work.secret.empty() || work.forgetsAccount) {
+    if (!work.secret.empty() || work.forgetsAccount)
         changeAccount(devices, device, work);
-    }
 }
 
 } // namespace emulator

@@ -36,9 +36,8 @@ int firstNumber(const std::string &version) {
 /// The version after this one: its last number counted up.
 std::string nextVersion(const std::string &version) {
     const auto dot = version.rfind('.');
-    if (!isVersion(version)) {
+    if (!isVersion(version))
         return "1.0.0";
-    }
     return version.substr(0, dot + 1) + std::to_string(std::stoi(version.substr(dot + 1)) + 1);
 }
 
@@ -50,11 +49,10 @@ std::string textIn(const Json &record, const char *name) {
 } // namespace
 
 FirmwareImage::FirmwareImage(const UploadedFile &file) : m_isBroken(file.size == 0) {
-    if (file.head.starts_with(mark)) {
+    if (file.head.starts_with(mark))
         readHeader(file.head.substr(0, std::min(file.head.find('\n'), maxHeaderLength)));
-    } else {
+    else
         m_version = versionInName(file.name);
-    }
 }
 
 void FirmwareImage::readHeader(const std::string &line) {
@@ -62,9 +60,8 @@ void FirmwareImage::readHeader(const std::string &line) {
     std::string models;
     words >> models >> m_version;
     std::istringstream list(models);
-    for (std::string model; std::getline(list, model, ',');) {
+    for (std::string model; std::getline(list, model, ',');)
         m_models.push_back(model);
-    }
     const bool hasGap = std::find(m_models.begin(), m_models.end(), std::string()) != m_models.end();
     m_isBroken = m_models.empty() || hasGap || !isVersion(m_version) || line.size() == maxHeaderLength;
 }
@@ -81,13 +78,12 @@ DeviceWork FirmwareImage::workFor(const Device &device) const {
     work.id = device.id;
     work.restarts = true;
     work.changes["d_fw"] = m_version.empty() ? nextVersion(present) : m_version;
-    if (m_isBroken) {
+    if (m_isBroken)
         work.failure = "pTaskBrokenFile_01";
-    } else if (!fits(textIn(record, "d_model"))) {
+    else if (!fits(textIn(record, "d_model")))
         work.failure = "pTaskInvalidFileForThisModelGroup";
-    } else if (!m_models.empty() && firstNumber(m_version) < firstNumber(present)) {
+    else if (!m_models.empty() && firstNumber(m_version) < firstNumber(present))
         work.failure = "pTaskIncompatibleFirmware";
-    }
     return work;
 }
 

@@ -19,21 +19,18 @@ std::string inSlot(const char *code, std::size_t slot) {
 std::vector<std::string> packagesOf(const Json &record) {
     std::vector<std::string> names;
     const Json kept = record.value("d_packages", Json::array());
-    for (const Json &name : kept.is_array() ? kept : Json::array()) {
+    for (const Json &name : kept.is_array() ? kept : Json::array())
         names.push_back(name.is_string() ? name.get<std::string>() : std::string());
-    }
     return names;
 }
 
 std::string cardFailure(const Json &record, std::size_t slot) {
     const Json status = record.value("d_sdstatus", Json());
     const Json usage = record.value("d_sdusage", Json());
-    if (status == "Error" || status == "readonly") {
+    if (status == "Error" || status == "readonly")
         return inSlot("pTaskSdCardError", slot);
-    }
-    if (status != "ready") {
+    if (status != "ready")
         return "pTaskNoSdCardDetected";
-    }
     const bool full = usage.is_number_integer() && usage.get<std::int64_t>() >= fullCard;
     return full ? inSlot("pTaskInsufficientStorage", slot) : std::string();
 }
@@ -55,19 +52,15 @@ DeviceWork packageWork(const UploadedFile &file, bool onCard, const Device &devi
     DeviceWork work;
     work.id = device.id;
     work.failure = onCard ? cardFailure(record, std::min(slot, slots)) : std::string();
-    if (work.failure.empty() && slot > slots) {
+    if (work.failure.empty() && slot > slots)
         work.failure = inSlot("pTaskMaxPackageUploadLimit", slots);
-    }
-    if (work.failure.empty() && file.size == 0) {
+    if (work.failure.empty() && file.size == 0)
         work.failure = inSlot("pTaskBrokenFile", slot);
-    }
-    if (isNew) {
+    if (isNew)
         packages.push_back(file.name);
-    }
     work.changes["d_packages"] = packages;
-    if (onCard) {
+    if (onCard)
         work.changes["d_sdusage"] = usageWith(record, file.size);
-    }
     return work;
 }
 

@@ -25,18 +25,16 @@ constexpr std::int64_t lastAnswerMs = 2000;
 
 std::uint32_t checkedAddress(const std::string &text) {
     const auto number = addressNumber(text);
-    if (!number) {
+    if (!number)
         throw Refusal(Code::Malformed, "\"" + text + "\" is no address");
-    }
     return *number;
 }
 
 std::int64_t checkedPort(const std::string &text) {
     int port = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), port);
-    if (error != std::errc() || end != text.data() + text.size() || port < 1 || port > 65535) {
+    if (error != std::errc() || end != text.data() + text.size() || port < 1 || port > 65535)
         throw Refusal(Code::Malformed, "\"" + text + "\" is no port");
-    }
     return port;
 }
 
@@ -70,19 +68,16 @@ void Scans::startAddress(const std::string &address, std::int64_t nowMs) {
 
 void Scans::startRange(const std::string &first, const std::string &last, std::int64_t nowMs) {
     const Target target{checkedAddress(first), checkedAddress(last), 0};
-    if (target.first > target.last) {
+    if (target.first > target.last)
         throw Refusal(Code::Malformed, "the range of addresses ends before it begins");
-    }
     search(target, std::numeric_limits<std::size_t>::max(), nowMs);
 }
 
 std::string Scans::foundText(std::int64_t nowMs) const {
     std::string text;
-    for (const Found &found : m_found) {
-        if (found.at <= nowMs) {
+    for (const Found &found : m_found)
+        if (found.at <= nowMs)
             text += (text.empty() ? "" : ",") + found.record;
-        }
-    }
     return '[' + text + ']';
 }
 
@@ -91,33 +86,27 @@ void Scans::release(const Device &device) {
     const bool known = std::any_of(m_neighbours.begin(), m_neighbours.end(), [&](const Neighbour &neighbour) {
         return neighbour.macKey == device.macKey;
     });
-    if (!address || known || device.macKey.empty()) {
+    if (!address || known || device.macKey.empty())
         return;
-    }
     const Json whole = Json::parse(device.body);
     Json record;
-    for (const char *shown : {"d_model", "d_ip", "d_mac", "d_http", "d_https", "d_svrtype"}) {
-        if (const auto value = whole.find(shown); value != whole.end()) {
+    for (const char *shown : {"d_model", "d_ip", "d_mac", "d_http", "d_https", "d_svrtype"})
+        if (const auto value = whole.find(shown); value != whole.end())
             record[shown] = *value;
-        }
-    }
     record["id"] = "";
     record["siteid"] = {overviewId};
     m_neighbours.push_back({device.macKey, *address, std::move(record)});
-    if (m_neighbours.size() > maxNeighbours) {
+    if (m_neighbours.size() > maxNeighbours)
         m_neighbours.pop_front();
-    }
 }
 
 void Scans::search(const Target &target, std::size_t maxManaged, std::int64_t nowMs) {
     const auto covers = [&](std::uint32_t number) { return number >= target.first && number <= target.last; };
     m_found.clear();
-    for (const Neighbour &neighbour : m_neighbours) {
+    for (const Neighbour &neighbour : m_neighbours)
         if (covers(neighbour.address) && listensOn(neighbour.record, target.port) &&
-            !m_devices.findByMac(neighbour.macKey)) {
+            !m_devices.findByMac(neighbour.macKey))
             m_found.push_back({0, jsonText(neighbour.record)});
-        }
-    }
     std::size_t managed = 0;
     for (std::size_t i = 0; i < m_devices.size() && managed < maxManaged; ++i) {
         const Device &device = m_devices.at(i);

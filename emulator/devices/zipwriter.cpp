@@ -19,9 +19,8 @@ constexpr std::array<std::uint32_t, 256> crcTable() {
     std::array<std::uint32_t, 256> table{};
     for (std::uint32_t i = 0; i < table.size(); ++i) {
         std::uint32_t value = i;
-        for (int bit = 0; bit < 8; ++bit) {
+        for (int bit = 0; bit < 8; ++bit)
             value = (value >> 1) ^ ((value & 1) != 0 ? 0xedb88320U : 0);
-        }
         table[i] = value;
     }
     return table;
@@ -30,9 +29,8 @@ constexpr std::array<std::uint32_t, 256> crcTable() {
 std::uint32_t crcOf(const std::string &bytes) {
     static constexpr auto table = crcTable();
     std::uint32_t crc = 0xffffffffU;
-    for (const char byte : bytes) {
+    for (const char byte : bytes)
         crc = table[(crc ^ static_cast<unsigned char>(byte)) & 0xff] ^ (crc >> 8);
-    }
     return ~crc;
 }
 

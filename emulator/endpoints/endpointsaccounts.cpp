@@ -11,9 +11,8 @@ namespace {
 
 std::string newPassword(const Json &body, const char *name) {
     const auto password = plainPassword(textMember(body, name));
-    if (!password) {
+    if (!password)
         throw Refusal(Code::Malformed, std::string("\"") + name + "\" does not decipher");
-    }
     return *password;
 }
 
@@ -55,12 +54,10 @@ Answer changePassword(Service &service, const Call &call) {
     const auto old = plainPassword(textMember(call.body, "old"));
     const PasswordHash replacement = hashPassword(newPassword(call.body, "new"));
     const auto account = service.withModel([&](Model &model) { return model.accounts.find(email); });
-    if (!account) {
+    if (!account)
         throw Refusal(Code::UnknownId, "no such account");
-    }
-    if (!old || !passwordMatches(*old, account->password)) {
+    if (!old || !passwordMatches(*old, account->password))
         throw Refusal(Code::WrongOldPassword, "the old password is wrong");
-    }
     service.withModel([&](Model &model) {
         model.accounts.setPassword(email, replacement);
         model.log.add(nowMs(), "System", "Audit", "Password changed", account->email);

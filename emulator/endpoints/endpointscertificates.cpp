@@ -19,9 +19,8 @@ using FileWork = DeviceWork (CertificateFiles::*)(const Device &, const Json &) 
 Answer takeFiles(Service &service, const Call &call, const char *type, FileWork workFor,
                  bool needsAuthority) {
     const CertificateFiles files(call.files);
-    if (call.files.empty() || files.hasAuthority() != needsAuthority) {
+    if (call.files.empty() || files.hasAuthority() != needsAuthority)
         throw Refusal(Code::Malformed, "the form lacks a file or has one too many");
-    }
     UploadOrder order;
     order.account = call.session.account;
     order.taskId = filledTextMember(call.body, "tid");
@@ -55,18 +54,16 @@ std::int64_t looseNumber(const Json &body, const char *name, std::int64_t most) 
     const std::string text = value.is_string() ? value.get<std::string>() : jsonText(value);
     std::int64_t number = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (error != std::errc() || end != text.data() + text.size() || number < 1 || number > most) {
+    if (error != std::errc() || end != text.data() + text.size() || number < 1 || number > most)
         throw Refusal(Code::Malformed, std::string("\"") + name + "\" is no such number");
-    }
     return number;
 }
 
 /// The subject without its common name, as a certificate's text has it.
 std::string ownerText(const Json &body) {
     const std::string country = optionalText(body, "country");
-    if (!country.empty() && country.size() != 2) {
+    if (!country.empty() && country.size() != 2)
         throw Refusal(Code::Malformed, "\"country\" has two letters");
-    }
     struct Part {
         const char *member;
         const char *name;

@@ -18,19 +18,16 @@ Json storedCommands(Model &model) {
 
 void checkMethod(const Json &command) {
     const std::string method = optionalText(command, "method");
-    if (!method.empty() && method != "GET" && method != "POST") {
+    if (!method.empty() && method != "GET" && method != "POST")
         throw Refusal(Code::Malformed, "a command is sent with GET or POST");
-    }
 }
 
 void checkStored(const Json &commands) {
     for (const Json &command : commands) {
-        if (!command.is_object()) {
+        if (!command.is_object())
             throw Refusal(Code::Malformed, "a command is no object");
-        }
-        for (const char *name : {"cgiid", "name", "method", "command"}) {
+        for (const char *name : {"cgiid", "name", "method", "command"})
             filledTextMember(command, name);
-        }
         textMember(command, "description");
         checkMethod(command);
     }
@@ -40,9 +37,8 @@ Answer listCommands(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
     const Json all = service.withModel(&storedCommands);
     Json part = Json::array();
-    for (std::size_t i = page.start; i < all.size() && part.size() < page.count; ++i) {
+    for (std::size_t i = page.start; i < all.size() && part.size() < page.count; ++i)
         part.push_back(all[i]);
-    }
     return Answer::secret(jsonText(part));
 }
 
@@ -72,9 +68,8 @@ std::vector<std::string> commandsOf(const Json &body) {
             throw Refusal(Code::Malformed, "an element of \"cgis\" is no command");
         }
     }
-    if (commands.empty()) {
+    if (commands.empty())
         throw Refusal(Code::Malformed, "there is no command to run");
-    }
     return commands;
 }
 
@@ -93,9 +88,8 @@ Json answerAtOnce(Model &model, Device &device, const CommandSeries &series, Add
     case Outcome::Done:
         break;
     }
-    if (!series.action().empty()) {
+    if (!series.action().empty())
         model.engine.restart(device, series.action(), nowMs());
-    }
     return answer(200, "ok");
 }
 
@@ -110,11 +104,10 @@ Json runCommands(Service &service, const Call &call) {
                         [&](const Device &device) { return series.workFor(device, addresses); });
         Json answers = Json::array();
         Transaction transaction(model.store.database());
-        for (const Target &target : targets) {
+        for (const Target &target : targets)
             answers.push_back(target.taskId.empty()
                                   ? answerAtOnce(model, model.devices.get(target.id), series, addresses)
                                   : Json{{"id", target.id}, {"status", 0}, {"body", ""}});
-        }
         transaction.commit();
         return answers;
     });

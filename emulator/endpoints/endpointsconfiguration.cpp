@@ -13,9 +13,8 @@ Answer queryConfiguration(Service &service, const Call &call) {
     return Answer::plain(service.withModel([&](Model &model) {
         model.engine.settle(nowMs());
         const Device &device = model.devices.get(id);
-        if (!device.reachable || !isPermitted(device, Access::Authorized)) {
+        if (!device.reachable || !isPermitted(device, Access::Authorized))
             throw Refusal(Code::NoDeviceAnswer, "device " + id + " does not tell its configuration");
-        }
         return jsonText(configurationOf(device));
     }));
 }

@@ -15,9 +15,8 @@ int policyMask(const Json &body) {
     const std::string text = textMember(body, "type");
     int mask = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), mask);
-    if (error != std::errc() || end != text.data() + text.size() || mask < 0) {
+    if (error != std::errc() || end != text.data() + text.size() || mask < 0)
         throw Refusal(Code::Malformed, "\"type\" is no mask");
-    }
     return mask;
 }
 
@@ -44,17 +43,15 @@ Answer commitDeviceList(Service &service, const Call &call) {
     const Json &devices = arrayMember(call.body, "devices");
     service.withModel([&](Model &model) {
         const auto records = model.batches.take("devices " + call.session.session, stage, devices, nowMs());
-        if (records) {
+        if (records)
             commitDevices(model, *records);
-        }
     });
     return {};
 }
 
 void checkTimeout(const Json &body) {
-    if (integerMember(body, "timeout") <= 0) {
+    if (integerMember(body, "timeout") <= 0)
         throw Refusal(Code::Malformed, "\"timeout\" must be positive");
-    }
 }
 
 Answer scan(Service &service, const Call &call) {
@@ -87,9 +84,8 @@ Answer setPolicy(Service &service, const Call &call) {
     DeviceWork work;
     work.changes["d_policy"] = {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}};
     const std::string taskId = optionalText(call.body, "tid");
-    for (Target &target : targets) {
+    for (Target &target : targets)
         target.taskId = target.taskId.empty() ? taskId : target.taskId;
-    }
     order(service, targets, "devicePassPolicy", [&](const Device &) { return work; });
     return {};
 }
@@ -98,15 +94,13 @@ Answer authorize(Service &service, const Call &call) {
     const auto targets = targetsOf(call.body);
     const std::string account = filledTextMember(call.body, "acc");
     const auto password = plainPassword(textMember(call.body, "pass"));
-    if (!password) {
+    if (!password)
         throw Refusal(Code::Malformed, "\"pass\" does not decipher");
-    }
     service.withModel([&](Model &model) {
         checkKnown(model, targets);
         std::vector<std::string> ids;
-        for (const Target &target : targets) {
+        for (const Target &target : targets)
             ids.push_back(target.id);
-        }
         model.authorization.request(ids, account, *password, nowMs());
     });
     return {};

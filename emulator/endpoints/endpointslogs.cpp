@@ -11,9 +11,8 @@ std::int64_t timeMember(const Json &body, const char *name) {
     const std::string text = filledTextMember(body, name);
     std::int64_t time = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), time);
-    if (error != std::errc() || end != text.data() + text.size() || time < 0) {
+    if (error != std::errc() || end != text.data() + text.size() || time < 0)
         throw Refusal(Code::Malformed, std::string("\"") + name + "\" is no time");
-    }
     return time;
 }
 

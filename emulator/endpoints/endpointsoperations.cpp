@@ -12,9 +12,8 @@ namespace {
 
 std::vector<Target> underTask(const std::vector<std::string> &ids, const std::string &taskId) {
     std::vector<Target> targets;
-    for (const std::string &id : ids) {
+    for (const std::string &id : ids)
         targets.push_back({id, taskId});
-    }
     return targets;
 }
 

@@ -16,12 +16,10 @@ Answer signIn(Service &service, const Call &call) {
     const std::string password = plainPassword(filledTextMember(call.body, "login")).value_or("");
     const Orb::User user = service.withModel([&](Model &model) { return model.orb.user(email); });
     // The hash is slow on purpose, so it is computed outside of the lock.
-    if (!passwordMatches(password, user.password)) {
+    if (!passwordMatches(password, user.password))
         throw Refusal(Code::NotAccepted, "wrong e-mail or password");
-    }
-    if (user.expired) {
+    if (user.expired)
         throw Refusal(Code::NoMoreSessions, "the password has expired");
-    }
     service.withModel([&](Model &model) {
         model.orb.signIn(email, nowMs());
         note(model, call, "Signed in to the remote-access service as " + email);
@@ -64,9 +62,8 @@ Answer isAdded(Service &service, const Call &) {
 /// The state that holds afterwards travels as an object of its own, shaped like the one in the status.
 Answer setRemoteAccess(Service &service, const Call &call) {
     const Json &wanted = member(call.body, "enable");
-    if (!wanted.is_boolean()) {
+    if (!wanted.is_boolean())
         throw Refusal(Code::Malformed, "\"enable\" is no boolean");
-    }
     service.withModel([&](Model &model) {
         model.orb.setRemoteAccess(wanted.get<bool>());
         note(model, call, wanted.get<bool>() ? "Remote access switched on" : "Remote access switched off");

@@ -16,9 +16,8 @@ Answer login(Service &service, const Call &call) {
     const auto password = plainPassword(textMember(call.body, "pass"));
     const auto account = service.withModel([&](Model &model) { return model.accounts.find(email); });
     // The hash is slow on purpose, so it is computed outside of the lock.
-    if (!password || !account || !passwordMatches(*password, account->password)) {
+    if (!password || !account || !passwordMatches(*password, account->password))
         throw Refusal(Code::NotAccepted, "wrong e-mail or password");
-    }
     Answer answer;
     answer.token = service.withModel([&](Model &model) {
         std::string token = model.sessions.open(account->email, nowMs());
@@ -42,9 +41,8 @@ Answer getSettings(Service &service, const Call &) {
 
 Answer setSettings(Service &service, const Call &call) {
     service.withModel([&](Model &model) {
-        if (const std::string what = model.settings.change(call.body); !what.empty()) {
+        if (const std::string what = model.settings.change(call.body); !what.empty())
             model.log.add(nowMs(), "System", "Audit", "Settings changed: " + what, call.session.account);
-        }
         model.log.expire(nowMs(), model.settings.logDays());
     });
     return {};

@@ -42,9 +42,8 @@ Answer commitSiteList(Service &service, const Call &call) {
     const Json &sites = arrayMember(call.body, "sites");
     service.withModel([&](Model &model) {
         const auto records = model.batches.take("sites " + call.session.session, stage, sites, nowMs());
-        if (records) {
+        if (records)
             commitSites(model, *records);
-        }
     });
     return {};
 }

@@ -19,9 +19,8 @@ UploadOrder orderOf(const Call &call, const char *type) {
 }
 
 const UploadedFile &imageOf(const Call &call) {
-    if (call.files.size() != 1 || call.files.front().part != "fimage") {
+    if (call.files.size() != 1 || call.files.front().part != "fimage")
         throw Refusal(Code::Malformed, "the form needs one file, \"fimage\"");
-    }
     return call.files.front();
 }
 
@@ -63,9 +62,8 @@ Answer uploadPackage(Service &service, const Call &call) {
     UploadOrder order = orderOf(call, "devicePackageUpload");
     order.deviceIds = idsOf(targetsOf(call.body, "device_ids"));
     const Json &onCard = member(call.body, "sd_card");
-    if (!onCard.is_boolean()) {
+    if (!onCard.is_boolean())
         throw Refusal(Code::Malformed, "\"sd_card\" is no boolean");
-    }
     const UploadedFile &file = imageOf(call);
     startUpload(service, order, [&](const Device &device, const Json &) {
         return packageWork(file, onCard == true, device);

@@ -37,13 +37,11 @@ const std::unordered_map<std::string, Deed> &deeds() {
 
 std::string auditText(const std::string &path, const Json &body) {
     const auto deed = deeds().find(path);
-    if (deed == deeds().end()) {
+    if (deed == deeds().end())
         return {};
-    }
     const auto detail = body.find(deed->second.member);
-    if (detail == body.end()) {
+    if (detail == body.end())
         return deed->second.words;
-    }
     return std::string(deed->second.words) + ": " +
            (detail->is_string()  ? detail->get<std::string>()
             : detail->is_array() ? std::to_string(detail->size())

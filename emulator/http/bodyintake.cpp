@@ -43,46 +43,39 @@ BodyIntake::Result BodyIntake::readForm(const httplib::ContentReader &reader) {
 /// A body that is too long is still read to its end, or its sender would see a broken connection.
 bool BodyIntake::takeText(std::string_view bytes) {
     m_tooLong = m_tooLong || m_incoming.body.size() + bytes.size() > m_limits.text;
-    if (!m_tooLong) {
+    if (!m_tooLong)
         m_incoming.body.append(bytes);
-    }
     return true;
 }
 
 void BodyIntake::beginPart(const std::string &name, const std::string &fileName) {
-    if (name == parameterPart) {
+    if (name == parameterPart)
         return;
-    }
-    if (m_onParameters && !m_incoming.body.empty()) {
+    if (m_onParameters && !m_incoming.body.empty())
         std::exchange(m_onParameters, {})();
-    }
     m_file.emplace(name, fileName);
 }
 
 bool BodyIntake::takePart(std::string_view bytes) {
     m_size += bytes.size();
     m_tooLong = m_tooLong || m_size > m_limits.upload;
-    if (m_tooLong) {
+    if (m_tooLong)
         return true;
-    }
-    if (!m_file) {
+    if (!m_file)
         return takeText(bytes);
-    }
     m_file->take(bytes);
     return true;
 }
 
 void BodyIntake::endPart() {
-    if (!m_file) {
+    if (!m_file)
         return;
-    }
     UploadedFile file = m_file->finish();
     m_file.reset();
     m_headSize += file.head.size();
     m_tooLong = m_tooLong || m_headSize > maxKept;
-    if (!m_tooLong) {
+    if (!m_tooLong)
         m_incoming.files.push_back(std::move(file));
-    }
 }
 
 BodyIntake::Result BodyIntake::resultOf(bool whole) const {

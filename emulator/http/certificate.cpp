@@ -23,9 +23,8 @@ using Bio = std::unique_ptr<BIO, FreeBio>;
 constexpr long validSeconds = 10L * 365 * 24 * 3600;
 
 void require(bool done) {
-    if (!done) {
+    if (!done)
         throw std::runtime_error("the server's certificate cannot be made");
-    }
 }
 
 void nameIt(X509 *certificate) {

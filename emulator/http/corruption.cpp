@@ -17,9 +17,8 @@ Json otherType(const Json &value);
 /// Keeps the containers that hold the members and gives every member another type.
 Json membersSpoiled(const Json &value) {
     Json spoiled = value;
-    for (Json &element : spoiled) {
+    for (Json &element : spoiled)
         element = value.is_array() && element.is_object() ? membersSpoiled(element) : otherType(element);
-    }
     return spoiled;
 }
 
@@ -39,18 +38,16 @@ Json otherType(const Json &value) {
 }
 
 void spoilTypes(Answer &answer, const std::string &where) {
-    if (answer.data.empty()) {
+    if (answer.data.empty())
         return;
-    }
     const Json data = Json::parse(answer.data);
     const bool wholly = where == "data" || !data.is_structured();
     answer.data = jsonText(wholly ? otherType(data) : membersSpoiled(data));
 }
 
 void replaceFirst(std::string &text, std::string_view what, std::string_view with) {
-    if (const auto at = text.find(what); at != std::string::npos) {
+    if (const auto at = text.find(what); at != std::string::npos)
         text.replace(at, what.size(), with);
-    }
 }
 
 /// An envelope ends with its data, and a quote within its message is escaped.
@@ -70,15 +67,12 @@ void breakCipher(std::string &body) {
 } // namespace
 
 std::string spoiledBody(Answer answer, const Fault &fault) {
-    if (fault.kind == FaultKind::NotJson) {
+    if (fault.kind == FaultKind::NotJson)
         return "<html><body>Please sign in to this network.</body></html>";
-    }
-    if (answer.isFile) {
+    if (answer.isFile)
         return std::move(answer.data);
-    }
-    if (fault.kind == FaultKind::WrongTypes && fault.where != "code") {
+    if (fault.kind == FaultKind::WrongTypes && fault.where != "code")
         spoilTypes(answer, fault.where);
-    }
     std::string body = envelope(answer);
     if (fault.kind == FaultKind::WrongTypes && fault.where == "code") {
         const std::string code = std::to_string(answer.code);

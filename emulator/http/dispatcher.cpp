@@ -17,23 +17,19 @@ bool isJsonContentType(const std::string &type) {
 }
 
 void checkContentType(const IncomingRequest &incoming, Body body) {
-    if (body == Body::Form && !incoming.isForm) {
+    if (body == Body::Form && !incoming.isForm)
         throw Refusal(Code::Malformed, "the body is no form");
-    }
-    if (body == Body::Text && !isJsonContentType(incoming.contentType)) {
+    if (body == Body::Text && !isJsonContentType(incoming.contentType))
         throw Refusal(Code::Malformed, "the content type is not " + std::string(jsonContentType));
-    }
 }
 
 Json bodyOf(const Endpoint &endpoint, const IncomingRequest &incoming) {
-    if (incoming.verb != "POST") {
+    if (incoming.verb != "POST")
         return Json::object();
-    }
     checkContentType(incoming, endpoint.body);
     Json body = parseJson(incoming.body);
-    if (!body.is_object()) {
+    if (!body.is_object())
         throw Refusal(Code::Malformed, "the body is no object");
-    }
     return body;
 }
 
@@ -43,11 +39,9 @@ Dispatcher::Dispatcher(Service &service) : m_service(service) {
     for (const auto &family : {sessionEndpoints(), siteEndpoints(), deviceEndpoints(), accountEndpoints(),
                                taskEndpoints(), alarmEndpoints(), logEndpoints(), commandEndpoints(),
                                operationEndpoints(), configurationEndpoints(), exportEndpoints(),
-                               uploadEndpoints(), certificateEndpoints(), orbEndpoints()}) {
-        for (const Endpoint &endpoint : family) {
+                               uploadEndpoints(), certificateEndpoints(), orbEndpoints()})
+        for (const Endpoint &endpoint : family)
             m_endpoints.emplace(endpoint.path, endpoint);
-        }
-    }
 }
 
 const Endpoint *Dispatcher::find(const std::string &path) const {
@@ -70,9 +64,8 @@ Answer Dispatcher::granted(const Endpoint &endpoint, const IncomingRequest &inco
         m_service.withModel(
             [&](Model &model) { model.log.add(nowMs(), "System", "Audit", done, call.session.account); });
     }
-    if (endpoint.gate != Role::Anybody) {
+    if (endpoint.gate != Role::Anybody)
         renewToken(answer, incoming.authorization, alwaysRenew);
-    }
     return answer;
 }
 
@@ -80,11 +73,10 @@ Call Dispatcher::callOf(const Endpoint &endpoint, const IncomingRequest &incomin
     Call call;
     call.body = bodyOf(endpoint, incoming);
     call.files = incoming.files;
-    if (endpoint.gate != Role::Anybody) {
+    if (endpoint.gate != Role::Anybody)
         call.session = sessionOf(incoming, call.body, endpoint.gate);
-    } else if (!m_service.genericTokens().accepts(incoming.authorization, nowMs())) {
+    else if (!m_service.genericTokens().accepts(incoming.authorization, nowMs()))
         throw Refusal(Code::NotAccepted, "the token is not accepted");
-    }
     return call;
 }
 
@@ -93,15 +85,12 @@ SessionToken Dispatcher::sessionOf(const IncomingRequest &incoming, const Json &
     return m_service.withModel([&](Model &model) {
         const auto session = model.sessions.find(incoming.authorization, nowMs());
         const auto account = session ? model.accounts.find(session->account) : std::nullopt;
-        if (!account || !sameEmail(account->email, id)) {
+        if (!account || !sameEmail(account->email, id))
             throw Refusal(Code::NotAccepted, "no such session");
-        }
-        if (gate == Role::Writer && account->permission == "viewer") {
+        if (gate == Role::Writer && account->permission == "viewer")
             throw Refusal(Code::NotAllowed, "a viewer changes nothing");
-        }
-        if (gate == Role::Administrator && account->permission != "admin") {
+        if (gate == Role::Administrator && account->permission != "admin")
             throw Refusal(Code::NotAllowed, "only an administrator may do this");
-        }
         return *session;
     });
 }
@@ -111,9 +100,8 @@ SessionToken Dispatcher::sessionOf(const IncomingRequest &incoming, const Json &
 void Dispatcher::renewToken(Answer &answer, const std::string &authorization, bool always) {
     m_service.withModel([&](Model &model) {
         const auto token = model.sessions.find(authorization, nowMs());
-        if (token && token->isNewest() && (always || Sessions::isDueForRenewal(*token, nowMs()))) {
+        if (token && token->isNewest() && (always || Sessions::isDueForRenewal(*token, nowMs())))
             answer.token = model.sessions.renew(token->session, nowMs()).value_or(std::string());
-        }
     });
 }
 

@@ -39,9 +39,8 @@ template <typename Number>
 Number numberOf(std::string_view text, const char *what) {
     Number number{};
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (error != std::errc() || end != text.data() + text.size()) {
+    if (error != std::errc() || end != text.data() + text.size())
         throw FaultError(std::string(what) + " needs a number");
-    }
     return number;
 }
 
@@ -52,31 +51,26 @@ std::pair<std::string_view, std::string_view> splitAt(std::string_view text, cha
 }
 
 const KindName &kindOf(std::string_view name) {
-    for (const KindName &kind : kinds) {
-        if (kind.name == name) {
+    for (const KindName &kind : kinds)
+        if (kind.name == name)
             return kind;
-        }
-    }
     throw FaultError("unknown kind of fault \"" + std::string(name) + "\"");
 }
 
 void readValue(Fault &fault, const KindName &kind, std::string_view value) {
     const std::string name(kind.name);
-    if (kind.value == Value::None && !value.empty()) {
+    if (kind.value == Value::None && !value.empty())
         throw FaultError(name + " takes no value");
-    }
     if (kind.value == Value::Number) {
         fault.number = numberOf<int>(value, name.c_str());
         const bool isStatus = fault.kind == FaultKind::Status || fault.kind == FaultKind::Early;
-        if (fault.number < 0 || (isStatus && (fault.number < 200 || fault.number > 599))) {
+        if (fault.number < 0 || (isStatus && (fault.number < 200 || fault.number > 599)))
             throw FaultError(name + " takes no such number");
-        }
     }
     if (kind.value == Value::Where) {
         fault.where = value.empty() ? "members" : std::string(value);
-        if (fault.where != "members" && fault.where != "data" && fault.where != "code") {
+        if (fault.where != "members" && fault.where != "data" && fault.where != "code")
             throw FaultError(name + " knows members, data and code");
-        }
     }
 }
 
@@ -88,9 +82,8 @@ void readLimit(Fault &fault, std::string_view limit) {
         fault.times = numberOf<std::uint64_t>(value, "times");
     } else if (name == "rate") {
         fault.rate = numberOf<double>(value, "rate");
-        if (!(fault.rate >= 0 && fault.rate <= 1)) {
+        if (!(fault.rate >= 0 && fault.rate <= 1))
             throw FaultError("rate goes from 0 to 1");
-        }
     } else {
         throw FaultError("unknown limit \"" + std::string(name) + "\" of a fault");
     }
@@ -106,9 +99,8 @@ Fault readFault(const std::string &text) {
     Fault fault;
     fault.kind = kind.kind;
     fault.path = path;
-    if (head.find('@') != std::string_view::npos && !path.starts_with('/')) {
+    if (head.find('@') != std::string_view::npos && !path.starts_with('/'))
         throw FaultError("the path of a fault begins with \"/\"");
-    }
     readValue(fault, kind, value);
     while (!limits.empty()) {
         const auto [limit, rest] = splitAt(limits, ',');
@@ -136,27 +128,23 @@ FaultPlan Faults::planFor(const std::string &path) {
         // A fault that loses against an earlier one keeps its turns for later requests.
         const bool adds = fault.kind == FaultKind::Late || fault.kind == FaultKind::Renew ||
                           fault.kind == FaultKind::Expire || fault.kind == FaultKind::SlowBody;
-        if ((plan.main && !adds) || !hits(fault, path)) {
+        if ((plan.main && !adds) || !hits(fault, path))
             continue;
-        }
         plan.lateMs += fault.kind == FaultKind::Late ? fault.number : 0;
         plan.bodyRate = fault.kind == FaultKind::SlowBody ? fault.number : plan.bodyRate;
         plan.renew |= fault.kind == FaultKind::Renew;
         plan.expire |= fault.kind == FaultKind::Expire;
-        if (!adds) {
+        if (!adds)
             plan.main = fault;
-        }
     }
     return plan;
 }
 
 bool Faults::hits(Fault &fault, const std::string &path) {
-    if (!path.starts_with(fault.path) || ++fault.seen <= fault.after) {
+    if (!path.starts_with(fault.path) || ++fault.seen <= fault.after)
         return false;
-    }
-    if ((fault.times && fault.hits >= *fault.times) || !m_random.chance(fault.rate)) {
+    if ((fault.times && fault.hits >= *fault.times) || !m_random.chance(fault.rate))
         return false;
-    }
     ++fault.hits;
     return true;
 }

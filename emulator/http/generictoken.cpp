@@ -43,15 +43,13 @@ std::string trimmed(const std::string &text) {
 
 Key masterKey(const std::filesystem::path &folder) {
     const auto path = folder / "nvlcrypto.key";
-    if (!std::filesystem::exists(path)) {
+    if (!std::filesystem::exists(path))
         return keyOf(*fromHex(fingerprint("Norvell Device Manager")));
-    }
     std::ifstream file(path);
     const std::string text((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
     const auto bytes = fromHex(trimmed(text));
-    if (!bytes || bytes->size() != Key().size()) {
+    if (!bytes || bytes->size() != Key().size())
         throw std::runtime_error("the key file " + utf8(path) + " is malformed");
-    }
     return keyOf(*bytes);
 }
 
@@ -69,9 +67,8 @@ Key tokenKey(Key master) {
         OSSL_PARAM_construct_end(),
     };
     Key key;
-    if (!context || EVP_KDF_derive(context.get(), key.data(), key.size(), params) != 1) {
+    if (!context || EVP_KDF_derive(context.get(), key.data(), key.size(), params) != 1)
         throw std::runtime_error("the token key cannot be derived");
-    }
     return key;
 }
 
@@ -89,9 +86,8 @@ std::optional<std::string> fromBase64Url(std::string_view text) {
     int held = 0;
     for (const char c : text) {
         const int digit = urlDigit(c);
-        if (digit < 0) {
+        if (digit < 0)
             return std::nullopt;
-        }
         bits = (bits << 6) | static_cast<unsigned>(digit);
         held += 6;
         if (held >= 8) {
@@ -99,17 +95,15 @@ std::optional<std::string> fromBase64Url(std::string_view text) {
             bytes += static_cast<char>((bits >> held) & 0xffU);
         }
     }
-    if (held >= 6 || (bits & ((1U << held) - 1)) != 0) {
+    if (held >= 6 || (bits & ((1U << held) - 1)) != 0)
         return std::nullopt;
-    }
     return bytes;
 }
 
 std::int64_t timeOf(std::string_view bytes) {
     std::uint64_t time = 0;
-    for (std::size_t i = 0; i < 8; ++i) {
+    for (std::size_t i = 0; i < 8; ++i)
         time = (time << 8) | static_cast<unsigned char>(bytes[i]);
-    }
     return static_cast<std::int64_t>(time);
 }
 
@@ -119,20 +113,17 @@ GenericTokenJudge::GenericTokenJudge(const std::filesystem::path &keyFolder)
     : m_key(tokenKey(masterKey(keyFolder))) {}
 
 bool GenericTokenJudge::accepts(std::string_view token, std::int64_t nowMs) const {
-    if (token.substr(0, prefix.size()) != prefix) {
+    if (token.substr(0, prefix.size()) != prefix)
         return false;
-    }
     const auto bytes = fromBase64Url(token.substr(prefix.size()));
-    if (!bytes || bytes->size() != signedBytes + macBytes) {
+    if (!bytes || bytes->size() != signedBytes + macBytes)
         return false;
-    }
     unsigned char mac[EVP_MAX_MD_SIZE];
     unsigned length = 0;
     HMAC(EVP_sha256(), m_key.data(), static_cast<int>(m_key.size()),
          reinterpret_cast<const unsigned char *>(bytes->data()), signedBytes, mac, &length);
-    if (length != macBytes || CRYPTO_memcmp(mac, bytes->data() + signedBytes, macBytes) != 0) {
+    if (length != macBytes || CRYPTO_memcmp(mac, bytes->data() + signedBytes, macBytes) != 0)
         return false;
-    }
     const std::int64_t time = timeOf(*bytes);
     return time >= nowMs - windowMs && time <= nowMs + windowMs;
 }

@@ -68,9 +68,8 @@ HttpsServer::HttpsServer(Service &service, Faults &faults, const StopSignal &sto
       m_identity(std::move(identity)),
       m_dispatcher(std::make_unique<Dispatcher>(service)),
       m_server(std::make_unique<httplib::SSLServer>(m_identity.certificate.get(), m_identity.key.get())) {
-    if (!m_server->is_valid()) {
+    if (!m_server->is_valid())
         throw std::runtime_error("the HTTPS server cannot be set up");
-    }
     configure(*m_server);
     route();
 }
@@ -80,13 +79,11 @@ HttpsServer::~HttpsServer() = default;
 int HttpsServer::bind(const std::string &host, int port, int lastPort) {
     const bool any = port == 0;
     // A running client looks for the service where it was.
-    if (const int wanted = any ? lastPort : port; wanted != 0 && m_server->bind_to_port(host, wanted)) {
+    if (const int wanted = any ? lastPort : port; wanted != 0 && m_server->bind_to_port(host, wanted))
         return wanted;
-    }
     const int bound = any ? m_server->bind_to_any_port(host) : -1;
-    if (bound <= 0) {
+    if (bound <= 0)
         throw std::runtime_error("cannot listen on " + host + ":" + std::to_string(port));
-    }
     return bound;
 }
 
@@ -95,9 +92,8 @@ void HttpsServer::serve() {
 }
 
 void HttpsServer::waitUntilServing() const {
-    while (!m_server->is_running()) {
+    while (!m_server->is_running())
         std::this_thread::sleep_for(std::chrono::milliseconds(1));
-    }
 }
 
 void HttpsServer::stop() {
@@ -179,23 +175,19 @@ BodyIntake::Result HttpsServer::readBody(const httplib::Request &request,
 void HttpsServer::judge(const httplib::Request &request, httplib::Response &response,
                         const IncomingRequest &incoming, const FaultPlan &plan) {
     const int delay = m_latencyMs + plan.lateMs;
-    if (delay > 0 && m_stop.waitFor(std::chrono::milliseconds(delay))) {
+    if (delay > 0 && m_stop.waitFor(std::chrono::milliseconds(delay)))
         return fail(response, 503, "the service stops");
-    }
-    if (plan.expire) {
+    if (plan.expire)
         m_service.withModel([](Model &model) { model.sessions.closeAll(); });
-    }
-    if (plan.main && plan.main->kind == FaultKind::NoAnswer) {
+    if (plan.main && plan.main->kind == FaultKind::NoAnswer)
         return holdUnanswered(request, m_stop);
-    }
     if (plan.main && plan.main->kind == FaultKind::Status) {
         response.status = plan.main->number;
         return response.set_content(envelope({}), jsonType);
     }
     const Endpoint *endpoint = m_dispatcher->find(incoming.path);
-    if (!endpoint) {
+    if (!endpoint)
         return fail(response, 404, "no such path");
-    }
     if (endpoint->verb != incoming.verb) {
         response.set_header("Allow", endpoint->verb);
         return fail(response, 405, "no such verb here");
@@ -205,24 +197,21 @@ void HttpsServer::judge(const httplib::Request &request, httplib::Response &resp
 
 void HttpsServer::answer(const httplib::Request &request, httplib::Response &response,
                          const IncomingRequest &incoming, const FaultPlan &plan) {
-    if (plan.main && plan.main->kind == FaultKind::AnswerCode) {
+    if (plan.main && plan.main->kind == FaultKind::AnswerCode)
         return response.set_content(envelope(Answer::refused(plan.main->number, "fault")), jsonType);
-    }
     Answer answer = m_dispatcher->answer(*m_dispatcher->find(incoming.path), incoming, plan.renew);
-    if (!answer.token.empty()) {
+    if (!answer.token.empty())
         response.set_header("Authorization", answer.token);
-    }
     const char *type = answer.isFile ? fileType : jsonType;
     std::string body = plan.main       ? spoiledBody(std::move(answer), *plan.main)
                        : answer.isFile ? std::move(answer.data)
                                        : envelope(answer);
-    if (plan.main && plan.main->kind == FaultKind::Reset) {
+    if (plan.main && plan.main->kind == FaultKind::Reset)
         deliverHalf(request, response, std::move(body), type);
-    } else if (plan.main && plan.main->kind == FaultKind::Drip) {
+    else if (plan.main && plan.main->kind == FaultKind::Drip)
         deliverDripping(response, std::move(body), type, m_stop);
-    } else {
+    else
         response.set_content(std::move(body), type);
-    }
 }
 
 } // namespace emulator

@@ -23,9 +23,8 @@ bool nestsTooDeeply(std::string_view text) {
         } else if (c == '"') {
             quoted = true;
         } else if (c == '[' || c == '{') {
-            if (++depth > deepest) {
+            if (++depth > deepest)
                 return true;
-            }
         } else if (c == ']' || c == '}') {
             --depth;
         }
@@ -40,13 +39,11 @@ bool nestsTooDeeply(std::string_view text) {
 } // namespace
 
 Json parseJson(std::string_view text) {
-    if (nestsTooDeeply(text)) {
+    if (nestsTooDeeply(text))
         throw Refusal(Code::Malformed, "the body nests too deeply");
-    }
     Json value = Json::parse(text, nullptr, false);
-    if (value.is_discarded()) {
+    if (value.is_discarded())
         throw Refusal(Code::Malformed, "the body is not JSON");
-    }
     return value;
 }
 
@@ -56,50 +53,44 @@ std::string jsonText(const Json &value) {
 
 const Json &member(const Json &object, const char *name) {
     const auto found = object.find(name);
-    if (found == object.end()) {
+    if (found == object.end())
         refuseMember(name);
-    }
     return *found;
 }
 
 std::string textMember(const Json &object, const char *name) {
     const Json &value = member(object, name);
-    if (!value.is_string()) {
+    if (!value.is_string())
         refuseMember(name);
-    }
     return value.get<std::string>();
 }
 
 std::string filledTextMember(const Json &object, const char *name) {
     std::string text = textMember(object, name);
-    if (text.empty()) {
+    if (text.empty())
         refuseMember(name);
-    }
     return text;
 }
 
 std::int64_t integerMember(const Json &object, const char *name) {
     const Json &value = member(object, name);
-    if (!value.is_number_integer()) {
+    if (!value.is_number_integer())
         refuseMember(name);
-    }
     return value.get<std::int64_t>();
 }
 
 const Json &arrayMember(const Json &object, const char *name) {
     const Json &value = member(object, name);
-    if (!value.is_array()) {
+    if (!value.is_array())
         refuseMember(name);
-    }
     return value;
 }
 
 std::vector<std::string> textsMember(const Json &body, const char *name) {
     std::vector<std::string> texts;
     for (const Json &element : arrayMember(body, name)) {
-        if (!element.is_string()) {
+        if (!element.is_string())
             throw Refusal(Code::Malformed, std::string("\"") + name + "\" holds something else than texts");
-        }
         texts.push_back(element.get<std::string>());
     }
     return texts;
@@ -107,21 +98,18 @@ std::vector<std::string> textsMember(const Json &body, const char *name) {
 
 std::string optionalText(const Json &object, const char *name) {
     const auto found = object.find(name);
-    if (found == object.end() || found->is_null()) {
+    if (found == object.end() || found->is_null())
         return {};
-    }
     return textMember(object, name);
 }
 
 Page pageOf(const Json &body) {
     const std::int64_t start = integerMember(body, "start");
     const std::int64_t count = integerMember(body, "count");
-    if (start < 0) {
+    if (start < 0)
         refuseMember("start");
-    }
-    if (count < 0) {
+    if (count < 0)
         refuseMember("count");
-    }
     return {static_cast<std::size_t>(start), static_cast<std::size_t>(std::min(count, maxPageSize))};
 }
 

@@ -24,17 +24,15 @@ Sessions::Sessions(Store &store, SessionLimits limits) : m_store(store), m_limit
 
 std::string Sessions::open(const std::string &account, std::int64_t nowMs) {
     dropEnded(nowMs);
-    if (m_limits.sessions != 0 && count() >= m_limits.sessions) {
+    if (m_limits.sessions != 0 && count() >= m_limits.sessions)
         throw Refusal(Code::NoMoreSessions, "no more sessions");
-    }
     return issue(newSessionToken(), account, nowMs);
 }
 
 std::optional<SessionToken> Sessions::find(const std::string &token, std::int64_t nowMs) {
     const auto found = m_tokens.find(fingerprint(token));
-    if (found == m_tokens.end() || hasEnded(found->second, nowMs)) {
+    if (found == m_tokens.end() || hasEnded(found->second, nowMs))
         return std::nullopt;
-    }
     return found->second;
 }
 
@@ -54,9 +52,8 @@ std::optional<std::string> Sessions::renew(const std::string &session, std::int6
             }
         }
     }
-    if (account.empty()) {
+    if (account.empty())
         return std::nullopt;
-    }
     dropEnded(nowMs);
     std::string fresh = issue(session, account, nowMs);
     transaction.commit();
@@ -97,9 +94,8 @@ template <typename Condition>
 void Sessions::dropWhere(Condition condition) {
     Transaction transaction(m_store.database());
     std::erase_if(m_tokens, [&](const auto &entry) {
-        if (!condition(entry.second)) {
+        if (!condition(entry.second))
             return false;
-        }
         m_store.removeToken(entry.first);
         return true;
     });

@@ -14,9 +14,8 @@ namespace emulator {
 namespace {
 
 void require(bool done) {
-    if (!done) {
+    if (!done)
         throw std::runtime_error("a file cannot be hashed");
-    }
 }
 
 } // namespace
@@ -47,17 +46,14 @@ UploadedFile localFile(const std::filesystem::path &path, const std::string &nam
     std::error_code ignored;
     std::ifstream file;
     // A pipe or a device would be read for ever.
-    if (std::filesystem::is_regular_file(path, ignored)) {
+    if (std::filesystem::is_regular_file(path, ignored))
         file.open(path, std::ios::binary);
-    }
-    if (!file.is_open()) {
+    if (!file.is_open())
         throw Refusal(Code::Malformed, "the local file cannot be read");
-    }
     FileIntake intake("fimage", name);
     std::vector<char> piece(1U << 18);
-    while (file.read(piece.data(), static_cast<std::streamsize>(piece.size())) || file.gcount() > 0) {
+    while (file.read(piece.data(), static_cast<std::streamsize>(piece.size())) || file.gcount() > 0)
         intake.take({piece.data(), static_cast<std::size_t>(file.gcount())});
-    }
     return intake.finish();
 }
 

@@ -71,9 +71,8 @@ void addCertificate(Json &facts, Random &random, const std::string &hostName) {
     }
     const bool portSecurity = random.chance(0.1);
     facts["ieee8021x_enable"] = portSecurity;
-    if (portSecurity) {
+    if (portSecurity)
         facts["d_8021x_expires"] = middle + (days + 30) * dayMs;
-    }
 }
 
 /// A MAC that is none counts as 0; its device is as good as any other.
@@ -127,11 +126,9 @@ Appearance appearanceOf(std::uint64_t seed, std::uint64_t n) {
 
 void fillDetails(Json &record, const std::string &hostName) {
     Json facts = factsOf(textOr(record, "d_mac"), textOr(record, "d_model"), hostName);
-    for (auto &[name, value] : facts.items()) {
-        if (!record.contains(name)) {
+    for (auto &[name, value] : facts.items())
+        if (!record.contains(name))
             record[name] = std::move(value);
-        }
-    }
 }
 
 std::string classOf(const std::string &model) {

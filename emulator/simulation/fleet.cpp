@@ -47,16 +47,14 @@ struct SiteNode {
 class SiteMaker {
 public:
     SiteMaker(std::size_t count, std::uint64_t seed) : m_random(mixed(seed ^ 0x517e)) {
-        for (std::size_t i = 0; i < count; ++i) {
+        for (std::size_t i = 0; i < count; ++i)
             i < sketches.size() ? addSketch(sketches[i]) : addInvented();
-        }
     }
 
     std::vector<Site> take() const {
         std::vector<Site> sites;
-        for (const SiteNode &node : m_nodes) {
+        for (const SiteNode &node : m_nodes)
             sites.push_back(node.site);
-        }
         return sites;
     }
 
@@ -77,11 +75,10 @@ private:
 
     void addInvented() {
         const SiteNode *parent = nullptr;
-        if (!m_random.chance(0.05)) {
+        if (!m_random.chance(0.05))
             do {
                 parent = &m_nodes[m_random.below(m_nodes.size())];
             } while (parent->level == maxDepth);
-        }
         const auto &names = levelNames[static_cast<std::size_t>(parent ? parent->level : 0)];
         add(parent,
             std::string(names[m_random.below(names.size())]) + ' ' + std::to_string(m_nodes.size() + 1));
@@ -93,9 +90,8 @@ private:
 
 std::string slugOf(const std::string &name) {
     std::string slug;
-    for (const char c : name) {
+    for (const char c : name)
         slug += c == ' ' ? '-' : c >= 'A' && c <= 'Z' ? static_cast<char>(c | 0x20) : c;
-    }
     return slug;
 }
 
@@ -129,9 +125,8 @@ public:
         const std::string host = chooseSites(device, random);
         chooseState(device, random);
         Json record = firstRecord(appearance);
-        if (device.authorization == Authorization::Authorized) {
+        if (device.authorization == Authorization::Authorized)
             fillDetails(record, host);
-        }
         setRecord(device, std::move(record));
         m_model.devices.add(std::move(device));
     }
@@ -139,15 +134,13 @@ public:
 private:
     std::string chooseSites(Device &device, Random &random) {
         const auto &sites = m_model.sites.all();
-        if (!m_inSites || sites.empty() || random.chance(0.08)) {
+        if (!m_inSites || sites.empty() || random.chance(0.08))
             return numbered(placeWithoutSite(random), ++m_hostNumbers.back());
-        }
         const std::size_t first = random.below(sites.size());
         device.sites.push_back(sites[first].id);
         const std::size_t second = random.below(sites.size());
-        if (second != first && random.chance(0.1)) {
+        if (second != first && random.chance(0.1))
             device.sites.push_back(sites[second].id);
-        }
         const std::size_t number = ++m_hostNumbers[first];
         return numbered(random.chance(0.01) ? placeWithoutSite(random) : slugOf(sites[first].name), number);
     }
@@ -170,13 +163,11 @@ private:
 
 std::vector<std::uint32_t> shuffledAddresses(std::size_t count, std::uint64_t seed) {
     std::vector<std::uint32_t> addresses(count);
-    for (std::size_t i = 0; i < count; ++i) {
+    for (std::size_t i = 0; i < count; ++i)
         addresses[i] = static_cast<std::uint32_t>(i);
-    }
     Random random(mixed(seed ^ 0xadd7));
-    for (std::size_t i = count; i > 1; --i) {
+    for (std::size_t i = count; i > 1; --i)
         std::swap(addresses[i - 1], addresses[random.below(i)]);
-    }
     return addresses;
 }
 
@@ -187,12 +178,10 @@ void makeFleet(Model &model, const FleetPlan &plan) {
     model.sites.replaceAll(SiteMaker(plan.sites, plan.seed).take());
     DeviceFactory factory(model, plan.seed, true);
     const auto addresses = shuffledAddresses(plan.devices, plan.seed);
-    for (std::size_t n = 0; n < plan.devices; ++n) {
+    for (std::size_t n = 0; n < plan.devices; ++n)
         factory.make(n, addresses[n]);
-    }
-    if (plan.oddRecords) {
+    if (plan.oddRecords)
         addOddRecords(model.devices);
-    }
     model.fleetWasMade(plan.seed, plan.devices);
     transaction.commit();
 }
@@ -201,9 +190,8 @@ void addDevices(Model &model, std::size_t count) {
     Transaction transaction(model.store.database());
     const std::uint64_t made = model.devicesMade();
     DeviceFactory factory(model, model.seed(), false);
-    for (std::uint64_t n = made; n < made + count; ++n) {
+    for (std::uint64_t n = made; n < made + count; ++n)
         factory.make(n, static_cast<std::uint32_t>(n));
-    }
     model.fleetWasMade(model.seed(), made + count);
     transaction.commit();
 }

@@ -48,9 +48,8 @@ void FleetSimulator::tick() {
 void FleetSimulator::resume() {
     for (std::size_t i = 0; i < m_model.devices.size(); ++i) {
         const Device &device = m_model.devices.at(i);
-        if (!device.reachable && !device.held) {
+        if (!device.reachable && !device.held)
             after(1 + draw(100), {device.id, {}});
-        }
     }
 }
 
@@ -58,9 +57,8 @@ void FleetSimulator::takeTurns() {
     for (auto due = m_turns.begin(); due != m_turns.end() && due->first <= m_tick; due = m_turns.erase(due)) {
         for (const Turn &turn : due->second) {
             Device *device = m_model.devices.find(turn.device);
-            if (!device) {
+            if (!device)
                 continue;
-            }
             if (!turn.action.empty()) {
                 // A command may have given the device something else to do meanwhile.
                 device->action = device->action == turn.action ? standby : device->action;
@@ -122,9 +120,8 @@ void FleetSimulator::raise(AlarmKind kind, const Device &device) {
 Device *FleetSimulator::pickIdle() {
     for (int tries = 0; tries < maxTries && m_model.devices.size() != 0; ++tries) {
         Device &device = m_model.devices.at(draw(m_model.devices.size()));
-        if (device.reachable && !device.held && device.action == standby) {
+        if (device.reachable && !device.held && device.action == standby)
             return &device;
-        }
     }
     return nullptr;
 }

@@ -29,9 +29,8 @@ std::int64_t timeOf(std::size_t number, std::size_t count, std::int64_t days, Ra
 class HistoryMaker {
 public:
     explicit HistoryMaker(Model &model) : m_model(model), m_random(mixed(model.seed() ^ 0x4157)) {
-        for (const Account &account : model.accounts.all()) {
+        for (const Account &account : model.accounts.all())
             m_users.push_back(account.email);
-        }
         m_users.insert(m_users.end(), {"day@example.net", "night@example.net"});
         m_identities.resize(model.devices.size());
     }
@@ -97,9 +96,8 @@ private:
             const int progress = state == state::done ? 100 : static_cast<int>(m_random.below(100));
             sum += static_cast<std::size_t>(progress);
             std::string &identity = m_identities[(first + i) % size];
-            if (identity.empty()) {
+            if (identity.empty())
                 identity = identityText(m_model.devices.at((first + i) % size));
-            }
             appendEntry(task.devicesText, identity, state, progress);
         }
         task.devicesText += ']';
@@ -117,15 +115,12 @@ private:
 void makeHistory(Model &model, const HistoryPlan &plan) {
     Transaction transaction(model.store.database());
     HistoryMaker maker(model);
-    for (std::size_t i = 0; i < plan.tasks; ++i) {
+    for (std::size_t i = 0; i < plan.tasks; ++i)
         maker.addTask(timeOf(i, plan.tasks, taskDays, maker.random()), plan.taskDevices);
-    }
-    for (std::size_t i = 0; i < plan.alarms; ++i) {
+    for (std::size_t i = 0; i < plan.alarms; ++i)
         maker.addAlarm(timeOf(i, plan.alarms, alarmDays, maker.random()));
-    }
-    for (std::size_t i = 0; i < plan.logEntries; ++i) {
+    for (std::size_t i = 0; i < plan.logEntries; ++i)
         maker.addLogEntry(timeOf(i, plan.logEntries, logDays, maker.random()));
-    }
     transaction.commit();
 }
 

@@ -14,9 +14,8 @@ std::optional<std::uint32_t> addressNumber(const std::string &text) {
         std::uint8_t value = 0;
         const auto [rest, error] = std::from_chars(at, end, value);
         const bool isFollowed = part == 3 ? rest == end : rest != end && *rest == '.';
-        if (error != std::errc() || isPadded || !isFollowed) {
+        if (error != std::errc() || isPadded || !isFollowed)
             return std::nullopt;
-        }
         number = number << 8 | value;
         at = part == 3 ? rest : rest + 1;
     }
@@ -25,9 +24,8 @@ std::optional<std::uint32_t> addressNumber(const std::string &text) {
 
 std::string addressText(std::uint32_t number) {
     std::string text;
-    for (int shift = 24; shift >= 0; shift -= 8) {
+    for (int shift = 24; shift >= 0; shift -= 8)
         text += std::to_string(number >> shift & 0xff) + (shift > 0 ? "." : "");
-    }
     return text;
 }
 

@@ -21,9 +21,8 @@ Json soundRecord(std::uint64_t n) {
 }
 
 void spoil(Json &record, const Json &oddities) {
-    for (const auto &[name, value] : oddities.items()) {
+    for (const auto &[name, value] : oddities.items())
         record[name] = value;
-    }
 }
 
 Json wrongTypes() {

@@ -46,34 +46,27 @@ void Accounts::addFactoryAccount(PasswordHash password) {
 }
 
 void Accounts::add(Account account) {
-    if (!isPermission(account.permission)) {
+    if (!isPermission(account.permission))
         throw Refusal(Code::Malformed, "unknown permission");
-    }
-    if (find(account.email)) {
+    if (find(account.email))
         throw Refusal(Code::EmailTaken, "the e-mail is taken");
-    }
     const bool first = isFactoryFresh();
-    if (first && account.permission != "admin") {
+    if (first && account.permission != "admin")
         throw Refusal(Code::Malformed, "the first account must be an administrator");
-    }
     Transaction transaction(m_store.database());
-    if (first) {
+    if (first)
         m_store.removeAccount(factoryEmail);
-    }
     m_store.saveAccount(account);
     transaction.commit();
-    if (first) {
+    if (first)
         m_accounts.clear();
-    }
     m_accounts.push_back(std::move(account));
 }
 
 Account &Accounts::get(const std::string &email) {
-    for (Account &account : m_accounts) {
-        if (sameEmail(account.email, email)) {
+    for (Account &account : m_accounts)
+        if (sameEmail(account.email, email))
             return account;
-        }
-    }
     throw Refusal(Code::UnknownId, "no such account");
 }
 
@@ -85,15 +78,13 @@ void Accounts::setPassword(const std::string &email, PasswordHash password) {
 
 void Accounts::setPermission(const std::string &email, const std::string &permission) {
     Account &account = get(email);
-    if (!isPermission(permission)) {
+    if (!isPermission(permission))
         throw Refusal(Code::Malformed, "unknown permission");
-    }
     const bool anotherAdministrator =
         std::any_of(m_accounts.begin(), m_accounts.end(),
                     [&](const Account &other) { return &other != &account && other.permission == "admin"; });
-    if (permission != "admin" && !anotherAdministrator) {
+    if (permission != "admin" && !anotherAdministrator)
         throw Refusal(Code::NotAllowed, "an administrator has to remain");
-    }
     account.permission = permission;
     m_store.saveAccount(account);
 }

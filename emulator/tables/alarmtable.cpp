@@ -77,15 +77,13 @@ void AlarmTable::add(AlarmKind kind, const Device *device, const std::string &na
 
 void AlarmTable::remove(const std::vector<std::string> &ids) {
     std::unordered_map<std::string, std::int64_t> rows;
-    for (const RecordList::Record &alarm : m_alarms.all()) {
+    for (const RecordList::Record &alarm : m_alarms.all())
         rows.emplace(idOf(alarm.row), alarm.row);
-    }
     std::unordered_set<std::int64_t> wanted;
     for (const std::string &id : ids) {
         const auto found = rows.find(id);
-        if (found == rows.end()) {
+        if (found == rows.end())
             throw Refusal(Code::UnknownId, "no alarm " + id);
-        }
         wanted.insert(found->second);
     }
     m_alarms.remove(wanted);
@@ -96,9 +94,8 @@ std::string AlarmTable::pageText(Page page) const {
     const std::size_t first = std::min(page.start, all.size());
     const std::size_t last = first + std::min(page.count, all.size() - first);
     std::string text = R"({"items":[)";
-    for (std::size_t i = first; i < last; ++i) {
+    for (std::size_t i = first; i < last; ++i)
         text += (i == first ? "" : ",") + all[all.size() - 1 - i].body;
-    }
     return text + R"(],"total_items":)" + std::to_string(all.size()) + '}';
 }
 

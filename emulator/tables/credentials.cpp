@@ -29,9 +29,8 @@ std::optional<std::string> call(Operation operation, std::string_view input) {
     char *raw = nullptr;
     const int failed = operation(input.data(), input.size(), &raw);
     const CipherText text(raw);
-    if (failed != 0 || !text) {
+    if (failed != 0 || !text)
         return std::nullopt;
-    }
     return std::string(text.get());
 }
 
@@ -45,9 +44,8 @@ const unsigned char *bytesOf(std::string_view text) {
 
 std::string randomBytes(std::size_t count) {
     std::string bytes(count, '\0');
-    if (RAND_bytes(bytesOf(bytes), static_cast<int>(count)) != 1) {
+    if (RAND_bytes(bytesOf(bytes), static_cast<int>(count)) != 1)
         throw std::runtime_error("no random bytes");
-    }
     return bytes;
 }
 
@@ -55,9 +53,8 @@ std::string stretched(std::string_view password, std::string_view salt, int roun
     std::string hash(hashBytes, '\0');
     if (PKCS5_PBKDF2_HMAC(password.data(), static_cast<int>(password.size()), bytesOf(salt),
                           static_cast<int>(salt.size()), rounds, EVP_sha256(), static_cast<int>(hashBytes),
-                          bytesOf(hash)) != 1) {
+                          bytesOf(hash)) != 1)
         throw std::runtime_error("a password cannot be hashed");
-    }
     return hash;
 }
 
@@ -67,9 +64,8 @@ PasswordHash hashed(std::string_view password, int rounds) {
 }
 
 int hexDigit(char c) {
-    if (c >= '0' && c <= '9') {
+    if (c >= '0' && c <= '9')
         return c - '0';
-    }
     const char lower = static_cast<char>(c | 0x20);
     return lower >= 'a' && lower <= 'f' ? lower - 'a' + 10 : -1;
 }
@@ -82,9 +78,8 @@ std::optional<std::string> plainPassword(std::string_view cipher) {
 
 std::string cipheredData(std::string_view plain) {
     auto text = call(&dataToCypher, plain);
-    if (!text) {
+    if (!text)
         throw std::runtime_error("the answer's data cannot be ciphered");
-    }
     return std::move(*text);
 }
 
@@ -102,9 +97,8 @@ PasswordHash hashPassword(std::string_view password) {
 bool passwordMatches(std::string_view password, const PasswordHash &known) {
     const auto salt = fromHex(known.salt);
     const auto hash = fromHex(known.hash);
-    if (!salt || !hash || hash->size() != hashBytes || known.rounds <= 0) {
+    if (!salt || !hash || hash->size() != hashBytes || known.rounds <= 0)
         return false;
-    }
     const std::string offered = stretched(password, *salt, known.rounds);
     return CRYPTO_memcmp(offered.data(), hash->data(), hashBytes) == 0;
 }
@@ -132,9 +126,8 @@ std::string newSessionToken() {
     int held = 0;
     for (const char byte : randomBytes(32)) {
         bits = (bits << 8) | static_cast<unsigned char>(byte);
-        for (held += 8; held >= 6; held -= 6) {
+        for (held += 8; held >= 6; held -= 6)
             token += alphabet[(bits >> (held - 6)) & 63U];
-        }
     }
     token += alphabet[(bits << (6 - held)) & 63U];
     return token;
@@ -143,9 +136,8 @@ std::string newSessionToken() {
 std::string fingerprint(std::string_view text) {
     std::string digest(hashBytes, '\0');
     unsigned length = 0;
-    if (EVP_Digest(text.data(), text.size(), bytesOf(digest), &length, EVP_sha256(), nullptr) != 1) {
+    if (EVP_Digest(text.data(), text.size(), bytesOf(digest), &length, EVP_sha256(), nullptr) != 1)
         throw std::runtime_error("a token cannot be hashed");
-    }
     return toHex(digest);
 }
 
@@ -161,16 +153,14 @@ std::string toHex(std::string_view bytes) {
 }
 
 std::optional<std::string> fromHex(std::string_view hex) {
-    if (hex.size() % 2 != 0) {
+    if (hex.size() % 2 != 0)
         return std::nullopt;
-    }
     std::string bytes;
     for (std::size_t i = 0; i < hex.size(); i += 2) {
         const int high = hexDigit(hex[i]);
         const int low = hexDigit(hex[i + 1]);
-        if (high < 0 || low < 0) {
+        if (high < 0 || low < 0)
             return std::nullopt;
-        }
         bytes += static_cast<char>(high * 16 + low);
     }
     return bytes;

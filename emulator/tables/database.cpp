@@ -29,16 +29,14 @@ Database::~Database() {
 }
 
 void Database::run(const char *sql) {
-    if (sqlite3_exec(m_handle, sql, nullptr, nullptr, nullptr) != SQLITE_OK) {
+    if (sqlite3_exec(m_handle, sql, nullptr, nullptr, nullptr) != SQLITE_OK)
         throw DatabaseError(std::string("the store refuses: ") + sqlite3_errmsg(m_handle));
-    }
 }
 
 Statement::Statement(const Database &database, const char *sql) : m_database(database.handle()) {
     if (sqlite3_prepare_v3(m_database, sql, -1, SQLITE_PREPARE_PERSISTENT, &m_statement, nullptr) !=
-        SQLITE_OK) {
+        SQLITE_OK)
         fail();
-    }
 }
 
 Statement::~Statement() {
@@ -46,25 +44,22 @@ Statement::~Statement() {
 }
 
 Statement &Statement::bind(std::int64_t value) {
-    if (sqlite3_bind_int64(m_statement, ++m_bound, value) != SQLITE_OK) {
+    if (sqlite3_bind_int64(m_statement, ++m_bound, value) != SQLITE_OK)
         fail();
-    }
     return *this;
 }
 
 Statement &Statement::bind(std::string_view text) {
     const char *data = text.data() ? text.data() : "";
-    if (sqlite3_bind_text64(m_statement, ++m_bound, data, text.size(), nullptr, SQLITE_UTF8) != SQLITE_OK) {
+    if (sqlite3_bind_text64(m_statement, ++m_bound, data, text.size(), nullptr, SQLITE_UTF8) != SQLITE_OK)
         fail();
-    }
     return *this;
 }
 
 bool Statement::step() {
     const int result = sqlite3_step(m_statement);
-    if (result != SQLITE_ROW && result != SQLITE_DONE) {
+    if (result != SQLITE_ROW && result != SQLITE_DONE)
         fail();
-    }
     return result == SQLITE_ROW;
 }
 
@@ -97,21 +92,18 @@ void Statement::fail() {
 
 Transaction::Transaction(Database &database)
     : m_database(database), m_outermost(sqlite3_get_autocommit(database.handle()) != 0) {
-    if (m_outermost) {
+    if (m_outermost)
         m_database.run("BEGIN IMMEDIATE");
-    }
 }
 
 Transaction::~Transaction() {
-    if (m_outermost && m_open) {
+    if (m_outermost && m_open)
         sqlite3_exec(m_database.handle(), "ROLLBACK", nullptr, nullptr, nullptr);
-    }
 }
 
 void Transaction::commit() {
-    if (m_outermost) {
+    if (m_outermost)
         m_database.run("COMMIT");
-    }
     m_open = false;
 }
 

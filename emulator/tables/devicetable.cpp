@@ -54,9 +54,8 @@ Device *DeviceTable::findByMac(const std::string &macKey) const {
 
 Device &DeviceTable::get(const std::string &id) const {
     Device *device = find(id);
-    if (!device) {
+    if (!device)
         throw Refusal(Code::UnknownId, "no device " + id);
-    }
     return *device;
 }
 
@@ -93,18 +92,15 @@ void DeviceTable::setSecret(Device &device, const std::string &secret) {
 }
 
 void DeviceTable::remove(const std::unordered_set<std::string> &ids) {
-    if (ids.empty()) {
+    if (ids.empty())
         return;
-    }
     Transaction transaction(m_store.database());
-    for (const std::string &id : ids) {
+    for (const std::string &id : ids)
         m_store.removeDevice(id);
-    }
     transaction.commit();
     std::erase_if(m_devices, [&](const std::unique_ptr<Device> &device) {
-        if (!ids.contains(device->id)) {
+        if (!ids.contains(device->id))
             return false;
-        }
         m_byId.erase(device->id);
         m_byMac.erase(device->macKey);
         return true;
@@ -112,16 +108,12 @@ void DeviceTable::remove(const std::unordered_set<std::string> &ids) {
 }
 
 void DeviceTable::leaveSites(const std::unordered_set<std::string> &sites) {
-    if (sites.empty()) {
+    if (sites.empty())
         return;
-    }
     Transaction transaction(m_store.database());
-    for (const auto &device : m_devices) {
-        if (std::erase_if(device->sites, [&](const std::string &site) { return sites.contains(site); }) !=
-            0) {
+    for (const auto &device : m_devices)
+        if (std::erase_if(device->sites, [&](const std::string &site) { return sites.contains(site); }) != 0)
             m_store.saveDeviceSites(*device);
-        }
-    }
     transaction.commit();
 }
 
@@ -145,9 +137,8 @@ DeviceTable::Counts DeviceTable::counts() const {
 
 void DeviceTable::index(Device &device) {
     m_byId[device.id] = &device;
-    if (!device.macKey.empty()) {
+    if (!device.macKey.empty())
         m_byMac[device.macKey] = &device;
-    }
 }
 
 template <typename Append>
@@ -166,13 +157,11 @@ std::string DeviceTable::joined(Page page, std::size_t sizeHint, Append append) 
 std::string macKeyOf(std::string_view mac) {
     std::string key;
     for (const char c : mac) {
-        if (c == ':' || c == '-' || c == '.' || c == ' ') {
+        if (c == ':' || c == '-' || c == '.' || c == ' ')
             continue;
-        }
         const char upper = c >= 'a' && c <= 'f' ? static_cast<char>(c - 'a' + 'A') : c;
-        if (!((upper >= '0' && upper <= '9') || (upper >= 'A' && upper <= 'F'))) {
+        if (!((upper >= '0' && upper <= '9') || (upper >= 'A' && upper <= 'F')))
             return {};
-        }
         key += upper;
     }
     return key.size() == 12 ? key : std::string();
@@ -188,9 +177,8 @@ std::string_view nameOf(Authorization authorization) {
 
 bool authorizationOf(std::string_view name, Authorization &authorization) {
     const auto found = std::find(authorizationNames.begin(), authorizationNames.end(), name);
-    if (found == authorizationNames.end()) {
+    if (found == authorizationNames.end())
         return false;
-    }
     authorization = static_cast<Authorization>(found - authorizationNames.begin());
     return true;
 }

@@ -24,20 +24,16 @@ void LogTable::add(std::int64_t at, const char *source, const char *type, const 
 }
 
 void LogTable::expire(std::int64_t nowMs, int days) {
-    if (nowMs < m_nextExpiry && days == m_expiryDays) {
+    if (nowMs < m_nextExpiry && days == m_expiryDays)
         return;
-    }
     m_nextExpiry = nowMs + betweenExpiriesMs;
     m_expiryDays = days;
     std::unordered_set<std::int64_t> old;
-    for (const RecordList::Record &entry : m_entries.all()) {
-        if (entry.at < nowMs - days * dayMs) {
+    for (const RecordList::Record &entry : m_entries.all())
+        if (entry.at < nowMs - days * dayMs)
             old.insert(entry.row);
-        }
-    }
-    if (!old.empty()) {
+    if (!old.empty())
         m_entries.remove(old);
-    }
 }
 
 std::string LogTable::rangeText(std::int64_t from, std::int64_t to) const {

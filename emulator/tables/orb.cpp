@@ -20,9 +20,8 @@ Json organization(int number, const std::string &name, bool remoteAccess, std::s
                  {"sites", Json::array()}};
     for (const char *site : siteNames) {
         const std::size_t place = made["sites"].size();
-        if (place < sites) {
+        if (place < sites)
             made["sites"].push_back({{"id", id + "-S" + std::to_string(place + 1)}, {"name", site}});
-        }
     }
     return made;
 }
@@ -46,9 +45,8 @@ Orb::Orb(Store &store, std::int64_t signInMs)
       m_signInMs(signInMs),
       m_state({{"users", Json::object()}, {"organizations", defaultOrganizations()}}) {
     const std::string kept = store.value(storeKey);
-    if (!kept.empty()) {
+    if (!kept.empty())
         m_state = Json::parse(kept);
-    }
 }
 
 void Orb::keep() {
@@ -66,9 +64,8 @@ void Orb::setUser(const std::string &email, const User &user) {
 Orb::User Orb::user(const std::string &email) const {
     const Json &users = m_state.at("users");
     const auto found = users.find(email);
-    if (found == users.end()) {
+    if (found == users.end())
         throw Refusal(Code::UnknownRemoteUser, "no such user of the remote-access service");
-    }
     return {{found->at("salt"), found->at("hash"), found->at("rounds")}, found->at("expired")};
 }
 
@@ -84,9 +81,8 @@ void Orb::forgetSignIn() {
 
 const Json &Orb::signedIn(std::int64_t nowMs) const {
     const auto signIn = m_state.find("sign_in");
-    if (signIn == m_state.end() || signIn->at("until").get<std::int64_t>() <= nowMs) {
+    if (signIn == m_state.end() || signIn->at("until").get<std::int64_t>() <= nowMs)
         throw Refusal(Code::NotAccepted, "nobody is signed in to the remote-access service");
-    }
     return m_state.at("organizations");
 }
 
@@ -96,18 +92,16 @@ std::string Orb::organizationsText(std::int64_t nowMs) const {
 
 void Orb::makeOrganizations(int count) {
     Json made = count < 0 ? defaultOrganizations() : Json::array();
-    for (int number = 1; number <= count; ++number) {
+    for (int number = 1; number <= count; ++number)
         made.push_back(organization(number, "Customer " + std::to_string(number), true, siteNames.size()));
-    }
     m_state["organizations"] = std::move(made);
     keep();
 }
 
 void Orb::add(const std::string &organizationId, const std::string &siteId, std::int64_t nowMs) {
     const Json *wanted = withMember(signedIn(nowMs), "organizationID", organizationId);
-    if (!wanted || !withMember(wanted->at("sites"), "id", siteId)) {
+    if (!wanted || !withMember(wanted->at("sites"), "id", siteId))
         throw Refusal(Code::UnknownId, "no such organization or site");
-    }
     m_state["link"] = {{"organization", organizationId},
                        {"site", siteId},
                        {"machineUUID", fingerprint(siteId).substr(0, 32)},
@@ -120,9 +114,8 @@ void Orb::add(const std::string &organizationId, const std::string &siteId, std:
 }
 
 Json &Orb::link() {
-    if (!isAdded()) {
+    if (!isAdded())
         throw Refusal(Code::UnknownId, "this service is not added to the remote-access service");
-    }
     return m_state["link"];
 }
 
@@ -133,9 +126,8 @@ void Orb::disconnect() {
 }
 
 void Orb::setRemoteAccess(bool on) {
-    if (on && link().at("may_enable") == false) {
+    if (on && link().at("may_enable") == false)
         throw Refusal(Code::NotAllowed, "the organization lets no support in");
-    }
     link()["enable"] = on;
     keep();
 }

@@ -13,9 +13,8 @@ RecordList::RecordList(Store &store, const std::string &table, std::size_t most)
       m_remove(store.database(), ("DELETE FROM " + table + " WHERE row=?").c_str()),
       m_lastRow(store.lastRow(table)) {
     Statement rows(store.database(), ("SELECT row,at,body FROM " + table + " ORDER BY row").c_str());
-    while (rows.step()) {
+    while (rows.step())
         m_records.push_back({rows.integer(0), rows.integer(1), rows.text(2)});
-    }
 }
 
 void RecordList::append(std::int64_t at, std::string body) {
@@ -29,9 +28,8 @@ void RecordList::append(std::int64_t at, std::string body) {
 
 void RecordList::remove(const std::unordered_set<std::int64_t> &rows) {
     Transaction transaction(m_store.database());
-    for (const std::int64_t row : rows) {
+    for (const std::int64_t row : rows)
         m_remove.bind(row).run();
-    }
     transaction.commit();
     std::erase_if(m_records, [&](const Record &record) { return rows.contains(record.row); });
 }

@@ -31,22 +31,19 @@ ServiceFiles::ServiceFiles(std::filesystem::path folder)
     : m_folder(madeFolder(std::move(folder))), m_claim(m_folder / "nvldm-emulator.lock") {}
 
 void ServiceFiles::discardStore() const {
-    for (const char *suffix : {"", "-wal", "-shm"}) {
+    for (const char *suffix : {"", "-wal", "-shm"})
         std::filesystem::remove(storePath() += suffix);
-    }
 }
 
 int ServiceFiles::lastPort() const {
     const auto path = m_folder / "nvldmsvc.sdb";
-    if (!std::filesystem::exists(path)) {
+    if (!std::filesystem::exists(path))
         return 0;
-    }
     const Database database(path);
     // A run that was killed at its start has left a file without the table.
     Statement table(database, "SELECT 1 FROM sqlite_master WHERE name = 'svcMainT'");
-    if (!table.step()) {
+    if (!table.step())
         return 0;
-    }
     Statement query(database, "SELECT json_extract(value, '$.port') FROM svcMainT "
                               "WHERE key = 'kSvcAndTrayServerPort' AND json_valid(value)");
     return query.step() ? static_cast<int>(query.integer(0)) : 0;

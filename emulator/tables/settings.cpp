@@ -21,9 +21,8 @@ struct Setting {
     std::int64_t most = 0;
 
     bool takes(const Json &wanted) const {
-        if (value.is_number_integer()) {
+        if (value.is_number_integer())
             return wanted.is_number_integer() && wanted >= least && wanted <= most;
-        }
         return wanted.type() == value.type() &&
                (!wanted.is_string() ||
                 wanted.get_ref<const std::string &>().size() <= static_cast<std::size_t>(most));
@@ -72,12 +71,10 @@ std::string Settings::change(const Json &members) {
     std::string differences;
     for (const auto &[name, value] : members.items()) {
         const Setting *setting = find(name == "days" ? "log_keepdays" : name);
-        if (!setting) {
+        if (!setting)
             continue;
-        }
-        if (!setting->takes(value)) {
+        if (!setting->takes(value))
             throw Refusal(Code::Malformed, "setting \"" + name + "\" has a wrong type or is out of range");
-        }
         if (Json &present = changed[setting->name]; present != value) {
             differences += (differences.empty() ? "" : ", ") + std::string(setting->name) + ' ' +
                            jsonText(present) + " -> " + jsonText(value);

@@ -118,9 +118,8 @@ void Store::removeAccount(const std::string &email) {
 std::vector<SessionToken> Store::tokens() {
     std::vector<SessionToken> all;
     Statement rows(m_database, "SELECT fingerprint,session,account,issued_at,good_until FROM token");
-    while (rows.step()) {
+    while (rows.step())
         all.push_back({rows.text(0), rows.text(1), rows.text(2), rows.integer(3), rows.integer(4)});
-    }
     return all;
 }
 
@@ -144,18 +143,16 @@ void Store::removeAllTokens() {
 std::vector<Site> Store::sites() {
     std::vector<Site> all;
     Statement rows(m_database, "SELECT id,name,parent,extra FROM site ORDER BY row");
-    while (rows.step()) {
+    while (rows.step())
         all.push_back({rows.text(0), rows.text(1), rows.text(2), rows.text(3)});
-    }
     return all;
 }
 
 void Store::replaceSites(const std::vector<Site> &sites) {
     Transaction transaction(m_database);
     m_database.run("DELETE FROM site");
-    for (const Site &site : sites) {
+    for (const Site &site : sites)
         m_saveSite.bind(site.id).bind(site.name).bind(site.parent).bind(site.extra).run();
-    }
     transaction.commit();
 }
 
@@ -211,9 +208,8 @@ void Store::saveDeviceState(const Device &device) {
 
 void Store::saveDeviceSecret(const Device &device) {
     m_removeDeviceSecret.bind(device.id).run();
-    if (!device.secret.empty()) {
+    if (!device.secret.empty())
         m_saveDeviceSecret.bind(device.id).bind(device.secret).run();
-    }
 }
 
 void Store::removeDevice(const std::string &id) {

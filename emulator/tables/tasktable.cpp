@@ -14,9 +14,8 @@ namespace {
 const std::string &devicesText(Task &task) {
     if (task.devicesText.empty()) {
         task.devicesText = "[";
-        for (const TaskDevice &device : task.devices) {
+        for (const TaskDevice &device : task.devices)
             appendEntry(task.devicesText, device.identity, device.state, device.progress);
-        }
         task.devicesText += ']';
     }
     return task.devicesText;
@@ -126,9 +125,8 @@ TaskTable::TaskTable(Store &store)
         Task &task = *m_tasks.back();
         task.row = rows.integer(0);
         task.devicesText = rows.text(2);
-        if (!isFinal(task.status)) {
+        if (!isFinal(task.status))
             task.devices = devicesOf(task.devicesText, rows.text(3));
-        }
         m_byId[task.id] = &task;
     }
 }
@@ -140,19 +138,16 @@ Task *TaskTable::find(const std::string &id) const {
 
 Task &TaskTable::get(const std::string &id) const {
     Task *task = find(id);
-    if (!task) {
+    if (!task)
         throw Refusal(Code::UnknownId, "no task " + id);
-    }
     return *task;
 }
 
 std::vector<Task *> TaskTable::open() const {
     std::vector<Task *> open;
-    for (const auto &task : m_tasks) {
-        if (!isFinal(task->status)) {
+    for (const auto &task : m_tasks)
+        if (!isFinal(task->status))
             open.push_back(task.get());
-        }
-    }
     return open;
 }
 
@@ -177,13 +172,11 @@ void TaskTable::save(Task &task) {
 
 void TaskTable::remove(const std::unordered_set<std::string> &ids) {
     Transaction transaction(m_store.database());
-    for (const std::string &id : ids) {
+    for (const std::string &id : ids)
         m_remove.bind(get(id).row).run();
-    }
     transaction.commit();
-    for (const std::string &id : ids) {
+    for (const std::string &id : ids)
         m_byId.erase(id);
-    }
     std::erase_if(m_tasks, [&](const std::unique_ptr<Task> &task) { return ids.contains(task->id); });
 }
 

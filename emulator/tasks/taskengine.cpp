@@ -62,21 +62,16 @@ void TaskEngine::judgeWork(const std::string &taskId, const std::vector<DeviceWo
     const Task &task = m_tasks.get(taskId);
     std::unordered_set<std::string> waiting;
     std::unordered_set<std::string> gone;
-    for (const TaskDevice &device : task.devices) {
-        if (device.phase == Phase::WithoutWork) {
+    for (const TaskDevice &device : task.devices)
+        if (device.phase == Phase::WithoutWork)
             waiting.insert(device.id);
-        } else if (device.phase == Phase::Ended && !m_devices.find(device.id)) {
+        else if (device.phase == Phase::Ended && !m_devices.find(device.id))
             gone.insert(device.id);
-        }
-    }
-    if (work.empty()) {
+    if (work.empty())
         refuse("the work names no device");
-    }
-    for (const DeviceWork &item : work) {
-        if (waiting.erase(item.id) == 0 && !gone.contains(item.id)) {
+    for (const DeviceWork &item : work)
+        if (waiting.erase(item.id) == 0 && !gone.contains(item.id))
             refuse("device " + item.id + " waits for no work under this task");
-        }
-    }
 }
 
 void TaskEngine::startWork(const std::string &taskId, const std::vector<DeviceWork> &work,
@@ -84,14 +79,12 @@ void TaskEngine::startWork(const std::string &taskId, const std::vector<DeviceWo
     judgeWork(taskId, work);
     Task &task = m_tasks.get(taskId);
     std::unordered_map<std::string, const DeviceWork *> items;
-    for (const DeviceWork &item : work) {
+    for (const DeviceWork &item : work)
         items[item.id] = &item;
-    }
     for (TaskDevice &device : task.devices) {
         const auto found = items.find(device.id);
-        if (found == items.end() || device.phase != Phase::WithoutWork) {
+        if (found == items.end() || device.phase != Phase::WithoutWork)
             continue;
-        }
         device.phase = Phase::Queued;
         device.state = task.status == state::scheduled ? state::scheduled : state::queued;
         device.work = *found->second;
@@ -104,31 +97,25 @@ void TaskEngine::startWork(const std::string &taskId, const std::vector<DeviceWo
 }
 
 void TaskEngine::endArrival(const std::string &taskId) {
-    if (const auto found = m_arriving.find(taskId); found != m_arriving.end() && --found->second == 0) {
+    if (const auto found = m_arriving.find(taskId); found != m_arriving.end() && --found->second == 0)
         m_arriving.erase(found);
-    }
 }
 
 void TaskEngine::close(const std::string &taskId, const std::string &finalState, std::int64_t nowMs) {
     Task &task = m_tasks.get(taskId);
-    if (!isFinal(finalState) || isFinal(task.status)) {
+    if (!isFinal(finalState) || isFinal(task.status))
         refuse("the task cannot become " + finalState);
-    }
-    for (TaskDevice &device : task.devices) {
-        if (device.phase != Phase::Ended) {
+    for (TaskDevice &device : task.devices)
+        if (device.phase != Phase::Ended)
             end(task, device, finalState);
-        }
-    }
     task.progress = meanProgress(task);
     finish(task, finalState, nowMs);
 }
 
 void TaskEngine::remove(const std::unordered_set<std::string> &taskIds) {
-    for (const std::string &id : taskIds) {
-        if (!isFinal(m_tasks.get(id).status)) {
+    for (const std::string &id : taskIds)
+        if (!isFinal(m_tasks.get(id).status))
             refuse("task " + id + " has not ended");
-        }
-    }
     m_tasks.remove(taskIds);
 }
 
@@ -136,9 +123,8 @@ void TaskEngine::settle(std::int64_t nowMs) {
     if (!m_open.empty()) {
         Transaction transaction(m_store.database());
         // A task that ends leaves the list.
-        for (Task *task : std::vector<Task *>(m_open)) {
+        for (Task *task : std::vector<Task *>(m_open))
             settleTask(*task, nowMs);
-        }
         transaction.commit();
     }
     m_outages.endDue(nowMs);
@@ -146,16 +132,13 @@ void TaskEngine::settle(std::int64_t nowMs) {
 
 void TaskEngine::settleTask(Task &task, std::int64_t nowMs) {
     const bool wakes = task.status == state::scheduled && nowMs >= task.scheduledAt;
-    if (wakes) {
+    if (wakes)
         wake(task, nowMs);
-    }
     bool changed = dropOverdue(task, nowMs) || wakes;
-    if (task.status != state::scheduled && nowMs >= task.startsAt) {
+    if (task.status != state::scheduled && nowMs >= task.startsAt)
         changed = run(task, nowMs) || changed;
-    }
-    if (changed) {
+    if (changed)
         refresh(task, nowMs);
-    }
 }
 
 void TaskEngine::wake(Task &task, std::int64_t nowMs) {
@@ -171,9 +154,8 @@ void TaskEngine::wake(Task &task, std::int64_t nowMs) {
 /// Work that never comes is given up; a scheduled task may have it as late as at its time.
 bool TaskEngine::dropOverdue(Task &task, std::int64_t nowMs) const {
     const std::int64_t due = std::max(task.createdAt, task.scheduledAt) + m_rules.workTimeoutMs;
-    if (nowMs < due || m_arriving.contains(task.id)) {
+    if (nowMs < due || m_arriving.contains(task.id))
         return false;
-    }
     bool dropped = false;
     for (TaskDevice &device : task.devices) {
         if (device.phase == Phase::WithoutWork) {
@@ -214,13 +196,11 @@ bool TaskEngine::run(Task &task, std::int64_t nowMs) {
 /// How many devices of a task may run at a time; the settings bound those that get firmware, of all tasks.
 std::size_t TaskEngine::placesOf(const Task &task) const {
     const std::size_t limit = isFirmware(task) ? m_settings.firmwareLimit() : 0;
-    if (limit == 0) {
+    if (limit == 0)
         return maxParallel;
-    }
     std::size_t elsewhere = 0;
-    for (const Task *open : m_open) {
+    for (const Task *open : m_open)
         elsewhere += open != &task && isFirmware(*open) ? open->running.size() : 0;
-    }
     return std::min(maxParallel, limit - std::min(limit, elsewhere));
 }
 
@@ -228,9 +208,8 @@ bool TaskEngine::fillPlaces(Task &task, std::int64_t nowMs) {
     bool filled = false;
     while (task.running.size() < placesOf(task)) {
         const auto next = nextQueued(task);
-        if (!next) {
+        if (!next)
             break;
-        }
         task.running.push_back(*next);
         begin(task, *next, nowMs);
         filled = true;
@@ -246,34 +225,27 @@ void TaskEngine::begin(Task &task, std::size_t index, std::int64_t nowMs) {
     device.step = 0;
     device.steps = minSteps + static_cast<int>(random.below(3));
     device.failsAt = 1 + static_cast<int>(random.below(static_cast<std::uint64_t>(device.steps)));
-    if (random.chance(m_rules.failures) && device.work.failure.empty()) {
+    if (random.chance(m_rules.failures) && device.work.failure.empty())
         device.work.failure = failureCode(random);
-    }
     device.dueAt = nowMs + m_rules.paceMs;
-    if (Device *target = m_devices.find(device.id)) {
+    if (Device *target = m_devices.find(device.id))
         target->action = task.type;
-    }
 }
 
 void TaskEngine::advance(const Task &task, TaskDevice &device) {
     Device &target = m_devices.get(device.id);
     ++device.step;
     m_outages.endOf(device.id, device.dueAt);
-    if (!target.reachable && !m_outages.has(device.id)) {
+    if (!target.reachable && !m_outages.has(device.id))
         return end(task, device, device.step > 1 ? state::lostConnection : state::noConnection);
-    }
-    if (device.step == 1 && !isPermitted(target, device.work.access)) {
+    if (device.step == 1 && !isPermitted(target, device.work.access))
         return end(task, device, state::mismatch);
-    }
-    if (!device.work.failure.empty() && device.step >= device.failsAt) {
+    if (!device.work.failure.empty() && device.step >= device.failsAt)
         return end(task, device, device.work.failure);
-    }
-    if (device.step == device.steps) {
+    if (device.step == device.steps)
         return succeed(task, device);
-    }
-    if (device.work.restarts && device.step == outageStep) {
+    if (device.work.restarts && device.step == outageStep)
         m_outages.begin(target, {}, device.dueAt + outageSteps * m_rules.paceMs);
-    }
     device.state = runningState(task, device);
     device.progress = device.step * 100 / device.steps;
 }
@@ -286,9 +258,8 @@ void TaskEngine::succeed(const Task &task, TaskDevice &device) {
 
 void TaskEngine::end(const Task &task, TaskDevice &device, const std::string &finalState) {
     Device *target = device.phase == Phase::Running ? m_devices.find(device.id) : nullptr;
-    if (target && target->action == task.type) {
+    if (target && target->action == task.type)
         target->action = standby;
-    }
     device.phase = Phase::Ended;
     device.state = finalState;
 }
@@ -345,9 +316,8 @@ void TaskEngine::forget(const std::unordered_set<std::string> &deviceIds, std::i
                 touched = true;
             }
         }
-        if (!touched) {
+        if (!touched)
             continue;
-        }
         std::erase_if(task->running, [&](std::size_t i) { return task->devices[i].phase == Phase::Ended; });
         if (std::all_of(task->devices.begin(), task->devices.end(), isGone)) {
             std::erase(m_open, task);

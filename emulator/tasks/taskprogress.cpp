@@ -11,19 +11,16 @@ bool isFirmware(const Task &task) {
 
 const char *runningState(const Task &task, const TaskDevice &device) {
     static constexpr std::array phases = {state::uploading, state::updating, state::reconnecting};
-    if (!isFirmware(task) || device.step == 0) {
+    if (!isFirmware(task) || device.step == 0)
         return state::processing;
-    }
     return phases[static_cast<std::size_t>(device.step) * phases.size() /
                   static_cast<std::size_t>(device.steps)];
 }
 
 std::optional<std::size_t> nextQueued(const Task &task) {
-    for (std::size_t i = 0; i < task.devices.size(); ++i) {
-        if (task.devices[i].phase == TaskDevice::Phase::Queued) {
+    for (std::size_t i = 0; i < task.devices.size(); ++i)
+        if (task.devices[i].phase == TaskDevice::Phase::Queued)
             return i;
-        }
-    }
     return std::nullopt;
 }
 
@@ -34,9 +31,8 @@ bool any(const Task &task, TaskDevice::Phase phase) {
 
 int meanProgress(const Task &task) {
     std::size_t sum = 0;
-    for (const TaskDevice &device : task.devices) {
+    for (const TaskDevice &device : task.devices)
         sum += static_cast<std::size_t>(device.progress);
-    }
     return static_cast<int>(sum / std::max<std::size_t>(task.devices.size(), 1));
 }
 

@@ -20,24 +20,20 @@ struct Recipient {
 /// Devices that were removed have failed under their task already.
 std::vector<Recipient> recipientsOf(const Model &model, const UploadOrder &order) {
     const Task &task = model.tasks.get(order.taskId);
-    if (task.type != order.type) {
+    if (task.type != order.type)
         throw Refusal(Code::Malformed, "the task is for something else");
-    }
     std::optional<std::unordered_set<std::string>> wanted;
-    if (order.deviceIds) {
+    if (order.deviceIds)
         wanted.emplace(order.deviceIds->begin(), order.deviceIds->end());
-    }
     std::vector<Recipient> recipients;
     for (const TaskDevice &entry : task.devices) {
         const bool waits = entry.phase == TaskDevice::Phase::WithoutWork;
         const Device *device = model.devices.find(entry.id);
-        if (waits && device && (!wanted || wanted->contains(entry.id))) {
+        if (waits && device && (!wanted || wanted->contains(entry.id)))
             recipients.push_back({*device, entry.parameters});
-        }
     }
-    if (recipients.empty()) {
+    if (recipients.empty())
         throw Refusal(Code::Malformed, "no device waits for this under the task");
-    }
     return recipients;
 }
 
@@ -58,9 +54,8 @@ void startUpload(Service &service, const UploadOrder &order, const UploadWork &w
         return recipientsOf(model, order);
     });
     std::vector<DeviceWork> works;
-    for (const Recipient &recipient : recipients) {
+    for (const Recipient &recipient : recipients)
         works.push_back(workFor(recipient.device, recipient.parameters));
-    }
     service.withModel([&](Model &model) {
         Transaction transaction(model.store.database());
         model.engine.startWork(order.taskId, works, nowMs());

@@ -24,18 +24,16 @@ std::string taskIdOf(const IncomingRequest &incoming) {
 WorkArrival::WorkArrival(Service &service, const IncomingRequest &incoming)
     : m_service(service), m_taskId(taskIdOf(incoming)) {
     m_service.withModel([&](Model &model) {
-        if (!model.sessions.find(incoming.authorization, nowMs())) {
+        if (!model.sessions.find(incoming.authorization, nowMs()))
             m_taskId.clear();
-        } else if (!m_taskId.empty()) {
+        else if (!m_taskId.empty())
             model.engine.beginArrival(m_taskId);
-        }
     });
 }
 
 WorkArrival::~WorkArrival() {
-    if (!m_taskId.empty()) {
+    if (!m_taskId.empty())
         m_service.withModel([this](Model &model) { model.engine.endArrival(m_taskId); });
-    }
 }
 
 } // namespace emulator

@@ -19,9 +19,8 @@ DeviceWork workOn(const Model &model, const std::string &id, const WorkFor &work
 }
 
 void checkType(const Model &model, const std::string &taskId, std::string_view type) {
-    if (!type.empty() && model.tasks.get(taskId).type != type) {
+    if (!type.empty() && model.tasks.get(taskId).type != type)
         throw Refusal(Code::Malformed, "the task is for something else");
-    }
 }
 
 } // namespace
@@ -29,30 +28,24 @@ void checkType(const Model &model, const std::string &taskId, std::string_view t
 void startUnderTasks(Model &model, const std::vector<Target> &targets, std::string_view type,
                      const WorkFor &workFor) {
     std::map<std::string, std::vector<DeviceWork>> works;
-    for (const Target &target : targets) {
-        if (!target.taskId.empty()) {
+    for (const Target &target : targets)
+        if (!target.taskId.empty())
             works[target.taskId].push_back(workOn(model, target.id, workFor));
-        }
-    }
     for (const auto &[taskId, work] : works) {
         checkType(model, taskId, type);
         model.engine.judgeWork(taskId, work);
     }
-    for (const auto &[taskId, work] : works) {
+    for (const auto &[taskId, work] : works)
         model.engine.startWork(taskId, work, nowMs());
-    }
 }
 
 Outcome doAtOnce(Model &model, Device &device, const DeviceWork &work) {
-    if (!device.reachable) {
+    if (!device.reachable)
         return Outcome::NoConnection;
-    }
-    if (!isPermitted(device, work.access)) {
+    if (!isPermitted(device, work.access))
         return Outcome::NotAuthorized;
-    }
-    if (!work.failure.empty()) {
+    if (!work.failure.empty())
         return Outcome::Failed;
-    }
     apply(model.devices, device, work);
     return Outcome::Done;
 }
@@ -79,11 +72,9 @@ void order(Service &service, const std::vector<Target> &targets, std::string_vie
 }
 
 void checkKnownWithoutTask(const Model &model, const std::vector<Target> &targets) {
-    for (const Target &target : targets) {
-        if (target.taskId.empty()) {
+    for (const Target &target : targets)
+        if (target.taskId.empty())
             model.devices.get(target.id);
-        }
-    }
 }
 
 } // namespace emulator

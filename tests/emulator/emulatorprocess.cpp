@@ -11,11 +11,9 @@ QString program() {
 }
 
 QString readLine(QProcess &process, const QDeadlineTimer &deadline) {
-    while (!process.canReadLine() && !deadline.hasExpired()) {
-        if (!process.waitForReadyRead(static_cast<int>(deadline.remainingTime()))) {
+    while (!process.canReadLine() && !deadline.hasExpired())
+        if (!process.waitForReadyRead(static_cast<int>(deadline.remainingTime())))
             return {};
-        }
-    }
     return QString::fromUtf8(process.readLine()).trimmed();
 }
 
@@ -30,11 +28,9 @@ EmulatorProcess::~EmulatorProcess() {
 bool EmulatorProcess::start(const QStringList &arguments) {
     QStringList all = {"--root", root()};
     const QStringList small = {"--devices", "20", "--sites", "12", "--seed", "7", "--life", "0"};
-    for (int i = 0; i < small.size(); i += 2) {
-        if (!arguments.contains(small[i])) {
+    for (int i = 0; i < small.size(); i += 2)
+        if (!arguments.contains(small[i]))
             all << small[i] << small[i + 1];
-        }
-    }
     m_process.start(program(), all + arguments);
     m_process.setReadChannel(QProcess::StandardOutput);
     m_readyLine = readLine(m_process, QDeadlineTimer(patienceMs));
@@ -48,9 +44,8 @@ QString EmulatorProcess::command(const QString &line) {
     const QDeadlineTimer deadline(patienceMs);
     while (!deadline.hasExpired() && isRunning()) {
         const QString answer = readLine(m_process, deadline);
-        if (answer.startsWith("ok") || answer.startsWith("error")) {
+        if (answer.startsWith("ok") || answer.startsWith("error"))
             return answer;
-        }
         m_diagnostics += answer + '\n';
     }
     return {};
@@ -68,9 +63,8 @@ QString EmulatorProcess::describe() {
 
 int EmulatorProcess::stop() {
     m_process.terminate();
-    if (!m_process.waitForFinished(patienceMs)) {
+    if (!m_process.waitForFinished(patienceMs))
         return -1;
-    }
     m_diagnostics += QString::fromUtf8(m_process.readAllStandardError());
     return m_process.exitStatus() == QProcess::NormalExit ? m_process.exitCode() : -1;
 }
@@ -86,9 +80,8 @@ EmulatorProcess::Outcome EmulatorProcess::run(const QStringList &arguments) {
     QProcess process;
     process.start(program(), arguments);
     Outcome outcome;
-    if (process.waitForFinished(patienceMs) && process.exitStatus() == QProcess::NormalExit) {
+    if (process.waitForFinished(patienceMs) && process.exitStatus() == QProcess::NormalExit)
         outcome.status = process.exitCode();
-    }
     outcome.output = QString::fromUtf8(process.readAllStandardOutput());
     outcome.errors = QString::fromUtf8(process.readAllStandardError());
     return outcome;

@@ -30,9 +30,8 @@ Json FleetTest::newTask(const char *type, std::size_t devices, const Json &param
 
 Json FleetTest::under(const Json &task) {
     Json entries = Json::array();
-    for (const Json &device : task.at("devices")) {
+    for (const Json &device : task.at("devices"))
         entries.push_back({{"id", device.at("id")}, {"tid", task.at("tid")}});
-    }
     return entries;
 }
 
@@ -42,18 +41,16 @@ Json FleetTest::runUnder(const Json &task, const std::string &command) {
 }
 
 Json FleetTest::ended() {
-    for (int i = 0; i < 400 && newest().at("active"); ++i) {
+    for (int i = 0; i < 400 && newest().at("active"); ++i)
         QTest::qWait(10);
-    }
     return newest();
 }
 
 Json FleetTest::outcomes() {
     const Json task = ended();
     Json states = Json::array();
-    for (const Json &device : task.at("devices")) {
+    for (const Json &device : task.at("devices"))
         states.push_back(device.at("state"));
-    }
     return states;
 }
 

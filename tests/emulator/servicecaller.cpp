@@ -9,9 +9,8 @@ namespace {
 template <typename Operation>
 std::optional<std::string> ciphered(Operation operation) {
     char *raw = nullptr;
-    if (operation(&raw) != 0 || !raw) {
+    if (operation(&raw) != 0 || !raw)
         return std::nullopt;
-    }
     std::string text = raw;
     nvlcryptoFree(raw);
     return text;
@@ -19,13 +18,11 @@ std::optional<std::string> ciphered(Operation operation) {
 
 Json dataOf(const Json &body, bool &secret) {
     const auto found = body.find("data");
-    if (found == body.end()) {
+    if (found == body.end())
         return {};
-    }
     secret = found->is_string() && found->get_ref<const std::string &>().rfind("D1:", 0) == 0;
-    if (!secret) {
+    if (!secret)
         return *found;
-    }
     const auto &cypher = found->get_ref<const std::string &>();
     const auto plain = ciphered([&](char **out) { return cypherToData(cypher.data(), cypher.size(), out); });
     return plain ? Json::parse(*plain, nullptr, false) : Json();
@@ -63,9 +60,8 @@ Reply ServiceCaller::sendForm(const std::string &path, Json parameters,
                     "\"; filename=\"" + fileName + "\"\r\n\r\n" + content + "\r\n";
     };
     add("text", "data", parameters.dump());
-    for (const File &file : files) {
+    for (const File &file : files)
         add(file.part, file.name, file.content);
-    }
     raw.body += "--" + boundary + "--\r\n";
     raw.headers = {{"Authorization", m_token}, {"Content-Type", "multipart/form-data; boundary=" + boundary}};
     return send(std::move(raw));
@@ -114,17 +110,15 @@ Reply ServiceCaller::login(const std::string &email, const std::string &password
 }
 
 Reply ServiceCaller::call(const std::string &path, Json body) {
-    if (!body.contains("id")) {
+    if (!body.contains("id"))
         body["id"] = m_account;
-    }
     Request request;
     request.path = path;
     request.body = body.dump();
     request.token = m_token;
     const Reply reply = send(request);
-    if (reply.code == 0 && !reply.token.empty()) {
+    if (reply.code == 0 && !reply.token.empty())
         m_token = reply.token;
-    }
     return reply;
 }
 
@@ -133,9 +127,8 @@ Json ServiceCaller::list(const std::string &path, int pageSize) {
     for (std::size_t got = 1; got != 0;) {
         const Reply page = call(path, {{"start", all.size()}, {"count", pageSize}});
         got = page.data.is_array() ? page.data.size() : 0;
-        for (std::size_t i = 0; i < got; ++i) {
+        for (std::size_t i = 0; i < got; ++i)
             all.push_back(page.data[i]);
-        }
     }
     return all;
 }

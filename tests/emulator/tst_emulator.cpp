@@ -37,15 +37,13 @@ QString storedPort(const QString &root) {
 
 QString stateOf(const QString &root) {
     QFile file(root + "/nvldm.state");
-    if (!file.open(QIODevice::ReadOnly)) {
+    if (!file.open(QIODevice::ReadOnly))
         return {};
-    }
     const QRegularExpression state("STATE\\s*:\\s*(\\d+)");
     auto matches = state.globalMatch(QString::fromUtf8(file.readAll()));
     QString last;
-    while (matches.hasNext()) {
+    while (matches.hasNext())
         last = matches.next().captured(1);
-    }
     return last;
 }
 
@@ -66,11 +64,9 @@ ServiceCaller admin(const EmulatorProcess &emulator) {
 
 std::set<std::string> unreachable(ServiceCaller &from) {
     std::set<std::string> ids;
-    for (const Json &status : from.list("/v1/dstatus/list")) {
-        if (status.at("connect_status") == "Unreachable") {
+    for (const Json &status : from.list("/v1/dstatus/list"))
+        if (status.at("connect_status") == "Unreachable")
             ids.insert(status.at("id"));
-        }
-    }
     return ids;
 }
 
@@ -112,9 +108,8 @@ void EmulatorTest::files() {
     QCOMPARE(QFile::permissions(emulator.root()) & ~ownerAll, QFile::Permissions());
     const auto entries = QDir(emulator.root()).entryInfoList(QDir::Files);
     QVERIFY(entries.size() >= 3);
-    for (const QFileInfo &entry : entries) {
+    for (const QFileInfo &entry : entries)
         QCOMPARE(entry.permissions() & ~ownerAll, QFile::Permissions());
-    }
     QCOMPARE(emulator.stop(), 0);
     QCOMPARE(stateOf(emulator.root()), QString("1"));
 }

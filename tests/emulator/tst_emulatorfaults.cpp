@@ -50,9 +50,8 @@ void EmulatorFaultsTest::init() {
 }
 
 void EmulatorFaultsTest::cleanup() {
-    if (m_emulator.isRunning()) {
+    if (m_emulator.isRunning())
         QCOMPARE(m_emulator.command("faults clear"), QString("ok"));
-    }
 }
 
 void EmulatorFaultsTest::put(const char *fault) {
@@ -112,9 +111,8 @@ void EmulatorFaultsTest::wrongTypes() {
     QCOMPARE(QString(reply.data.type_name()), shape);
     if (shape == "array") {
         QCOMPARE(reply.data.size(), sound.size());
-        for (const auto &[name, value] : sound[0].items()) {
+        for (const auto &[name, value] : sound[0].items())
             QVERIFY2(reply.data[0].at(name).type_name() != std::string(value.type_name()), name.c_str());
-        }
     }
 }
 
@@ -188,9 +186,8 @@ void EmulatorFaultsTest::limits() {
     put(fault.toUtf8().constData());
     const ServiceCaller anybody(m_emulator.port());
     QString seen;
-    for (int i = 0; i < 6; ++i) {
+    for (int i = 0; i < 6; ++i)
         seen += anybody.post("/v1/accm/list", aPage).code == 9 ? '9' : '.';
-    }
     QTEST(seen, "expected");
 }
 
@@ -199,9 +196,8 @@ void EmulatorFaultsTest::badSpec_data() {
     for (const char *spec :
          {"nonsense", "", "late", "late=", "late=soon", "late=-1", "status=99", "status", "early=99",
           "cut-body", "slow-body=fast", "reset=1", "wrong-types=colour", "code=1@v1", "code=1,often=2",
-          "code=1,times=x", "code=1,rate=2", "code=1,rate=-0.5", "code=1,rate=nan"}) {
+          "code=1,times=x", "code=1,rate=2", "code=1,rate=-0.5", "code=1,rate=nan"})
         QTest::newRow(spec) << spec;
-    }
 }
 
 void EmulatorFaultsTest::badSpec() {

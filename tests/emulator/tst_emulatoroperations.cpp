@@ -16,9 +16,8 @@ constexpr auto failedPassword = "pTaskFailedToSetPassword";
 
 quint32 number(const std::string &bytes, std::size_t at, int width) {
     quint32 value = 0;
-    for (int i = width - 1; i >= 0; --i) {
+    for (int i = width - 1; i >= 0; --i)
         value = value << 8 | static_cast<unsigned char>(bytes.at(at + std::size_t(i)));
-    }
     return value;
 }
 
@@ -31,9 +30,8 @@ QStringList filesOfZip(const std::string &zip) {
         const std::string content = zip.substr(head + 30 + nameLength, number(zip, entry + 24, 4));
         const auto crc = crc32(0, reinterpret_cast<const Bytef *>(content.data()), uInt(content.size()));
         const bool heads = zip.compare(head, 4, "PK\3\4") == 0 && zip.compare(entry, 4, "PK\1\2") == 0;
-        if (heads && crc == number(zip, entry + 16, 4) && crc == number(zip, head + 14, 4)) {
+        if (heads && crc == number(zip, entry + 16, 4) && crc == number(zip, head + 14, 4))
             files << QString::fromStdString(content);
-        }
         entry += 46 + nameLength;
     }
     return files;
@@ -47,9 +45,8 @@ class EmulatorOperationsTest : public FleetTest {
 
 private slots:
     void init() {
-        if (!m_emulator) {
+        if (!m_emulator)
             fresh(quick);
-        }
         QVERIFY(tell("admit all").startsWith("ok"));
         m_devices = m_caller.list("/v1/dev/list");
     }
@@ -101,9 +98,8 @@ private slots:
         m_emulator->kill();
         start(quick);
         QCOMPARE(offer("New%41!pass9"), "Authorized");
-        for (int i = 0; i < 4; ++i) {
+        for (int i = 0; i < 4; ++i)
             QCOMPARE(offer("wrongwrong"), "Invalid Password");
-        }
         QCOMPARE(offer("wrongwrong"), "Account Blocked");
         QTRY_COMPARE(authorization(0), "Invalid Password");
         QCOMPARE(offer("New%41!pass9"), "Authorized");
@@ -181,9 +177,8 @@ private slots:
         // The last two addresses are another device's and one beyond the gateway's network.
         const Json ips = {"10.8.0.7", "10.8.0.8", m_devices[0].at("d_ip"), m_devices[9].at("d_ip"),
                           "10.9.0.9"};
-        for (std::size_t i = 0; i < 5; ++i) {
+        for (std::size_t i = 0; i < 5; ++i)
             body["devices"].push_back({{"id", m_devices[i].at("id")}, {"ip", ips[i]}});
-        }
         body = body.patch(Json::parse(change.toStdString()));
         QTEST(code("/v1/assip/manual", body), "code");
         if (QString(QTest::currentDataTag()) == "sound") {
@@ -198,9 +193,8 @@ private slots:
     void addressesAutomatically() {
         const Json task = newTask("deviceAssignIPAuto", 3);
         Json body = {{"tid", task.at("tid")}, {"devices", Json::array()}};
-        for (const Json &device : task.at("devices")) {
+        for (const Json &device : task.at("devices"))
             body["devices"].push_back(device.at("id"));
-        }
         QCOMPARE(code("/v1/assip/auto", body), 0);
         COMPARE_JSON(outcomes(), Json({"pTaskDone", "pTaskDone", "pTaskDone"}));
         const std::string leased = record(2).at("d_ip");

@@ -27,9 +27,8 @@ Bytes bytesOfHex(const char *hex) {
 std::string forgedToken(const Bytes &key, qint64 ageMs) {
     const auto time = static_cast<quint64>(QDateTime::currentMSecsSinceEpoch() - ageMs);
     Bytes text;
-    for (int shift = 56; shift >= 0; shift -= 8) {
+    for (int shift = 56; shift >= 0; shift -= 8)
         text += static_cast<char>(time >> shift);
-    }
     text += Bytes(16, 'r');
     std::array<unsigned char, EVP_MAX_MD_SIZE> mac{};
     unsigned length = 0;
@@ -70,11 +69,9 @@ Json newDevice(const char *mac) {
 }
 
 const Json *withMember(const Json &records, const char *name, const Json &value) {
-    for (const Json &record : records) {
-        if (record.is_object() && record.value(name, Json()) == value) {
+    for (const Json &record : records)
+        if (record.is_object() && record.value(name, Json()) == value)
             return &record;
-        }
-    }
     return nullptr;
 }
 
@@ -119,9 +116,8 @@ void EmulatorServiceTest::initTestCase() {
 }
 
 void EmulatorServiceTest::cleanup() {
-    if (QTest::currentTestFailed()) {
+    if (QTest::currentTestFailed())
         qWarning("%s", qPrintable(m_emulator->describe()));
-    }
 }
 
 void EmulatorServiceTest::fresh(const QStringList &more) {
@@ -136,9 +132,8 @@ void EmulatorServiceTest::fresh(const QStringList &more) {
 ServiceCaller EmulatorServiceTest::caller(const char *email) {
     ServiceCaller result(m_emulator->port());
     const Reply reply = result.login(email, password);
-    if (reply.code != 0) {
+    if (reply.code != 0)
         QTest::qFail(("no login: " + reply.error + ' ' + reply.body.dump()).c_str(), __FILE__, __LINE__);
-    }
     return result;
 }
 
@@ -197,13 +192,11 @@ void EmulatorServiceTest::permission_data() {
           "/v1/dev/scanips", "/v1/dev/setpolicy",    "/v1/dev/auth",     "/v1/task/init",
           "/v1/task/rm",     "/v1/task/updateState", "/v1/alarm/rm",     "/v1/cgi/commit",
           "/v1/cgi/custom",  "/v1/cgi/customx",      "/v1/assip/auto",   "/v1/assip/manual",
-          "/v1/quicksetup",  "/v1/config/config",    "/v1/export/debif", "/v1/gencert"}) {
+          "/v1/quicksetup",  "/v1/config/config",    "/v1/export/debif", "/v1/gencert"})
         QTest::newRow(path) << path << true;
-    }
     for (const char *path : {"/v1/config/get", "/v1/site/list", "/v1/dev/list", "/v1/dev/scanout",
-                             "/v1/dstatus/list", "/v1/task/list", "/v1/alarm/list", "/v1/cgi/list"}) {
+                             "/v1/dstatus/list", "/v1/task/list", "/v1/alarm/list", "/v1/cgi/list"})
         QTest::newRow(path) << path << false;
-    }
 }
 
 void EmulatorServiceTest::permission() {
@@ -303,9 +296,8 @@ void EmulatorServiceTest::siteCommit() {
     const Json sent = Json::parse(sites.toStdString());
     QCOMPARE(boss.call("/v1/site/commit", {{"state", "all"}, {"sites", sent}}).code, code);
     const bool deletes = withMember(sent, "deleted", true) != nullptr;
-    if (code == 0 && !deletes) {
+    if (code == 0 && !deletes)
         expected.insert(expected.end(), sent.begin(), sent.end());
-    }
     COMPARE_JSON(boss.list("/v1/site/list", 5), expected);
 }
 
@@ -407,11 +399,9 @@ void EmulatorServiceTest::batchStage_data() {
     QTest::addColumn<QString>("list");
     QTest::addColumn<QString>("state");
     for (const auto &[path, list] :
-         {std::pair("/v1/dev/commit", "devices"), std::pair("/v1/site/commit", "sites")}) {
-        for (const char *state : {"update", "end", "begin", "", "ALL"}) {
+         {std::pair("/v1/dev/commit", "devices"), std::pair("/v1/site/commit", "sites")})
+        for (const char *state : {"update", "end", "begin", "", "ALL"})
             QTest::addRow("%s \"%s\"", path, state) << path << list << state;
-        }
-    }
 }
 
 void EmulatorServiceTest::batchStage() {

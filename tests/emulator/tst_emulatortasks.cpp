@@ -100,9 +100,8 @@ private slots:
                                             {{"rp_keepnum", 2.5}},
                                             {{"nf_alarms", 1}},
                                             {{"ui_lang", nullptr}},
-                                            {{"nf_tasks", false}, {"rp_auto", "no"}}})) {
+                                            {{"nf_tasks", false}, {"rp_auto", "no"}}}))
             QVERIFY2(code("/v1/config/set", bad) == 3, bad.dump().c_str());
-        }
         COMPARE_JSON(m_caller.call("/v1/config/get").data.at("nf_tasks"), true);
         QCOMPARE(log().size(), all);
         QCOMPARE(code("/v1/config/set", {{"days", 4}, {"color", 7}, {"nf_tasks", true}}), 0);

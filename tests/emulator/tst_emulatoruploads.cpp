@@ -67,9 +67,8 @@ class EmulatorUploadsTest : public FleetTest {
 
 private slots:
     void init() {
-        if (!m_emulator) {
+        if (!m_emulator)
             fresh({"--task-pace", "20", "--upload-limit", "50000000"});
-        }
         QCOMPARE(tell("faults clear"), QString("ok"));
     }
 
@@ -210,9 +209,8 @@ private slots:
                                              {'a', {"ca_", "ca.pem", other.certificate}},
                                              {'A', {"ca_", "ca.pem", ""}}};
         std::vector<File> form;
-        for (const QChar letter : files) {
+        for (const QChar letter : files)
             form.push_back(known.at(letter));
-        }
         change({{"d_has_matching_private_key", hasKey},
                 {"d_has_matching_cert_request", false},
                 {"https_enable", false},
@@ -223,16 +221,14 @@ private slots:
                                    {"pass", ServiceCaller::cipheredPassword("secret")}});
         const int code = send("/v1/" + path.toStdString(), {{"tid", task.at("tid")}}, form);
         QCOMPARE(code, state == "refused" ? 3 : 0);
-        if (code != 0) {
+        if (code != 0)
             return;
-        }
         QCOMPARE(QString::fromStdString(outcomes()[0]), state);
         const Json after = record(0);
         const bool https = path.startsWith("ssl");
         COMPARE_JSON(after.at(https ? "https_enable" : "ieee8021x_enable"), state == done);
-        if (state == done) {
+        if (state == done)
             COMPARE_JSON(after.at(https ? "d_cert_expires" : "d_8021x_expires"), 1900000000000);
-        }
         if (state == done && https) {
             COMPARE_JSON(after.at("d_https"), 8444);
             COMPARE_JSON(after.at("d_cert_subject"), "CN=gate");
@@ -260,9 +256,8 @@ private slots:
     /// A file that looks like its frame, longer than anything that is kept of it.
     void streamed() {
         std::string content;
-        while (content.size() < 40000000) {
+        while (content.size() < 40000000)
             content += "\r\n--a-line-that-no-file-hold\r\n\r" + std::to_string(content.size()) + "\r";
-        }
         const Json task = newTask("deviceConfigFileUpload", 1);
         const Json parameters = {{"tid", task.at("tid")}, {"device_ids", {m_devices[0].at("id")}}};
         QCOMPARE(send("/v1/config_file_upload", parameters, {{"fimage", "\xc3\xa4.cfg", content}}), 0);
@@ -322,9 +317,8 @@ private slots:
         QFETCH(QString, fault);
         QFETCH(int, size);
         QFETCH(QString, parameters);
-        if (!fault.isEmpty()) {
+        if (!fault.isEmpty())
             QCOMPARE(tell("fault " + fault + "@/v1/fwupl"), QString("ok"));
-        }
         Json members = {{"tid", newTask("deviceFWUpgrade", 1).at("tid")}};
         members.update(Json::parse(parameters.toStdString()));
         const Reply reply =
