@@ -18,6 +18,8 @@
 #include <QSpinBox>
 #include <QToolButton>
 
+#include <nlohmann/json.hpp>
+
 namespace {
 
 const char *account = "admin@norvell.example";
