@@ -1477,25 +1477,6 @@
     </message>
 </context>
 <context>
-    <name>DeviceTabsCorner</name>
-    <message>
-        <source>Search devices</source>
-        <translation>Geräte suchen</translation>
-    </message>
-    <message>
-        <source>Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range (10.4.0.10-20); a MAC address</source>
-        <translation>Modell, Hostname, Firmware oder Standort; eine IP-Adresse, ein Netz (10.4.0.0/16) oder ein Bereich (10.4.0.10-20); eine MAC-Adresse</translation>
-    </message>
-    <message>
-        <source>Remote connection</source>
-        <translation>Remoteverbindung</translation>
-    </message>
-    <message>
-        <source>Columns</source>
-        <translation>Spalten</translation>
-    </message>
-</context>
-<context>
     <name>CrashDialog</name>
     <message>
         <source>Unexpected End</source>
@@ -1977,122 +1958,22 @@
     </message>
 </context>
 <context>
-    <name>DeviceToolBar</name>
+    <name>DeviceTabsCorner</name>
     <message>
-        <source>Add Device</source>
-        <translation>Gerät hinzufügen</translation>
+        <source>Search devices</source>
+        <translation>Geräte suchen</translation>
     </message>
     <message>
-        <source>Authorize Device</source>
-        <translation>Gerät autorisieren</translation>
+        <source>Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range (10.4.0.10-20); a MAC address</source>
+        <translation>Modell, Hostname, Firmware oder Standort; eine IP-Adresse, ein Netz (10.4.0.0/16) oder ein Bereich (10.4.0.10-20); eine MAC-Adresse</translation>
     </message>
     <message>
-        <source>Set Password</source>
-        <translation>Passwort festlegen</translation>
+        <source>Remote connection</source>
+        <translation>Remoteverbindung</translation>
     </message>
     <message>
-        <source>Assign IP Address</source>
-        <translation>IP-Adresse zuweisen</translation>
-    </message>
-    <message>
-        <source>Upload</source>
-        <translation>Hochladen</translation>
-    </message>
-    <message>
-        <source>Quick Setup</source>
-        <translation>Schnelleinrichtung</translation>
-    </message>
-    <message>
-        <source>Set Configuration</source>
-        <translation>Konfiguration setzen</translation>
-    </message>
-    <message>
-        <source>Backup Configuration</source>
-        <translation>Konfiguration sichern</translation>
-    </message>
-    <message>
-        <source>Restart Device</source>
-        <translation>Gerät neu starten</translation>
-    </message>
-    <message>
-        <source>Restore Device</source>
-        <translation>Gerät zurücksetzen</translation>
-    </message>
-    <message>
-        <source>Replace Device</source>
-        <translation>Gerät ersetzen</translation>
-    </message>
-    <message>
-        <source>Export</source>
-        <translation>Exportieren</translation>
-    </message>
-    <message>
-        <source>Refresh</source>
-        <translation>Aktualisieren</translation>
-    </message>
-    <message>
-        <source>Delete Device</source>
-        <translation>Gerät löschen</translation>
-    </message>
-    <message>
-        <source>Export Device List</source>
-        <translation>Geräteliste exportieren</translation>
-    </message>
-    <message>
-        <source>Export Debug Info</source>
-        <translation>Debug-Infos exportieren</translation>
-    </message>
-    <message>
-        <source>Upload Firmware</source>
-        <translation>Firmware hochladen</translation>
-    </message>
-    <message>
-        <source>Upload Package</source>
-        <translation>Paket hochladen</translation>
-    </message>
-    <message>
-        <source>Upload Configuration File</source>
-        <translation>Konfigurationsdatei hochladen</translation>
-    </message>
-    <message>
-        <source>Upload Certificate</source>
-        <translation>Zertifikat hochladen</translation>
-    </message>
-    <message>
-        <source>HTTPS</source>
-        <translation>HTTPS</translation>
-    </message>
-    <message>
-        <source>IEEE 802.1x</source>
-        <translation>IEEE 802.1x</translation>
-    </message>
-    <message>
-        <source>Create Template</source>
-        <translation>Vorlage erstellen</translation>
-    </message>
-    <message>
-        <source>Import Template</source>
-        <translation>Vorlage importieren</translation>
-    </message>
-    <message>
-        <source>Restore to Restore Point</source>
-        <translation>Auf Wiederherstellungspunkt zurücksetzen</translation>
-    </message>
-    <message>
-        <source>Restore to Factory Default</source>
-        <translation>Auf Werkseinstellungen zurücksetzen</translation>
-    </message>
-    <message>
-        <source>More</source>
-        <translation>Mehr</translation>
-    </message>
-    <message>
-        <source>Certificates in use</source>
-        <translation>Verwendete Zertifikate</translation>
-    </message>
-    <message>
-        <source>Not available in this version yet.</source>
-        <translation>In dieser Version noch nicht verfügbar.</translation>
+        <source>Columns</source>
+        <translation>Spalten</translation>
     </message>
 </context>
 <context>
@@ -2100,18 +1981,6 @@
     <message>
         <source>The devices are not managed any more.</source>
         <translation>Die Geräte werden nicht mehr verwaltet.</translation>
-    </message>
-    <message>
-        <source>Device List</source>
-        <translation>Geräteliste</translation>
-    </message>
-    <message>
-        <source>Save as</source>
-        <translation>Speichern unter</translation>
-    </message>
-    <message>
-        <source>CSV files (*.csv)</source>
-        <translation>CSV-Dateien (*.csv)</translation>
     </message>
     <message>
         <source>The device states could not be read. Try again.</source>
@@ -2919,6 +2788,137 @@
     </message>
 </context>
 <context>
+    <name>Operation</name>
+    <message>
+        <source>Add Device</source>
+        <translation>Gerät hinzufügen</translation>
+    </message>
+    <message>
+        <source>Authorize Device</source>
+        <translation>Gerät autorisieren</translation>
+    </message>
+    <message>
+        <source>Set Password</source>
+        <translation>Passwort festlegen</translation>
+    </message>
+    <message>
+        <source>Assign IP Address</source>
+        <translation>IP-Adresse zuweisen</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>Hochladen</translation>
+    </message>
+    <message>
+        <source>Quick Setup</source>
+        <translation>Schnelleinrichtung</translation>
+    </message>
+    <message>
+        <source>Set Configuration</source>
+        <translation>Konfiguration setzen</translation>
+    </message>
+    <message>
+        <source>Backup Configuration</source>
+        <translation>Konfiguration sichern</translation>
+    </message>
+    <message>
+        <source>Restart Device</source>
+        <translation>Gerät neu starten</translation>
+    </message>
+    <message>
+        <source>Restore Device</source>
+        <translation>Gerät zurücksetzen</translation>
+    </message>
+    <message>
+        <source>Replace Device</source>
+        <translation>Gerät ersetzen</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Exportieren</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>Aktualisieren</translation>
+    </message>
+    <message>
+        <source>Delete Device</source>
+        <translation>Gerät löschen</translation>
+    </message>
+    <message>
+        <source>Export Device List</source>
+        <translation>Geräteliste exportieren</translation>
+    </message>
+    <message>
+        <source>Export Debug Info</source>
+        <translation>Debug-Infos exportieren</translation>
+    </message>
+    <message>
+        <source>Upload Firmware</source>
+        <translation>Firmware hochladen</translation>
+    </message>
+    <message>
+        <source>Upload Package</source>
+        <translation>Paket hochladen</translation>
+    </message>
+    <message>
+        <source>Upload Configuration File</source>
+        <translation>Konfigurationsdatei hochladen</translation>
+    </message>
+    <message>
+        <source>Upload Certificate</source>
+        <translation>Zertifikat hochladen</translation>
+    </message>
+    <message>
+        <source>HTTPS</source>
+        <translation>HTTPS</translation>
+    </message>
+    <message>
+        <source>IEEE 802.1x</source>
+        <translation>IEEE 802.1x</translation>
+    </message>
+    <message>
+        <source>Create Template</source>
+        <translation>Vorlage erstellen</translation>
+    </message>
+    <message>
+        <source>Import Template</source>
+        <translation>Vorlage importieren</translation>
+    </message>
+    <message>
+        <source>Restore to Restore Point</source>
+        <translation>Auf Wiederherstellungspunkt zurücksetzen</translation>
+    </message>
+    <message>
+        <source>Restore to Factory Default</source>
+        <translation>Auf Werkseinstellungen zurücksetzen</translation>
+    </message>
+    <message>
+        <source>More</source>
+        <translation>Mehr</translation>
+    </message>
+    <message>
+        <source>Certificates in use</source>
+        <translation>Verwendete Zertifikate</translation>
+    </message>
+    <message>
+        <source>Not available in this version yet.</source>
+        <translation>In dieser Version noch nicht verfügbar.</translation>
+    </message>
+    <message>
+        <source>Device List</source>
+        <translation>Geräteliste</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>Speichern unter</translation>
+    </message>
+    <message>
+        <source>CSV files (*.csv)</source>
+        <translation>CSV-Dateien (*.csv)</translation>
+    </message>
+</context>
+<context>
     <name>OperationDialog</name>
     <message>
         <source>Cancel</source>
@@ -2990,6 +2990,13 @@
     <message>
         <source>Become a Partner</source>
         <translation>Partner werden</translation>
+    </message>
+</context>
+<context>
+    <name>PasswordChecklist</name>
+    <message>
+        <source>The devices have no policy of their own.</source>
+        <translation>Die Geräte haben keine eigene Richtlinie.</translation>
     </message>
 </context>
 <context>
@@ -3097,13 +3104,6 @@
     <message>
         <source>Browse...</source>
         <translation>Durchsuchen ...</translation>
-    </message>
-</context>
-<context>
-    <name>PasswordChecklist</name>
-    <message>
-        <source>The devices have no policy of their own.</source>
-        <translation>Die Geräte haben keine eigene Richtlinie.</translation>
     </message>
 </context>
 <context>
@@ -3358,6 +3358,29 @@
     </message>
 </context>
 <context>
+    <name>RolloutBannerRow</name>
+    <message>
+        <source>Continue</source>
+        <translation>Fortsetzen</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Anhalten</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>Ausblenden</translation>
+    </message>
+    <message>
+        <source>Begin with the other devices now</source>
+        <translation>Jetzt mit den übrigen Geräten beginnen</translation>
+    </message>
+    <message>
+        <source>Do not begin with the other devices; those at work go on</source>
+        <translation>Mit den übrigen Geräten nicht beginnen; begonnene laufen weiter</translation>
+    </message>
+</context>
+<context>
     <name>RolloutFields</name>
     <message>
         <source>In waves:</source>
@@ -3439,29 +3462,6 @@
             <numerusform>Der Server hat die Sitzung beendet. Die Verteilung von %1 geht nach der nächsten Anmeldung weiter.</numerusform>
             <numerusform>Der Server hat die Sitzung beendet. Die Verteilungen von %1 gehen nach der nächsten Anmeldung weiter.</numerusform>
         </translation>
-    </message>
-</context>
-<context>
-    <name>RolloutBannerRow</name>
-    <message>
-        <source>Continue</source>
-        <translation>Fortsetzen</translation>
-    </message>
-    <message>
-        <source>Stop</source>
-        <translation>Anhalten</translation>
-    </message>
-    <message>
-        <source>Dismiss</source>
-        <translation>Ausblenden</translation>
-    </message>
-    <message>
-        <source>Begin with the other devices now</source>
-        <translation>Jetzt mit den übrigen Geräten beginnen</translation>
-    </message>
-    <message>
-        <source>Do not begin with the other devices; those at work go on</source>
-        <translation>Mit den übrigen Geräten nicht beginnen; begonnene laufen weiter</translation>
     </message>
 </context>
 <context>
@@ -4355,24 +4355,6 @@
     </message>
 </context>
 <context>
-    <name>TargetSummary</name>
-    <message>
-        <source>Show</source>
-        <translation>Anzeigen</translation>
-    </message>
-    <message>
-        <source>%1 of %2 devices selected</source>
-        <translation>%1 von %2 Geräten ausgewählt</translation>
-    </message>
-    <message numerus="yes">
-        <source>%Ln device(s) selected</source>
-        <translation>
-            <numerusform>%Ln Gerät ausgewählt</numerusform>
-            <numerusform>%Ln Geräte ausgewählt</numerusform>
-        </translation>
-    </message>
-</context>
-<context>
     <name>TargetListDialog</name>
     <message>
         <source>Devices</source>
@@ -4404,6 +4386,24 @@
     <message>
         <source>Note</source>
         <translation>Hinweis</translation>
+    </message>
+</context>
+<context>
+    <name>TargetSummary</name>
+    <message>
+        <source>Show</source>
+        <translation>Anzeigen</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices selected</source>
+        <translation>%1 von %2 Geräten ausgewählt</translation>
+    </message>
+    <message numerus="yes">
+        <source>%Ln device(s) selected</source>
+        <translation>
+            <numerusform>%Ln Gerät ausgewählt</numerusform>
+            <numerusform>%Ln Geräte ausgewählt</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -5197,13 +5197,6 @@ Was mit Geräten getan wird, erscheint hier.</translation>
     <message>
         <source>The upload could not be started.</source>
         <translation>Das Hochladen konnte nicht gestartet werden.</translation>
-    </message>
-</context>
-<context>
-    <name>UploadDialogs</name>
-    <message>
-        <source>The devices are not managed any more.</source>
-        <translation>Die Geräte werden nicht mehr verwaltet.</translation>
     </message>
 </context>
 <context>

@@ -1455,25 +1455,6 @@
     </message>
 </context>
 <context>
-    <name>DeviceTabsCorner</name>
-    <message>
-        <source>Search devices</source>
-        <translation>デバイスを検索</translation>
-    </message>
-    <message>
-        <source>Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range (10.4.0.10-20); a MAC address</source>
-        <translation>モデル、ホスト名、ファームウェア、サイト、IP アドレス、ネットワーク (10.4.0.0/16)、範囲 (10.4.0.10-20)、MAC アドレス</translation>
-    </message>
-    <message>
-        <source>Remote connection</source>
-        <translation>リモート接続</translation>
-    </message>
-    <message>
-        <source>Columns</source>
-        <translation>列</translation>
-    </message>
-</context>
-<context>
     <name>CrashDialog</name>
     <message>
         <source>Unexpected End</source>
@@ -1943,122 +1924,22 @@
     </message>
 </context>
 <context>
-    <name>DeviceToolBar</name>
+    <name>DeviceTabsCorner</name>
     <message>
-        <source>Add Device</source>
-        <translation>デバイスの追加</translation>
+        <source>Search devices</source>
+        <translation>デバイスを検索</translation>
     </message>
     <message>
-        <source>Authorize Device</source>
-        <translation>デバイスの認証</translation>
+        <source>Model, host name, firmware or site; an IP address, network (10.4.0.0/16) or range (10.4.0.10-20); a MAC address</source>
+        <translation>モデル、ホスト名、ファームウェア、サイト、IP アドレス、ネットワーク (10.4.0.0/16)、範囲 (10.4.0.10-20)、MAC アドレス</translation>
     </message>
     <message>
-        <source>Set Password</source>
-        <translation>パスワードの設定</translation>
+        <source>Remote connection</source>
+        <translation>リモート接続</translation>
     </message>
     <message>
-        <source>Assign IP Address</source>
-        <translation>IPの割り当て</translation>
-    </message>
-    <message>
-        <source>Upload</source>
-        <translation>アップロード</translation>
-    </message>
-    <message>
-        <source>Quick Setup</source>
-        <translation>クイック設定</translation>
-    </message>
-    <message>
-        <source>Set Configuration</source>
-        <translation>構成の設定</translation>
-    </message>
-    <message>
-        <source>Backup Configuration</source>
-        <translation>構成のバックアップ</translation>
-    </message>
-    <message>
-        <source>Restart Device</source>
-        <translation>デバイスの再起動</translation>
-    </message>
-    <message>
-        <source>Restore Device</source>
-        <translation>デバイスの復元</translation>
-    </message>
-    <message>
-        <source>Replace Device</source>
-        <translation>デバイスの交換</translation>
-    </message>
-    <message>
-        <source>Export</source>
-        <translation>エクスポート</translation>
-    </message>
-    <message>
-        <source>Refresh</source>
-        <translation>更新</translation>
-    </message>
-    <message>
-        <source>Delete Device</source>
-        <translation>デバイスの削除</translation>
-    </message>
-    <message>
-        <source>Export Device List</source>
-        <translation>デバイス一覧をエクスポート</translation>
-    </message>
-    <message>
-        <source>Export Debug Info</source>
-        <translation>デバッグ情報をエクスポート</translation>
-    </message>
-    <message>
-        <source>Upload Firmware</source>
-        <translation>ファームウェアをアップロード</translation>
-    </message>
-    <message>
-        <source>Upload Package</source>
-        <translation>パッケージをアップロード</translation>
-    </message>
-    <message>
-        <source>Upload Configuration File</source>
-        <translation>構成ファイルをアップロード</translation>
-    </message>
-    <message>
-        <source>Upload Certificate</source>
-        <translation>証明書をアップロード</translation>
-    </message>
-    <message>
-        <source>HTTPS</source>
-        <translation>HTTPS</translation>
-    </message>
-    <message>
-        <source>IEEE 802.1x</source>
-        <translation>IEEE 802.1x</translation>
-    </message>
-    <message>
-        <source>Create Template</source>
-        <translation>テンプレートの作成</translation>
-    </message>
-    <message>
-        <source>Import Template</source>
-        <translation>テンプレートのインポート</translation>
-    </message>
-    <message>
-        <source>Restore to Restore Point</source>
-        <translation>復元ポイントに復元</translation>
-    </message>
-    <message>
-        <source>Restore to Factory Default</source>
-        <translation>工場出荷時の設定に復元</translation>
-    </message>
-    <message>
-        <source>More</source>
-        <translation>その他</translation>
-    </message>
-    <message>
-        <source>Certificates in use</source>
-        <translation>使用中の証明書</translation>
-    </message>
-    <message>
-        <source>Not available in this version yet.</source>
-        <translation>このバージョンではまだ利用できません。</translation>
+        <source>Columns</source>
+        <translation>列</translation>
     </message>
 </context>
 <context>
@@ -2066,18 +1947,6 @@
     <message>
         <source>The devices are not managed any more.</source>
         <translation>デバイスは管理されなくなっています。</translation>
-    </message>
-    <message>
-        <source>Device List</source>
-        <translation>デバイス一覧</translation>
-    </message>
-    <message>
-        <source>Save as</source>
-        <translation>名前を付けて保存</translation>
-    </message>
-    <message>
-        <source>CSV files (*.csv)</source>
-        <translation>CSV ファイル (*.csv)</translation>
     </message>
     <message>
         <source>The device states could not be read. Try again.</source>
@@ -2879,6 +2748,137 @@
     </message>
 </context>
 <context>
+    <name>Operation</name>
+    <message>
+        <source>Add Device</source>
+        <translation>デバイスの追加</translation>
+    </message>
+    <message>
+        <source>Authorize Device</source>
+        <translation>デバイスの認証</translation>
+    </message>
+    <message>
+        <source>Set Password</source>
+        <translation>パスワードの設定</translation>
+    </message>
+    <message>
+        <source>Assign IP Address</source>
+        <translation>IPの割り当て</translation>
+    </message>
+    <message>
+        <source>Upload</source>
+        <translation>アップロード</translation>
+    </message>
+    <message>
+        <source>Quick Setup</source>
+        <translation>クイック設定</translation>
+    </message>
+    <message>
+        <source>Set Configuration</source>
+        <translation>構成の設定</translation>
+    </message>
+    <message>
+        <source>Backup Configuration</source>
+        <translation>構成のバックアップ</translation>
+    </message>
+    <message>
+        <source>Restart Device</source>
+        <translation>デバイスの再起動</translation>
+    </message>
+    <message>
+        <source>Restore Device</source>
+        <translation>デバイスの復元</translation>
+    </message>
+    <message>
+        <source>Replace Device</source>
+        <translation>デバイスの交換</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>エクスポート</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>更新</translation>
+    </message>
+    <message>
+        <source>Delete Device</source>
+        <translation>デバイスの削除</translation>
+    </message>
+    <message>
+        <source>Export Device List</source>
+        <translation>デバイス一覧をエクスポート</translation>
+    </message>
+    <message>
+        <source>Export Debug Info</source>
+        <translation>デバッグ情報をエクスポート</translation>
+    </message>
+    <message>
+        <source>Upload Firmware</source>
+        <translation>ファームウェアをアップロード</translation>
+    </message>
+    <message>
+        <source>Upload Package</source>
+        <translation>パッケージをアップロード</translation>
+    </message>
+    <message>
+        <source>Upload Configuration File</source>
+        <translation>構成ファイルをアップロード</translation>
+    </message>
+    <message>
+        <source>Upload Certificate</source>
+        <translation>証明書をアップロード</translation>
+    </message>
+    <message>
+        <source>HTTPS</source>
+        <translation>HTTPS</translation>
+    </message>
+    <message>
+        <source>IEEE 802.1x</source>
+        <translation>IEEE 802.1x</translation>
+    </message>
+    <message>
+        <source>Create Template</source>
+        <translation>テンプレートの作成</translation>
+    </message>
+    <message>
+        <source>Import Template</source>
+        <translation>テンプレートのインポート</translation>
+    </message>
+    <message>
+        <source>Restore to Restore Point</source>
+        <translation>復元ポイントに復元</translation>
+    </message>
+    <message>
+        <source>Restore to Factory Default</source>
+        <translation>工場出荷時の設定に復元</translation>
+    </message>
+    <message>
+        <source>More</source>
+        <translation>その他</translation>
+    </message>
+    <message>
+        <source>Certificates in use</source>
+        <translation>使用中の証明書</translation>
+    </message>
+    <message>
+        <source>Not available in this version yet.</source>
+        <translation>このバージョンではまだ利用できません。</translation>
+    </message>
+    <message>
+        <source>Device List</source>
+        <translation>デバイス一覧</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>名前を付けて保存</translation>
+    </message>
+    <message>
+        <source>CSV files (*.csv)</source>
+        <translation>CSV ファイル (*.csv)</translation>
+    </message>
+</context>
+<context>
     <name>OperationDialog</name>
     <message>
         <source>Cancel</source>
@@ -2947,6 +2947,13 @@
     <message>
         <source>Become a Partner</source>
         <translation>パートナーに登録してください</translation>
+    </message>
+</context>
+<context>
+    <name>PasswordChecklist</name>
+    <message>
+        <source>The devices have no policy of their own.</source>
+        <translation>デバイスに固有のポリシーはありません。</translation>
     </message>
 </context>
 <context>
@@ -3053,13 +3060,6 @@
     <message>
         <source>Browse...</source>
         <translation>参照...</translation>
-    </message>
-</context>
-<context>
-    <name>PasswordChecklist</name>
-    <message>
-        <source>The devices have no policy of their own.</source>
-        <translation>デバイスに固有のポリシーはありません。</translation>
     </message>
 </context>
 <context>
@@ -3312,6 +3312,29 @@
     </message>
 </context>
 <context>
+    <name>RolloutBannerRow</name>
+    <message>
+        <source>Continue</source>
+        <translation>続行</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>停止</translation>
+    </message>
+    <message>
+        <source>Dismiss</source>
+        <translation>閉じる</translation>
+    </message>
+    <message>
+        <source>Begin with the other devices now</source>
+        <translation>残りのデバイスを今すぐ開始</translation>
+    </message>
+    <message>
+        <source>Do not begin with the other devices; those at work go on</source>
+        <translation>残りのデバイスを開始しない (実行中のデバイスは継続)</translation>
+    </message>
+</context>
+<context>
     <name>RolloutFields</name>
     <message>
         <source>In waves:</source>
@@ -3391,29 +3414,6 @@
         <translation>
             <numerusform>サーバーがセッションを終了しました。%1 の展開は次回のログイン後に再開します。</numerusform>
         </translation>
-    </message>
-</context>
-<context>
-    <name>RolloutBannerRow</name>
-    <message>
-        <source>Continue</source>
-        <translation>続行</translation>
-    </message>
-    <message>
-        <source>Stop</source>
-        <translation>停止</translation>
-    </message>
-    <message>
-        <source>Dismiss</source>
-        <translation>閉じる</translation>
-    </message>
-    <message>
-        <source>Begin with the other devices now</source>
-        <translation>残りのデバイスを今すぐ開始</translation>
-    </message>
-    <message>
-        <source>Do not begin with the other devices; those at work go on</source>
-        <translation>残りのデバイスを開始しない (実行中のデバイスは継続)</translation>
     </message>
 </context>
 <context>
@@ -4303,23 +4303,6 @@
     </message>
 </context>
 <context>
-    <name>TargetSummary</name>
-    <message>
-        <source>Show</source>
-        <translation>表示</translation>
-    </message>
-    <message>
-        <source>%1 of %2 devices selected</source>
-        <translation>%2 台中 %1 台のデバイスを選択</translation>
-    </message>
-    <message numerus="yes">
-        <source>%Ln device(s) selected</source>
-        <translation>
-            <numerusform>%Ln 台のデバイスを選択</numerusform>
-        </translation>
-    </message>
-</context>
-<context>
     <name>TargetListDialog</name>
     <message>
         <source>Devices</source>
@@ -4351,6 +4334,23 @@
     <message>
         <source>Note</source>
         <translation>備考</translation>
+    </message>
+</context>
+<context>
+    <name>TargetSummary</name>
+    <message>
+        <source>Show</source>
+        <translation>表示</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices selected</source>
+        <translation>%2 台中 %1 台のデバイスを選択</translation>
+    </message>
+    <message numerus="yes">
+        <source>%Ln device(s) selected</source>
+        <translation>
+            <numerusform>%Ln 台のデバイスを選択</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -5140,13 +5140,6 @@ What is done to devices shows here.</source>
     <message>
         <source>The upload could not be started.</source>
         <translation>アップロードを開始できませんでした。</translation>
-    </message>
-</context>
-<context>
-    <name>UploadDialogs</name>
-    <message>
-        <source>The devices are not managed any more.</source>
-        <translation>デバイスは管理されなくなっています。</translation>
     </message>
 </context>
 <context>

@@ -1,9 +1,7 @@
 #include "app/frame/mainwindow.h"
 
 #include "app/frame/sidepanel.h"
-#include "devices/operations/rollout/rolloutbanner.h"
 #include "devices/page/devicewindow.h"
-#include "devices/page/uploaddialogs.h"
 #include "pages/log/logwindow.h"
 #include "pages/settings/settingwindow.h"
 #include "tasks/panels/alarmpanel.h"
@@ -76,8 +74,6 @@ MainWindow::MainWindow(QWidget *parent)
     connectPanels();
     connectPostWork();
     connectFailedOperations();
-    new UploadDialogs(m_deviceWindow);
-    m_deviceWindow->addStrip(new RolloutBanner(m_deviceWindow));
 }
 
 MainWindow::~MainWindow() {

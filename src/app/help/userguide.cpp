@@ -5,6 +5,7 @@
 #include <QFileInfo>
 #include <QHash>
 #include <QUrl>
+#include <QVariant>
 #include <QWidget>
 
 namespace UserGuide {
@@ -18,34 +19,20 @@ const QHash<QString, QString> &pages() {
     static const QHash<QString, QString> names{
         {"AccountManagementDialog", "accounts.html"},
         {"AccountSetupDialog", "first-start.html"},
-        {"AddDeviceDialog", "adding-devices.html"},
         {"AddDeviceManualDialog", "adding-devices.html"},
         {"AddServerDialog", "servers.html"},
-        {"AssignIpDialogII", "addresses.html"},
-        {"AuthorizeDeviceDialog", "authorizing.html"},
-        {"CertificatesDialog", "certificates.html"},
         {"CrashDialog", "troubleshooting.html"},
         {"DeviceWindow", "device-page.html"},
         {"EditServerDialog", "servers.html"},
-        {"ExportDebugInfoDialog", "exporting.html"},
         {"InvalidDeviceDialog", "adding-devices.html"},
         {"LogWindow", "logs.html"},
         {"LoginDialog", "first-start.html"},
-        {"PasswordPolicyDialog", "authorizing.html"},
-        {"QuickSetupDialog", "uploads.html"},
         {"ReconnectingDialog", "troubleshooting.html"},
         {"RemoteConnectionDialog", "servers.html"},
-        {"RestoreDeviceDialog", "restarting.html"},
         {"ServiceManagementAddServiceDialog", "remote-access.html"},
         {"ServiceManagementStatusDialog", "remote-access.html"},
-        {"SetPasswordDialog", "authorizing.html"},
         {"SettingWindow", "settings.html"},
         {"SettingsChangedDialog", "settings.html"},
-        {"UploadConfigurationDialog", "uploads.html"},
-        {"UploadFirmwareDialog", "firmware.html"},
-        {"UploadHttpsDialog", "certificates.html"},
-        {"UploadIeeeDialog", "certificates.html"},
-        {"UploadPackageDialog", "uploads.html"},
         {"alarmPanel", "alarms.html"},
         {"deviceSearchEdit", "searching.html"},
         {"rolloutStrip", "firmware.html"},
@@ -70,6 +57,9 @@ QString folder() {
 
 QString pageFor(const QWidget *widget) {
     for (; widget; widget = widget->parentWidget()) {
+        // The dialogs of operations carry theirs.
+        if (const QString page = widget->property("helpPage").toString(); !page.isEmpty())
+            return page;
         if (const QString page = pages().value(widget->objectName()); !page.isEmpty())
             return page;
     }

@@ -2,7 +2,10 @@
 
 #include "devices/operations/credentialfields.h"
 #include "devices/operations/credentialrules.h"
+#include "devices/operations/deviceactions.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/targetsummary.h"
+#include "platform/log/messagelog.h"
 #include "widgets/controls/passwordedit.h"
 
 #include <QComboBox>
@@ -56,3 +59,31 @@ void AuthorizeDeviceDialog::apply() {
     emit authDevices(name, password);
     accept();
 }
+
+namespace {
+
+void onAuthDevices(DeviceActions *actions, const QStringList &ids, const QString &name,
+                   const QString &password) {
+    qDebug("onAuthDevices, username : %s, password: %s", qUtf8Printable(name),
+           MessageLog::secret(password).constData());
+    actions->authorize(ids, name, password);
+}
+
+QDialog *openAuthorize(OperationContext &context, OperationRequest request) {
+    auto *dialog = new AuthorizeDeviceDialog(std::move(request.targets), context.dialogParent());
+    QObject::connect(dialog, &AuthorizeDeviceDialog::authDevices, context.actions(),
+                     [actions = context.actions(), dialog](const QString &name, const QString &password) {
+                         onAuthDevices(actions, dialog->deviceIds(), name, password);
+                     });
+    return dialog;
+}
+
+} // namespace
+
+const Operation Operations::authorize{.objectName = "authorizeButton",
+                                      .text = QT_TRANSLATE_NOOP("Operation", "Authorize Device"),
+                                      .icon = "tool_authorize_line",
+                                      .group = Operation::Group::DeviceButtons,
+                                      .needs = Operation::Needs::Selection,
+                                      .helpPage = "authorizing.html",
+                                      .open = openAuthorize};

@@ -145,7 +145,7 @@ void DeviceActions::changePassword(const QStringList &deviceIds, const QString &
            },
            [actions = QPointer(this)](const QStringList &ids) {
                if (actions)
-                   emit actions->passwordWanted(ids);
+                   emit actions->inputNeeded(TaskType::changePassword, ids);
            },
            {}});
 }

@@ -48,8 +48,8 @@ signals:
     void devicesDeleted();
     /// States of devices have changed that the next poll shows.
     void statesChanged();
-    /// The user wants to change the password of these devices again; it was not kept.
-    void passwordWanted(const QStringList &deviceIds);
+    /// A task of the type is to be tried again for these devices, and needs what was not kept.
+    void inputNeeded(const QString &taskType, const QStringList &deviceIds);
     /// The operation could not begin; the message says which and why.
     void failed(const QString &message);
 

@@ -1,5 +1,7 @@
 #include "devices/operations/restoredevicedialog.h"
 
+#include "devices/operations/deviceactions.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/targetsummary.h"
 
 #include <QCheckBox>
@@ -84,3 +86,34 @@ void RestoreDeviceDialog::apply() {
     emit restoreDevice(values[0], values[1], values[2], values[3], values[4], values[5]);
     accept();
 }
+
+namespace {
+
+void onRestoreDevice(DeviceActions *actions, const QStringList &ids,
+                     const DeviceOperations::RestoreOptions &options) {
+    const auto &[network, daylightSaving, language, nadp, focus, lens] = options;
+    qDebug("onRestoreDevice: network: %d, daylight: %d, lan: %d, nadp: %d, focus: %d, lens: %d", network,
+           daylightSaving, language, nadp, focus, lens);
+    actions->restore(ids, options);
+}
+
+QDialog *openFactoryDefault(OperationContext &context, OperationRequest request) {
+    auto *dialog = new RestoreDeviceDialog(std::move(request.targets), context.dialogParent());
+    QObject::connect(
+        dialog, &RestoreDeviceDialog::restoreDevice, context.actions(),
+        [actions = context.actions(), dialog](int net, int dst, int lang, int nadp, int focus, int lens) {
+            onRestoreDevice(actions, dialog->deviceIds(), {net, dst, lang, nadp, focus, lens});
+        });
+    return dialog;
+}
+
+} // namespace
+
+const Operation Operations::factoryDefault{.objectName = "factoryDefaultAction",
+                                           .text =
+                                               QT_TRANSLATE_NOOP("Operation", "Restore to Factory Default"),
+                                           .group = Operation::Group::RestoreMenu,
+                                           .needs = Operation::Needs::Selection,
+                                           .taskTypes = {"deviceRestore"},
+                                           .helpPage = "restarting.html",
+                                           .open = openFactoryDefault};

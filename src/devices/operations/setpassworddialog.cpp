@@ -4,9 +4,11 @@
 #include "devices/operations/credentialrules.h"
 #include "devices/operations/deviceactions.h"
 #include "devices/operations/deviceoperations.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/passwordchecklist.h"
 #include "devices/operations/passwordpolicydialog.h"
 #include "devices/operations/targetsummary.h"
+#include "platform/log/messagelog.h"
 #include "widgets/controls/passwordedit.h"
 
 #include <QComboBox>
@@ -208,3 +210,37 @@ void SetPasswordDialog::onApplyPolicy(int length, int type) {
     };
     m_actions->setPasswordPolicy(targets().tickedIds(), policy, m_netTask.get(), begun);
 }
+
+namespace {
+
+void onSetPassword(DeviceActions *actions, const JSON &devices, const QString &name,
+                   const QString &password) {
+    qDebug("onSetPassword: name: %s, password: %s", qUtf8Printable(name),
+           MessageLog::secret(password).constData());
+    QStringList ids;
+    for (const JSON &id : devices)
+        ids += QString::fromStdString(id.get<std::string>());
+    actions->changePassword(ids, name, password);
+}
+
+QDialog *openSetPassword(OperationContext &context, OperationRequest request) {
+    auto *dialog =
+        new SetPasswordDialog(std::move(request.targets), context.actions(), context.dialogParent());
+    QObject::connect(
+        dialog, &SetPasswordDialog::setPassword, context.actions(),
+        [actions = context.actions()](const JSON &devices, const QString &name, const QString &password) {
+            onSetPassword(actions, devices, name, password);
+        });
+    return dialog;
+}
+
+} // namespace
+
+const Operation Operations::setPassword{.objectName = "setPasswordButton",
+                                        .text = QT_TRANSLATE_NOOP("Operation", "Set Password"),
+                                        .icon = "tool_set_password_line",
+                                        .group = Operation::Group::DeviceButtons,
+                                        .needs = Operation::Needs::Selection,
+                                        .taskTypes = {"deviceChangePass"},
+                                        .helpPage = "authorizing.html",
+                                        .open = openSetPassword};

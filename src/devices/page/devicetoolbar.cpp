@@ -1,10 +1,10 @@
 #include "devices/page/devicetoolbar.h"
 
+#include "devices/operations/operations.h"
 #include "widgets/controls/popupmenu.h"
 #include "widgets/style/icons.h"
 #include "widgets/style/theme.h"
 
-#include <QCoreApplication>
 #include <QHBoxLayout>
 #include <QPainter>
 #include <QStyleOptionToolButton>
@@ -46,7 +46,8 @@ protected:
             option.state &= ~QStyle::State_MouseOver;
         QStylePainter painter(this);
         painter.drawComplexControl(QStyle::CC_ToolButton, option);
-        const QRect iconRect((width() - buttonIconSize.width()) / 2, 8, buttonIconSize.width(), buttonIconSize.height());
+        const QRect iconRect((width() - buttonIconSize.width()) / 2, 8, buttonIconSize.width(),
+                             buttonIconSize.height());
         const QIcon::Mode mode = !isEnabled()   ? QIcon::Disabled
                                  : underMouse() ? QIcon::Active
                                                 : QIcon::Normal;
@@ -69,34 +70,6 @@ private:
     }
 };
 
-struct Operation {
-    const char *name;
-    const char *text;
-    const char *icon;
-    bool groupBegins = false;
-    /// What it does comes with a later version: it is always off, and the first to give way.
-    bool isPlanned = false;
-};
-
-constexpr Operation operations[] = {
-    {"addDeviceButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Add Device"), "tool_add_device_line"},
-    {"authorizeButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Authorize Device"), "tool_authorize_line"},
-    {"setPasswordButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Set Password"), "tool_set_password_line"},
-    {"ipButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Assign IP Address"), "tool_assign_ip_line"},
-    {"uploadButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Upload"), "tool_upload_line", true},
-    {"quickSettingButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Quick Setup"), "tool_quick_setup_line"},
-    {"setConfigurationButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Set Configuration"),
-     "tool_set_configuration_line", false, true},
-    {"backupConfigurationButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Backup Configuration"),
-     "tool_backup_configuration_line", false, true},
-    {"restartButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Restart Device"), "tool_restart_line", true},
-    {"restoreButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Restore Device"), "tool_restore_line"},
-    {"replaceButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Replace Device"), "tool_replace_line", false, true},
-    {"exportButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Export"), "tool_export_line", true},
-    {"refreshButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Refresh"), "tool_refresh_line"},
-    {"deleteButton", QT_TRANSLATE_NOOP("DeviceToolBar", "Delete Device"), "tool_delete_line"},
-};
-
 /// Stands for a button that does not fit, in the menu of those.
 void addSubstitute(QMenu *menu, QToolButton *button) {
     if (button->menu()) {
@@ -109,18 +82,8 @@ void addSubstitute(QMenu *menu, QToolButton *button) {
     menu->actions().constLast()->setToolTip(button->toolTip());
 }
 
-struct Entry {
-    const char *name;
-    QString text;
-};
-
-/// Entries are enabled by whoever carries them out, like buttons.
-void addEntries(QMenu *menu, std::initializer_list<Entry> entries) {
-    for (const Entry &entry : entries) {
-        QAction *action = menu->addAction(entry.text);
-        action->setObjectName(QLatin1String(entry.name));
-        action->setEnabled(false);
-    }
+bool isPlanned(const Operation *operation) {
+    return operation->needs == Operation::Needs::LaterVersion;
 }
 
 } // namespace
@@ -130,59 +93,92 @@ DeviceToolBar::DeviceToolBar(QWidget *parent) : QFrame(parent) {
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 6);
     layout->setSpacing(buttonGap);
-    for (const Operation &operation : operations) {
-        if (operation.groupBegins)
+    for (const Operation *operation : Operations::all()) {
+        if (!operation->isButton())
+            continue;
+        if (beginsGroup(operation))
             layout->addSpacing(groupGap);
-        auto *button = new OperationButton(this);
-        button->setObjectName(QLatin1String(operation.name));
-        button->setText(QCoreApplication::translate("DeviceToolBar", operation.text));
-        button->setAccessibleName(button->text());
-        button->setIcon(
-            Icons::icon(QStringLiteral(":/images/%1.svg").arg(QLatin1String(operation.icon)), buttonIconSize));
-        button->setPopupMode(QToolButton::InstantPopup);
-        button->setFocusPolicy(Qt::TabFocus);
-        button->setEnabled(false);
-        if (operation.isPlanned)
-            button->setToolTip(tr("Not available in this version yet."));
+        QToolButton *button = addButton(*operation);
         layout->addWidget(button);
-        m_buttons.push_back(button);
+        m_buttons.push_back({operation, button});
     }
     buildMoreButton();
     layout->addStretch();
+    for (const Operation *operation : Operations::all()) {
+        if (operation->group == Operation::Group::RowMenu)
+            m_rowActions.push_back(makeAction(*operation, this));
+    }
+}
 
-    auto *exportMenu = new PopupMenu(this);
-    addEntries(exportMenu, {{"exportDeviceListAction", tr("Export Device List")},
-                            {"exportDebugInfoAction", tr("Export Debug Info")}});
-    button(QStringLiteral("exportButton"))->setMenu(exportMenu);
-    auto *uploadMenu = new PopupMenu(this);
-    addEntries(uploadMenu, {{"uploadFirmwareAction", tr("Upload Firmware")},
-                            {"uploadPackageAction", tr("Upload Package")},
-                            {"uploadConfigurationAction", tr("Upload Configuration File")}});
-    auto *certificateMenu = new PopupMenu(uploadMenu);
-    certificateMenu->setTitle(tr("Upload Certificate"));
-    addEntries(certificateMenu,
-               {{"uploadHttpsAction", tr("HTTPS")}, {"uploadIeeeAction", tr("IEEE 802.1x")}});
-    uploadMenu->addMenu(certificateMenu);
-    button(QStringLiteral("uploadButton"))->setMenu(uploadMenu);
-    auto *configurationMenu = new PopupMenu(this);
-    addEntries(configurationMenu, {{"createTemplateAction", tr("Create Template")},
-                                   {"importTemplateAction", tr("Import Template")}});
-    button(QStringLiteral("setConfigurationButton"))->setMenu(configurationMenu);
-    auto *restoreMenu = new PopupMenu(this);
-    addEntries(restoreMenu, {{"restorePointAction", tr("Restore to Restore Point")},
-                             {"factoryDefaultAction", tr("Restore to Factory Default")}});
-    entry(QStringLiteral("restorePointAction"))->setToolTip(tr("Not available in this version yet."));
-    button(QStringLiteral("restoreButton"))->setMenu(restoreMenu);
-    // Certificates are looked at for all devices, so this is in the menu of the table's rows.
-    m_certificates = new QAction(tr("Certificates in use"), this);
-    m_certificates->setObjectName(QStringLiteral("certificateListAction"));
-    m_certificates->setEnabled(false);
+/// Whether a button stands apart from those before it; asked for the one that is added next.
+bool DeviceToolBar::beginsGroup(const Operation *operation) const {
+    return !m_buttons.empty() && m_buttons.back().operation->group != operation->group;
+}
+
+QToolButton *DeviceToolBar::addButton(const Operation &operation) {
+    auto *button = new OperationButton(this);
+    button->setText(operation.title());
+    button->setAccessibleName(button->text());
+    button->setIcon(
+        Icons::icon(QStringLiteral(":/images/%1.svg").arg(QLatin1String(operation.icon)), buttonIconSize));
+    button->setPopupMode(QToolButton::InstantPopup);
+    button->setFocusPolicy(Qt::TabFocus);
+    if (operation.menu)
+        button->setMenu(buildMenu(*operation.menu, this));
+    setUp(button, operation);
+    connect(button, &QToolButton::clicked, this, [this, &operation] {
+        if (operation.open)
+            emit operationChosen(operation);
+    });
+    return button;
+}
+
+QMenu *DeviceToolBar::buildMenu(Operation::Group group, QWidget *parent) {
+    auto *menu = new PopupMenu(parent);
+    for (const Operation *operation : Operations::all()) {
+        if (operation->group != group)
+            continue;
+        QAction *action = makeAction(*operation, menu);
+        menu->addAction(action);
+        if (operation->menu)
+            action->setMenu(buildMenu(*operation->menu, menu));
+    }
+    return menu;
+}
+
+QAction *DeviceToolBar::makeAction(const Operation &operation, QObject *parent) {
+    auto *action = new QAction(operation.title(), parent);
+    setUp(action, operation);
+    connect(action, &QAction::triggered, this, [this, &operation] {
+        if (operation.open)
+            emit operationChosen(operation);
+    });
+    return action;
+}
+
+/// What a button and an action have in common.
+template <typename Trigger>
+void DeviceToolBar::setUp(Trigger *trigger, const Operation &operation) {
+    trigger->setObjectName(QLatin1String(operation.objectName));
+    trigger->setToolTip(isPlanned(&operation) ? Operation::tr("Not available in this version yet.")
+                                              : QString());
+    trigger->setEnabled(operation.needs == Operation::Needs::Nothing);
+    trigger->setProperty("helpPage", QString::fromLatin1(operation.helpPage));
+    connect(this, &DeviceToolBar::fulfilledChanged, trigger,
+            [trigger, needs = operation.needs](Operation::Needs changed, bool fulfilled) {
+                if (needs == changed)
+                    trigger->setEnabled(fulfilled);
+            });
+}
+
+void DeviceToolBar::setFulfilled(Operation::Needs needs, bool fulfilled) {
+    emit fulfilledChanged(needs, fulfilled);
 }
 
 void DeviceToolBar::buildMoreButton() {
     m_more = new OperationButton(this);
     m_more->setObjectName(QStringLiteral("moreButton"));
-    m_more->setText(tr("More"));
+    m_more->setText(Operation::tr("More"));
     m_more->setAccessibleName(m_more->text());
     m_more->setIcon(Icons::icon(QStringLiteral(":/images/icon_general_more_line.svg"), buttonIconSize));
     m_more->setPopupMode(QToolButton::InstantPopup);
@@ -191,9 +187,9 @@ void DeviceToolBar::buildMoreButton() {
     auto *menu = new PopupMenu(this);
     connect(menu, &QMenu::aboutToShow, this, [this, menu] {
         menu->clear();
-        for (QToolButton *button : m_buttons) {
-            if (button->isHidden())
-                addSubstitute(menu, button);
+        for (const Button &each : m_buttons) {
+            if (each.button->isHidden())
+                addSubstitute(menu, each.button);
         }
     });
     m_more->setMenu(menu);
@@ -201,7 +197,7 @@ void DeviceToolBar::buildMoreButton() {
 }
 
 void DeviceToolBar::addOperations(QMenu *menu) const {
-    for (QToolButton *each : m_buttons) {
+    for (const auto &[operation, each] : m_buttons) {
         const QList<QAction *> entries = each->menu() ? each->menu()->actions() : QList<QAction *>();
         const bool usable =
             entries.isEmpty() || std::any_of(entries.begin(), entries.end(), [](const QAction *entry) {
@@ -211,11 +207,7 @@ void DeviceToolBar::addOperations(QMenu *menu) const {
             addSubstitute(menu, each);
     }
     menu->addSeparator();
-    menu->addAction(m_certificates);
-}
-
-QAction *DeviceToolBar::entry(const QString &objectName) const {
-    return findChild<QAction *>(objectName);
+    menu->addActions(m_rowActions);
 }
 
 QSize DeviceToolBar::minimumSizeHint() const {
@@ -231,7 +223,8 @@ void DeviceToolBar::resizeEvent(QResizeEvent *event) {
 /// nothing yet.
 void DeviceToolBar::fitButtons() {
     const auto widthOf = [this](std::size_t i) {
-        return m_buttons[i]->sizeHint().width() + buttonGap + (operations[i].groupBegins ? groupGap : 0);
+        const bool hasGap = i > 0 && m_buttons[i].operation->group != m_buttons[i - 1].operation->group;
+        return m_buttons[i].button->sizeHint().width() + buttonGap + (hasGap ? groupGap : 0);
     };
     int wanted = 0;
     for (std::size_t i = 0; i < m_buttons.size(); ++i)
@@ -241,14 +234,14 @@ void DeviceToolBar::fitButtons() {
     std::vector<bool> shown(m_buttons.size(), true);
     for (const bool planned : {true, false}) {
         for (std::size_t i = m_buttons.size(); i-- > 0 && wanted > width();) {
-            if (operations[i].isPlanned != planned)
+            if (isPlanned(m_buttons[i].operation) != planned)
                 continue;
             shown[i] = false;
             wanted -= widthOf(i);
         }
     }
     for (std::size_t i = 0; i < m_buttons.size(); ++i)
-        m_buttons[i]->setVisible(shown[i]);
+        m_buttons[i].button->setVisible(shown[i]);
     m_more->setVisible(overflow);
 }
 

@@ -1,6 +1,9 @@
 #pragma once
 
+#include "devices/operations/operation.h"
+
 #include <QFrame>
+#include <QList>
 
 #include <vector>
 
@@ -8,10 +11,9 @@ class QAction;
 class QMenu;
 class QToolButton;
 
-/// The tool bar of the console: one button an operation, four of them with a menu.
+/// The tool bar of the console: the buttons and menus of the operations, and their part of the row menu.
 ///
-/// Buttons that do not fit stand in a menu at its end. Operations are found by object name. A button is
-/// enabled by whoever carries its operation out.
+/// Buttons that do not fit move to a menu at its end.
 class DeviceToolBar : public QFrame {
     Q_OBJECT
 
@@ -22,19 +24,34 @@ public:
 
     /// Adds the operations that can be begun now to a menu.
     void addOperations(QMenu *menu) const;
-    /// The entry of a button's menu that carries the name.
-    QAction *entry(const QString &objectName) const;
+    /// Enables or disables the operations that need this.
+    void setFulfilled(Operation::Needs needs, bool fulfilled);
 
     QSize minimumSizeHint() const override;
+
+signals:
+    void operationChosen(const Operation &operation);
+    void fulfilledChanged(Operation::Needs needs, bool fulfilled);
 
 protected:
     void resizeEvent(QResizeEvent *event) override;
 
 private:
+    struct Button {
+        const Operation *operation;
+        QToolButton *button;
+    };
+
+    bool beginsGroup(const Operation *operation) const;
+    QToolButton *addButton(const Operation &operation);
+    QMenu *buildMenu(Operation::Group group, QWidget *parent);
+    QAction *makeAction(const Operation &operation, QObject *parent);
+    template <typename Trigger>
+    void setUp(Trigger *trigger, const Operation &operation);
     void buildMoreButton();
     void fitButtons();
 
-    std::vector<QToolButton *> m_buttons;
+    std::vector<Button> m_buttons;
+    QList<QAction *> m_rowActions;
     QToolButton *m_more = nullptr;
-    QAction *m_certificates = nullptr;
 };

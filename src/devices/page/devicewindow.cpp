@@ -1,16 +1,12 @@
 #include "devices/page/devicewindow.h"
 
 #include "api/session/servicerequest.h"
-#include "devices/discovery/adddevicedialog.h"
 #include "devices/inventory/devicelog.h"
 #include "devices/inventory/devicemonitor.h"
 #include "devices/inventory/inventoryupdater.h"
-#include "devices/operations/assignip/assignipdialog.h"
-#include "devices/operations/authorizedevicedialog.h"
 #include "devices/operations/deviceactions.h"
-#include "devices/operations/restoredevicedialog.h"
-#include "devices/operations/setpassworddialog.h"
-#include "devices/operations/targetsummary.h"
+#include "devices/operations/operations.h"
+#include "devices/operations/rollout/rolloutbanner.h"
 #include "devices/page/devicefooter.h"
 #include "devices/page/devicemenus.h"
 #include "devices/page/devicesiteactions.h"
@@ -23,11 +19,8 @@
 #include "devices/page/refreshdevicedialog.h"
 #include "devices/sites/sitecommit.h"
 #include "devices/sites/sitetree.h"
-#include "platform/log/messagelog.h"
-#include "store/lastfolder.h"
+#include "tasks/queue/uploadtaskmgr.h"
 #include "tasks/service/taskinfopool.h"
-#include "widgets/dialogs/confirmdialog.h"
-#include "widgets/dialogs/filedialogs.h"
 
 #include <QApplication>
 #include <QDebug>
@@ -40,8 +33,6 @@
 #include <QToolButton>
 #include <QVBoxLayout>
 
-#include <nlohmann/json.hpp>
-
 #include <chrono>
 #include <thread>
 
@@ -52,17 +43,6 @@ namespace {
 constexpr auto refreshDelay = 2000ms;
 constexpr auto selectionLogDelay = 200ms;
 constexpr int siteTreeWidth = 248;
-
-/// The entries of the tool bar whose dialogs stand elsewhere.
-constexpr std::pair<const char *, UploadKind> uploadEntries[] = {
-    {"uploadFirmwareAction", UploadKind::Firmware},
-    {"uploadPackageAction", UploadKind::Package},
-    {"uploadConfigurationAction", UploadKind::Configuration},
-    {"uploadHttpsAction", UploadKind::HttpsCertificate},
-    {"uploadIeeeAction", UploadKind::IeeeCertificate},
-    {"certificateListAction", UploadKind::CertificateList},
-    {"exportDebugInfoAction", UploadKind::DebugInfo},
-};
 
 } // namespace
 
@@ -104,6 +84,7 @@ void DeviceWindow::buildLayout() {
     consoleLayout->addWidget(m_toolBar);
     consoleLayout->addWidget(m_noticeBar);
     consoleLayout->addWidget(m_tabs, 1);
+    consoleLayout->addWidget(new RolloutBanner(m_console));
     consoleLayout->addWidget(m_footer);
 
     m_splitter->setChildrenCollapsible(false);
@@ -116,11 +97,6 @@ void DeviceWindow::buildLayout() {
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(m_splitter);
-}
-
-void DeviceWindow::addStrip(QWidget *strip) {
-    auto *layout = static_cast<QVBoxLayout *>(m_console->layout());
-    layout->insertWidget(layout->indexOf(m_footer), strip);
 }
 
 void DeviceWindow::connectParts() {
@@ -150,8 +126,9 @@ void DeviceWindow::connectParts() {
     connect(m_siteCommit, &SiteCommit::answered, this, &DeviceWindow::reload);
     connect(m_tabs, &DeviceTabs::currentChanged, this, &DeviceWindow::showStatusCounts);
     connect(m_tabs, &DeviceTabs::selectionChanged, this, &DeviceWindow::onSelectionChanged);
-    connect(m_tabs, &DeviceTabs::deleteRequested, this, &DeviceWindow::on_deleteButton_clicked);
-    connect(m_tabs, &DeviceTabs::addDeviceRequested, this, &DeviceWindow::openAddDialog);
+    connect(m_tabs, &DeviceTabs::deleteRequested, this, &DeviceWindow::askToRemove);
+    connect(m_tabs, &DeviceTabs::addDeviceRequested, this,
+            [this] { openOperation(Operations::addDevice, {}); });
     connect(m_tabs, &DeviceTabs::clearFilterRequested, this, &DeviceWindow::clearFilter);
     connect(m_tabs, &DeviceTabs::rowMenuRequested, this,
             [this](MainConsoleTable *table, const QPoint &position) {
@@ -167,35 +144,17 @@ void DeviceWindow::connectParts() {
 }
 
 void DeviceWindow::connectOperations() {
-    const std::pair<const char *, void (DeviceWindow::*)()> buttons[] = {
-        {"addDeviceButton", &DeviceWindow::openAddDialog},
-        {"authorizeButton", &DeviceWindow::on_authorizeButton_clicked},
-        {"setPasswordButton", &DeviceWindow::on_setPasswordButton_clicked},
-        {"ipButton", &DeviceWindow::on_ipButton_clicked},
-        {"quickSettingButton", &DeviceWindow::on_quickSettingButton_clicked},
-        {"restartButton", &DeviceWindow::on_restartButton_clicked},
-        {"refreshButton", &DeviceWindow::openRefreshDialog},
-        {"deleteButton", &DeviceWindow::on_deleteButton_clicked},
-    };
-    for (const auto &[name, slot] : buttons)
-        connect(m_toolBar->button(QLatin1String(name)), &QToolButton::clicked, this, slot);
-    const std::pair<const char *, void (DeviceWindow::*)()> entries[] = {
-        {"exportDeviceListAction", &DeviceWindow::exportDeviceList},
-        {"factoryDefaultAction", &DeviceWindow::openRestoreDialog},
-    };
-    for (const auto &[name, slot] : entries)
-        connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this, slot);
-    for (const auto &[name, kind] : uploadEntries)
-        connect(m_toolBar->entry(QLatin1String(name)), &QAction::triggered, this,
-                [this, kind = kind] { emit uploadWanted(kind, targetsOf(selectedDevices())); });
+    connect(m_toolBar, &DeviceToolBar::operationChosen, this, [this](const Operation &operation) {
+        openOperation(operation, {targetsOf(selectedDevices()), {}});
+    });
     connect(m_actions, &DeviceActions::failed, this, &DeviceWindow::showError);
     connect(m_actions, &DeviceActions::done, this, &DeviceWindow::showSuccess);
     connect(m_actions, &DeviceActions::working, this, &DeviceWindow::showProgress);
     connect(m_actions, &DeviceActions::devicesChanged, this, &DeviceWindow::reload);
     connect(m_actions, &DeviceActions::devicesDeleted, m_updater, &InventoryUpdater::readStatesSoon);
     connect(m_actions, &DeviceActions::statesChanged, this, [this] { m_monitor->forceRefresh(); });
-    connect(m_actions, &DeviceActions::passwordWanted, this,
-            [this](const QStringList &ids) { openSetPasswordDialog(targetsWith(ids)); });
+    connect(m_actions, &DeviceActions::inputNeeded, this, &DeviceWindow::openAgain);
+    connect(&UploadTaskMgr::instance(), &TaskQueue::dialogNeeded, this, &DeviceWindow::openAgain);
 }
 
 void DeviceWindow::addShortcuts() {
@@ -214,11 +173,7 @@ void DeviceWindow::addShortcuts() {
 void DeviceWindow::startWork() {
     m_tabs->corner()->loadServers();
     m_online = false;
-    m_toolBar->button(QStringLiteral("refreshButton"))->setEnabled(true);
-    for (const char *name : {"exportButton", "addDeviceButton", "uploadButton"})
-        m_toolBar->button(QLatin1String(name))->setEnabled(true);
-    for (const char *name : {"exportDeviceListAction", "certificateListAction"})
-        m_toolBar->entry(QLatin1String(name))->setEnabled(true);
+    m_toolBar->setFulfilled(Operation::Needs::Session, true);
     m_siteTree->setFocus();
     reload();
     m_monitor->start();
@@ -226,8 +181,7 @@ void DeviceWindow::startWork() {
 
 void DeviceWindow::stopWork() {
     m_monitor->stop();
-    for (const char *name : {"refreshButton", "exportButton", "addDeviceButton", "uploadButton"})
-        m_toolBar->button(QLatin1String(name))->setEnabled(false);
+    m_toolBar->setFulfilled(Operation::Needs::Session, false);
     clearFilter();
     if (m_reconnecting)
         m_reconnecting->close();
@@ -255,84 +209,24 @@ void DeviceWindow::onTaskListUpdated() {
         emit allTasksDone();
 }
 
-void DeviceWindow::openAddDialog() {
-    const auto managed = [this] {
-        return m_updater->knowledge() == InventoryUpdater::LoadState::Read ? m_inventory.snapshot() : nullptr;
-    };
-    auto *dialog = new AddDeviceDialog(managed(), this);
-    // After the inventory, which has heard of the reading before.
-    connect(m_updater, &InventoryUpdater::read, dialog, [dialog, managed] { dialog->setManaged(managed()); });
-    connect(dialog, &AddDeviceDialog::devicesAdded, this, &DeviceWindow::reload);
-    dialog->open();
-}
-
 OperationTargets::List DeviceWindow::targetsOf(const std::vector<DeviceRecordPtr> &devices) const {
     return OperationTargets::of(devices, m_inventory, *CTaskInfoPool::instance().taskList());
 }
 
-OperationTargets::List DeviceWindow::targetsWith(const QStringList &ids) const {
-    return targetsOf(m_inventory.snapshot()->presentOf(ids));
-}
-
-void DeviceWindow::on_authorizeButton_clicked() {
-    auto *dialog = new AuthorizeDeviceDialog(targetsOf(selectedDevices()), this);
-    connect(dialog, &AuthorizeDeviceDialog::authDevices, this,
-            [this, dialog](const QString &name, const QString &password) {
-                onAuthDevices(dialog->deviceIds(), name, password);
-            });
+void DeviceWindow::openOperation(const Operation &operation, OperationRequest request) {
+    QDialog *dialog = operation.open(*this, std::move(request));
+    if (!dialog)
+        return;
+    dialog->setProperty("helpPage", QString::fromLatin1(operation.helpPage));
     dialog->open();
 }
 
-void DeviceWindow::onAuthDevices(const QStringList &ids, const QString &name, const QString &password) {
-    qDebug("onAuthDevices, username : %s, password: %s", qUtf8Printable(name),
-           MessageLog::secret(password).constData());
-    m_actions->authorize(ids, name, password);
-}
-
-void DeviceWindow::on_setPasswordButton_clicked() {
-    openSetPasswordDialog(targetsOf(selectedDevices()));
-}
-
-void DeviceWindow::openSetPasswordDialog(const OperationTargets::List &targets) {
-    if (targets.empty())
+void DeviceWindow::openAgain(const QString &taskType, const QStringList &deviceIds) {
+    const Operation *operation = Operations::findByTask(taskType);
+    OperationTargets::List targets = targetsOf(m_inventory.snapshot()->presentOf(deviceIds));
+    if (!operation || targets.empty())
         return showError(tr("The devices are not managed any more."));
-    auto *dialog = new SetPasswordDialog(targets, m_actions, this);
-    connect(dialog, &SetPasswordDialog::setPassword, this, &DeviceWindow::onSetPassword);
-    dialog->open();
-}
-
-void DeviceWindow::onSetPassword(JSON &devices, const QString &name, const QString &password) {
-    qDebug("onSetPassword: name: %s, password: %s", qUtf8Printable(name),
-           MessageLog::secret(password).constData());
-    QStringList ids;
-    for (const JSON &id : devices)
-        ids += QString::fromStdString(id.get<std::string>());
-    m_actions->changePassword(ids, name, password);
-}
-
-void DeviceWindow::openRestoreDialog() {
-    auto *dialog = new RestoreDeviceDialog(targetsOf(selectedDevices()), this);
-    connect(dialog, &RestoreDeviceDialog::restoreDevice, this,
-            [this, dialog](int net, int dst, int lang, int nadp, int focus, int lens) {
-                onRestoreDevice(dialog->deviceIds(), {net, dst, lang, nadp, focus, lens});
-            });
-    dialog->open();
-}
-
-void DeviceWindow::onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options) {
-    const auto &[network, daylightSaving, language, nadp, focus, lens] = options;
-    qDebug("onRestoreDevice: network: %d, daylight: %d, lan: %d, nadp: %d, focus: %d, lens: %d", network,
-           daylightSaving, language, nadp, focus, lens);
-    m_actions->restore(ids, options);
-}
-
-void DeviceWindow::on_ipButton_clicked() {
-    auto *dialog = new AssignIpDialogII(targetsOf(selectedDevices()), m_inventory.snapshot(), this);
-    dialog->open();
-}
-
-void DeviceWindow::on_quickSettingButton_clicked() {
-    emit uploadWanted(UploadKind::QuickSetup, targetsOf(selectedDevices()));
+    openOperation(*operation, {std::move(targets), taskType});
 }
 
 void DeviceWindow::onDeviceDrop(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
@@ -340,25 +234,7 @@ void DeviceWindow::onDeviceDrop(const QString &siteId, const QStringList &device
     m_placement->drop(siteId, deviceIds, action, sourceSiteId);
 }
 
-void DeviceWindow::on_restartButton_clicked() {
-    auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, this);
-    confirm->setAttribute(Qt::WA_DeleteOnClose);
-    auto *box = new TargetSummary(confirm);
-    OperationTargets::List targets = targetsOf(selectedDevices());
-    const auto warnings = OperationTargets::warnings(targets, OperationTargets::Need::Authorization);
-    box->setTargets(std::move(targets));
-    box->setWarnings(warnings);
-    confirm->addDetail(box);
-    connect(box, &TargetSummary::tickedChanged, confirm,
-            [confirm, box] { confirm->setAcceptable(box->tickedCount() > 0); });
-    connect(confirm, &QDialog::accepted, this, [this, box] {
-        qDebug("on_restartButton_clicked accepted");
-        m_actions->restart(box->tickedIds());
-    });
-    confirm->open();
-}
-
-void DeviceWindow::on_deleteButton_clicked() {
+void DeviceWindow::askToRemove() {
     QStringList ids;
     for (const DeviceRecordPtr &device : selectedDevices())
         ids += device->id;
@@ -369,14 +245,8 @@ void DeviceWindow::removeDevices(bool fromOverview) {
     m_placement->remove(fromOverview);
 }
 
-void DeviceWindow::exportDeviceList() {
-    const QString suggestion = LastFolder::file(tr("Device List") + QStringLiteral(".csv"));
-    FileDialogs::askSavePath(this, tr("Save as"), suggestion, tr("CSV files (*.csv)"), QStringLiteral("csv"),
-                             [this](const QString &path) {
-                                 LastFolder::rememberFile(path);
-                                 m_actions->exportList(path, m_inventory.snapshot(),
-                                                       m_tabs->currentTable()->shownDevices());
-                             });
+std::vector<int> DeviceWindow::shownDevices() const {
+    return m_tabs->currentTable()->shownDevices();
 }
 
 QHash<QString, QString> DeviceWindow::siteNames() const {
@@ -457,7 +327,7 @@ void DeviceWindow::onServerAnswered() {
     }
     // A name that is being typed is not interrupted; the next answer comes soon enough.
     if (!m_online && !m_refreshing && !m_siteTree->isTyping())
-        openRefreshDialog();
+        refreshStates();
     else
         m_updater->reloadAfterRest();
 }
@@ -478,7 +348,7 @@ void DeviceWindow::onServerLost() {
     m_reconnecting->show();
 }
 
-void DeviceWindow::openRefreshDialog() {
+void DeviceWindow::refreshStates() {
     if (m_refreshing)
         return;
     QWidget *modal = QApplication::activeModalWidget();
@@ -572,15 +442,7 @@ void DeviceWindow::onSelectionChanged() {
     const auto count = static_cast<int>(m_tabs->currentTable()->selectedDevices().size());
     qDebug("device selected: %d", count);
     m_selectionLogDelay->start();
-    for (const char *name : {"authorizeButton", "setPasswordButton", "ipButton", "quickSettingButton",
-                             "restartButton", "restoreButton", "deleteButton"})
-        m_toolBar->button(QLatin1String(name))->setEnabled(count > 0);
-    m_toolBar->entry(QStringLiteral("factoryDefaultAction"))->setEnabled(count > 0);
-    for (const auto &[name, kind] : uploadEntries) {
-        // The list of certificates is about all devices.
-        if (kind != UploadKind::CertificateList)
-            m_toolBar->entry(QLatin1String(name))->setEnabled(count > 0);
-    }
+    m_toolBar->setFulfilled(Operation::Needs::Selection, count > 0);
     showSelectionCount();
 }
 

@@ -2,9 +2,7 @@
 
 #include "devices/inventory/deviceinventory.h"
 #include "devices/inventory/inventoryreader.h"
-#include "devices/operations/deviceoperations.h"
-#include "devices/operations/operationtargets.h"
-#include "devices/operations/uploadkind.h"
+#include "devices/operations/operation.h"
 #include "widgets/dialogs/transientmessage.h"
 
 #include <QPointer>
@@ -28,7 +26,7 @@ class SiteCommit;
 class SiteTree;
 
 /// The device console: the site tree, the tool bar, the three device tables and what keeps them current.
-class DeviceWindow : public QWidget {
+class DeviceWindow : public QWidget, public OperationContext {
     Q_OBJECT
 
 public:
@@ -41,10 +39,7 @@ public:
     void stopWork();
 
     /// The devices of the last reading.
-    const DeviceSnapshotPtr &devices() const { return m_inventory.snapshot(); }
-    /// What operations have to know of those of the devices that are still managed.
-    OperationTargets::List targetsWith(const QStringList &ids) const;
-
+    const DeviceSnapshotPtr &devices() const override { return m_inventory.snapshot(); }
     /// True while there are changes of sites that were not sent.
     bool hasPendingEdits() const;
     void discardEdits();
@@ -52,15 +47,20 @@ public:
     /// The devices that operations work on, in the order of their rows as they are sorted now.
     std::vector<DeviceRecordPtr> selectedDevices() const;
 
+    QWidget *dialogParent() override { return this; }
+    DeviceActions *actions() override { return m_actions; }
+    InventoryUpdater *inventoryUpdater() override { return m_updater; }
+    std::vector<int> shownDevices() const override;
+    void refreshStates() override;
+    void askToRemove() override;
+
 public slots:
     /// Sends the changes of sites.
     void commitSites();
     /// Reads sites and devices again.
-    void reload();
-    /// Puts a part between the tables and the footer.
-    void addStrip(QWidget *strip);
+    void reload() override;
     /// Selects the device with the id, or else the one with the address, and brings it into view.
-    void selectDevice(const QString &id, const QString &ip);
+    void selectDevice(const QString &id, const QString &ip) override;
     /// Shows a transient message.
     void showDefAnimateMsgDlg(const QString &message,
                               TransientMessage::Kind kind = TransientMessage::Kind::Plain);
@@ -81,8 +81,6 @@ signals:
     void disconnectRequested();
     /// A server of the saved list was chosen in place of the present one.
     void remoteServerChosen(const QString &serverId);
-    /// An operation was chosen for the selected devices that is none of the console's own.
-    void uploadWanted(UploadKind kind, const OperationTargets::List &targets);
 
 private:
     void buildLayout();
@@ -91,21 +89,11 @@ private:
     void addShortcuts();
 
     void onTaskListUpdated();
-    void openAddDialog();
-    void on_authorizeButton_clicked();
-    void onAuthDevices(const QStringList &ids, const QString &name, const QString &password);
-    void on_setPasswordButton_clicked();
-    void openSetPasswordDialog(const OperationTargets::List &targets);
-    void onSetPassword(JSON &devices, const QString &name, const QString &password);
-    void on_ipButton_clicked();
-    void on_quickSettingButton_clicked();
+    void openOperation(const Operation &operation, OperationRequest request);
+    /// Opens the dialog of a task's operation once more: what the user gave it then was not kept.
+    void openAgain(const QString &taskType, const QStringList &deviceIds);
     void onDeviceDrop(const QString &siteId, const QStringList &deviceIds, Qt::DropAction action,
                       const QString &sourceSiteId);
-    void on_restartButton_clicked();
-    void openRestoreDialog();
-    void onRestoreDevice(const QStringList &ids, const DeviceOperations::RestoreOptions &options);
-    void on_deleteButton_clicked();
-    void exportDeviceList();
 
     void applySearch(const QString &text);
     void followSiteNames();
@@ -122,7 +110,6 @@ private:
     QHash<QString, QString> siteNames() const;
     OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
 
-    void openRefreshDialog();
     void onRefreshAll();
     bool onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog);
     void onRefreshDone();

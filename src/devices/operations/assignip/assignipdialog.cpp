@@ -3,6 +3,7 @@
 #include "api/session/servicerequest.h"
 #include "devices/inventory/inventoryreader.h"
 #include "devices/operations/assignip/assignipmodel.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/targetwarninglines.h"
 #include "tasks/queue/exetaskmgr.h"
 #include "ui_assignipdialog.h"
@@ -272,3 +273,20 @@ bool AssignIpDialogII::applyManually() {
         devices, m_ui->maskEdit->address(), m_ui->gatewayEdit->address(), m_ui->dns1Edit->address(),
         m_ui->dns2Edit->address());
 }
+
+namespace {
+
+QDialog *on_ipButton_clicked(OperationContext &context, OperationRequest request) {
+    return new AssignIpDialogII(std::move(request.targets), context.devices(), context.dialogParent());
+}
+
+} // namespace
+
+const Operation Operations::assignIp{.objectName = "ipButton",
+                                     .text = QT_TRANSLATE_NOOP("Operation", "Assign IP Address"),
+                                     .icon = "tool_assign_ip_line",
+                                     .group = Operation::Group::DeviceButtons,
+                                     .needs = Operation::Needs::Selection,
+                                     .taskTypes = {"deviceAssignIPAuto", "deviceAssignIPManual"},
+                                     .helpPage = "addresses.html",
+                                     .open = on_ipButton_clicked};

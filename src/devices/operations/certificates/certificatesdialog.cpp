@@ -1,6 +1,7 @@
 #include "devices/operations/certificates/certificatesdialog.h"
 
 #include "devices/operations/certificates/certificatelistmodel.h"
+#include "devices/operations/operations.h"
 #include "widgets/lists/rowdelegate.h"
 #include "widgets/style/icons.h"
 #include "widgets/style/theme.h"
@@ -148,3 +149,21 @@ void CertificatesDialog::showState() {
     m_count->setText(
         tr("%1 of %2 certificates").arg(locale.toString(shown), locale.toString(m_model->total())));
 }
+
+namespace {
+
+QDialog *openCertificateList(OperationContext &context, OperationRequest) {
+    auto *dialog = new CertificatesDialog(context.devices(), context.dialogParent());
+    QObject::connect(dialog, &CertificatesDialog::deviceChosen, context.dialogParent(),
+                     [&context](const QString &id) { context.selectDevice(id, {}); });
+    return dialog;
+}
+
+} // namespace
+
+const Operation Operations::certificateList{.objectName = "certificateListAction",
+                                            .text = QT_TRANSLATE_NOOP("Operation", "Certificates in use"),
+                                            .group = Operation::Group::RowMenu,
+                                            .needs = Operation::Needs::Session,
+                                            .helpPage = "certificates.html",
+                                            .open = openCertificateList};

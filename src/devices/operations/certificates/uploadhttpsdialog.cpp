@@ -2,6 +2,7 @@
 
 #include "devices/operations/captioned.h"
 #include "devices/operations/certificates/selfsignedfields.h"
+#include "devices/operations/operations.h"
 #include "tasks/queue/uploadtaskmgr.h"
 
 #include <QComboBox>
@@ -148,3 +149,25 @@ std::function<bool(UploadTaskMgr &)> UploadHttpsDialog::insertion() {
         return queue.insertNewHttpsSelfSignedCertTask(cert, order.deviceIds());
     };
 }
+
+namespace {
+
+QDialog *openUploadHttps(OperationContext &context, OperationRequest request) {
+    auto *dialog =
+        new UploadHttpsDialog(std::move(request.targets), context.devices(), context.dialogParent());
+    dialog->setMethod(UploadHttpsDialog::methodOf(request.taskType));
+    QObject::connect(dialog, &UploadHttpsDialog::deviceChosen, context.dialogParent(),
+                     [&context](const QString &id) { context.selectDevice(id, {}); });
+    return dialog;
+}
+
+} // namespace
+
+const Operation Operations::uploadHttps{
+    .objectName = "uploadHttpsAction",
+    .text = QT_TRANSLATE_NOOP("Operation", "HTTPS"),
+    .group = Operation::Group::CertificateMenu,
+    .needs = Operation::Needs::Selection,
+    .taskTypes = {"deviceGenSelfSignedCert", "deviceHttpsCertInstall", "deviceHttpsCertsAndPKeys"},
+    .helpPage = "certificates.html",
+    .open = openUploadHttps};

@@ -2,6 +2,7 @@
 
 #include "devices/operations/captioned.h"
 #include "devices/operations/certificates/cafilefield.h"
+#include "devices/operations/operations.h"
 #include "tasks/queue/uploadtaskmgr.h"
 #include "widgets/controls/passwordedit.h"
 
@@ -150,3 +151,24 @@ void UploadIeeeDialog::accept() {
     m_keyPassword->clear();
     CertificateUploadDialog::accept();
 }
+
+namespace {
+
+QDialog *openUploadIeee(OperationContext &context, OperationRequest request) {
+    auto *dialog =
+        new UploadIeeeDialog(std::move(request.targets), context.devices(), context.dialogParent());
+    dialog->setMethod(UploadIeeeDialog::methodOf(request.taskType));
+    QObject::connect(dialog, &UploadIeeeDialog::deviceChosen, context.dialogParent(),
+                     [&context](const QString &id) { context.selectDevice(id, {}); });
+    return dialog;
+}
+
+} // namespace
+
+const Operation Operations::uploadIeee{.objectName = "uploadIeeeAction",
+                                       .text = QT_TRANSLATE_NOOP("Operation", "IEEE 802.1x"),
+                                       .group = Operation::Group::CertificateMenu,
+                                       .needs = Operation::Needs::Selection,
+                                       .taskTypes = {"deviceIEEE_EAP_PEAP", "deviceIEEE_EAP_TLS"},
+                                       .helpPage = "certificates.html",
+                                       .open = openUploadIeee};

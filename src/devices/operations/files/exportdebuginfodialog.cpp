@@ -1,6 +1,7 @@
 #include "devices/operations/files/exportdebuginfodialog.h"
 
 #include "devices/operations/files/filefield.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/queueing.h"
 #include "devices/operations/targetsummary.h"
 #include "tasks/queue/exetaskmgr.h"
@@ -40,3 +41,19 @@ void ExportDebugInfoDialog::apply() {
         },
         [this] { setComplaint(tr("The export could not be started.")); });
 }
+
+namespace {
+
+QDialog *openExportDebugInfo(OperationContext &context, OperationRequest request) {
+    return new ExportDebugInfoDialog(std::move(request.targets), context.dialogParent());
+}
+
+} // namespace
+
+const Operation Operations::exportDebugInfo{.objectName = "exportDebugInfoAction",
+                                            .text = QT_TRANSLATE_NOOP("Operation", "Export Debug Info"),
+                                            .group = Operation::Group::ExportMenu,
+                                            .needs = Operation::Needs::Selection,
+                                            .taskTypes = {"deviceExportDeviceInfo"},
+                                            .helpPage = "exporting.html",
+                                            .open = openExportDebugInfo};

@@ -1,6 +1,7 @@
 #include "devices/operations/files/uploadconfigurationdialog.h"
 
 #include "devices/operations/files/filefield.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/queueing.h"
 #include "devices/operations/targetsummary.h"
 #include "tasks/queue/uploadtaskmgr.h"
@@ -36,3 +37,20 @@ void UploadConfigurationDialog::apply() {
         },
         [this] { setComplaint(tr("The upload could not be started.")); });
 }
+
+namespace {
+
+QDialog *openUploadConfiguration(OperationContext &context, OperationRequest request) {
+    return new UploadConfigurationDialog(std::move(request.targets), context.dialogParent());
+}
+
+} // namespace
+
+const Operation Operations::uploadConfiguration{
+    .objectName = "uploadConfigurationAction",
+    .text = QT_TRANSLATE_NOOP("Operation", "Upload Configuration File"),
+    .group = Operation::Group::UploadMenu,
+    .needs = Operation::Needs::Selection,
+    .taskTypes = {"deviceConfigFileUpload"},
+    .helpPage = "uploads.html",
+    .open = openUploadConfiguration};

@@ -1,6 +1,7 @@
 #include "devices/operations/files/uploadpackagedialog.h"
 
 #include "devices/operations/files/filefield.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/queueing.h"
 #include "devices/operations/targetsummary.h"
 #include "tasks/queue/uploadtaskmgr.h"
@@ -80,3 +81,19 @@ void UploadPackageDialog::apply() {
         },
         [this] { setComplaint(tr("The upload could not be started.")); });
 }
+
+namespace {
+
+QDialog *openUploadPackage(OperationContext &context, OperationRequest request) {
+    return new UploadPackageDialog(std::move(request.targets), context.dialogParent());
+}
+
+} // namespace
+
+const Operation Operations::uploadPackage{.objectName = "uploadPackageAction",
+                                          .text = QT_TRANSLATE_NOOP("Operation", "Upload Package"),
+                                          .group = Operation::Group::UploadMenu,
+                                          .needs = Operation::Needs::Selection,
+                                          .taskTypes = {"devicePackageUpload"},
+                                          .helpPage = "uploads.html",
+                                          .open = openUploadPackage};

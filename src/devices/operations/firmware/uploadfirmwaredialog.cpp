@@ -8,6 +8,7 @@
 #include "devices/operations/firmware/firmwareupload.h"
 #include "devices/operations/firmware/modelgroupmodel.h"
 #include "devices/operations/firmware/schedulefield.h"
+#include "devices/operations/operations.h"
 #include "devices/operations/queueing.h"
 #include "devices/operations/rollout/rolloutfields.h"
 #include "devices/operations/rollout/rolloutmgr.h"
@@ -337,3 +338,19 @@ void UploadFirmwareDialog::apply() {
     keepChoices();
     startUpload();
 }
+
+namespace {
+
+QDialog *openUploadFirmware(OperationContext &context, OperationRequest request) {
+    return new UploadFirmwareDialog(std::move(request.targets), context.dialogParent());
+}
+
+} // namespace
+
+const Operation Operations::uploadFirmware{.objectName = "uploadFirmwareAction",
+                                           .text = QT_TRANSLATE_NOOP("Operation", "Upload Firmware"),
+                                           .group = Operation::Group::UploadMenu,
+                                           .needs = Operation::Needs::Selection,
+                                           .taskTypes = {"deviceFWUpgrade"},
+                                           .helpPage = "firmware.html",
+                                           .open = openUploadFirmware};

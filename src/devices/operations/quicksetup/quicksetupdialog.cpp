@@ -1,5 +1,6 @@
 #include "devices/operations/quicksetup/quicksetupdialog.h"
 
+#include "devices/operations/operations.h"
 #include "devices/operations/queueing.h"
 #include "devices/operations/quicksetup/timesyncfields.h"
 #include "devices/operations/quicksetup/timezones.h"
@@ -197,3 +198,20 @@ void QuickSetupDialog::apply() {
             ExeTaskMgr &queue) { return queue.insertNewQuickSetupTask(TaskTargets::ids(ids), settings); },
         [this] { setComplaint(tr("The setup could not be started.")); });
 }
+
+namespace {
+
+QDialog *on_quickSettingButton_clicked(OperationContext &context, OperationRequest request) {
+    return new QuickSetupDialog(std::move(request.targets), context.dialogParent());
+}
+
+} // namespace
+
+const Operation Operations::quickSetup{.objectName = "quickSettingButton",
+                                       .text = QT_TRANSLATE_NOOP("Operation", "Quick Setup"),
+                                       .icon = "tool_quick_setup_line",
+                                       .group = Operation::Group::ConfigurationButtons,
+                                       .needs = Operation::Needs::Selection,
+                                       .taskTypes = {"deviceQuickSetup"},
+                                       .helpPage = "uploads.html",
+                                       .open = on_quickSettingButton_clicked};
