@@ -31,6 +31,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <algorithm>
+
 namespace {
 constexpr int patienceMs = 15000;
 } // namespace

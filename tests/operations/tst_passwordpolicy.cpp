@@ -5,6 +5,8 @@
 #include <QSet>
 #include <QTest>
 
+#include <algorithm>
+
 class TestPasswordPolicy : public QObject {
     Q_OBJECT
 

@@ -10,6 +10,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <stdexcept>
+
 using nlohmann::json;
 
 namespace {

@@ -15,6 +15,7 @@
 #include <QSignalSpy>
 #include <QTest>
 
+#include <stdexcept>
 #include <thread>
 
 using nlohmann::json;
