@@ -30,7 +30,7 @@ void useKeyOf(const std::filesystem::path &folder) {
         throw std::runtime_error("the key file in " + path + " cannot be used");
 }
 
-void live(emulator::Service &service, const emulator::StopSignal &stop) {
+void runLoop(emulator::Service &service, const emulator::StopSignal &stop) {
     while (!stop.waitFor(service.timeUntilNextWork())) {
         try {
             service.runDueWork();
@@ -40,8 +40,8 @@ void live(emulator::Service &service, const emulator::StopSignal &stop) {
     }
 }
 
-/// A caller that stalls in the middle of its request must not hold the program; what is in the store is whole
-/// at any time.
+/// A caller that stalls in the middle of its request must not keep the program running; the store is
+/// consistent at any time.
 void leaveWithin(const std::future<void> &ended, const emulator::ServiceFiles &files) {
     files.writeStopped();
     if (ended.wait_for(3s) != std::future_status::ready)
@@ -69,7 +69,7 @@ int serve(const emulator::Options &options) {
     files.writePort(port);
     files.writeRunning();
     const auto serving = std::async(std::launch::async, [&] { server.serve(); });
-    const auto living = std::async(std::launch::async, [&] { live(service, stop); });
+    const auto simulating = std::async(std::launch::async, [&] { runLoop(service, stop); });
     const emulator::Control control(service, faults, stop);
     server.waitUntilServing();
     std::cout << "nvldm-emulator: listening on https://" << options.host << ':' << port << std::endl;

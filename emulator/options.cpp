@@ -1,5 +1,6 @@
 #include "options.h"
 
+#include "controlcommands.h"
 #include "http/utf8path.h"
 
 #include <charconv>
@@ -11,29 +12,29 @@ namespace emulator {
 
 namespace {
 
-constexpr auto help =
+constexpr auto optionsHelp =
     R"(Usage: nvldm-emulator --root DIR [option]...
 
 Plays the device manager service and its fleet over HTTPS.
 
-Place and store
+Address and store
   --root DIR            folder of the service's files and of the emulator's store (made when missing)
   --host ADDRESS        address to listen on (127.0.0.1)
   --port N              port to listen on; 0: that of the last run, or a free one (0)
   --fresh               throw an existing store away; without it the store's fleet is kept
   --new-key             make another key and certificate for the server, in place of those kept in DIR as
-                        nvldm-emulator.pem, as a service does that was installed anew
+                        nvldm-emulator.pem, like a service that was installed again
 Fleet
   --devices N           devices of a new fleet (500)
   --sites N             sites of a new fleet (12)
-  --seed N              the same seed makes the same fleet and the same life (1)
-  --odd-records         add records with missing, wrong and hostile members
-  --life MS             length of a tick of the fleet's life; 0 holds it still (1000)
+  --seed N              the same seed makes the same fleet and the same changes to it (1)
+  --malformed-devices   add records with missing, wrong and hostile members
+  --life MS             length of a tick, in which the fleet changes by itself; 0 for no change (1000)
 Past of a new fleet
   --tasks N             tasks that have ended in the last days (0)
   --task-devices N      devices of each of them (20)
-  --alarms N            alarms that nobody has removed (0); 5000 are kept at most
-  --log-entries N       log entries of the last 8 days (0); 200000 are kept at most
+  --alarms N            alarms that have not been removed (0); at most 5000 are kept
+  --log-entries N       log entries of the last 8 days (0); at most 200000 are kept
 Tasks
   --task-pace MS        length of a step; the work on a device takes 6 to 8 of them (1000)
   --task-failures P     share of the devices that fail by chance (0)
@@ -43,59 +44,45 @@ Accounts
   --account EMAIL:PASSWORD[:PERMISSION]
                         have this account (admin, operator or viewer; admin when left out); repeatable.
                         Without one a new store holds the factory account "admin", password "admin"
-  --session-limit N     sessions at a time; a login beyond answers 108; 0 is no limit (0)
+  --session-limit N     sessions at a time; a login beyond gets the code 108; 0 is no limit (0)
 Remote-access service
   --orb-user EMAIL:PASSWORD[:expired]
                         a user who can sign in there; repeatable. Without one: partner@norvell.example with
                         the password "Partner-1", and expired@norvell.example, whose same password is expired
   --orb-sign-in MS      how long a sign-in there lasts (600000)
 Behaviour
-  --latency MS          added to each answer
-  --upload-limit BYTES  longest form; one that is longer is answered with 413 (8 GiB)
+  --latency MS          added to each response
+  --upload-limit BYTES  maximum size of a form; a larger one gets the status 413 (8 GiB)
   --batch-timeout MS    life of a commit that was started and not ended (60000)
   --token-grace MS      how long a token stays good after its renewal (60000)
   --block-time MS       how long a device blocks its account after five wrong passwords (60000)
-  --fault FAULT         answer badly; repeatable
+  --fault FAULT         respond badly; repeatable
   --help, --version
 
 FAULT is KIND[=VALUE][@PATH][,after=N][,times=N][,rate=P]. It hits requests whose path begins with PATH (all
-when left out), not the first N of them (after), N times at most (times), each with the probability P (rate).
-  no-answer             take the request and never answer
-  late=MS               answer MS later
+when left out), not the first N of them (after), at most N times (times), each with the probability P (rate).
+  no-answer             take the request and never respond
+  late=MS               respond MS later
   reset                 send half of the body, then reset the connection
-  status=N              answer with this HTTP status and do nothing
-  not-json              do the work, answer something that is no JSON
+  status=N              respond with this HTTP status and do nothing
+  not-json              do the work, respond with something that is not JSON
   wrong-types[=WHERE]   members have other JSON types; WHERE: members (default), data, code
   no-data               leave "data" out
   bad-cipher            ciphered "data" does not decipher
-  code=N                answer this code and do nothing
-  renew                 renew the session token on every answer
+  code=N                respond with this code and do nothing
+  renew                 renew the session token with every response
   expire                forget every session before the request is judged
   drip                  send the body one byte a second
-  early=N               answer with this HTTP status before the body is read, then reset the connection
+  early=N               respond with this HTTP status before the body is read, then reset the connection
   cut-body=N            read N bytes of the request's body, then reset the connection
   slow-body=N           read the request's body with N KiB a second
+)";
 
-Commands on standard input, one a line, each answered by one line "ok ..." or "error ..." on standard error:
-  fault FAULT           faults clear          expire-sessions       counts           stop
-  drop ID|N             restore ID|all        remove ID             add N            life on|off
-  admit ID|all          bring devices back and let the service in
-  status ID AUTH CONNECT ACTION    texts with blanks in double quotes, "-" keeps what is there
-  tick N                live N ticks at once
-  task TYPE COUNT [DELAY_MS]       another client's task on COUNT devices, run at once or scheduled
-  task-pace MS          task-failures P       as the options
-  touch-tasks N         show another progress for the newest N tasks
-  alarm DESPID [COUNT]  raise alarms; nothing happens to the devices
-  permission EMAIL PERMISSION      from now on, for the account's open sessions too
-  orb status            the link with the remote-access service
-  orb expire            end the sign-in there          orb disconnect        end the link from there
-  orb orgs N|usual      N organizations, or the three of a new store
-  orb connected on|off             orb remote-access on|off
+constexpr auto notes =
+    R"(An account may do what its permission grants: a viewer changes nothing, an operator all but the link with the
+remote-access service, which is the administrators'; anything else gets the code 5.
 
-An account may do what its permission grants: a viewer changes nothing, an operator all but the link with the
-remote-access service, which is the administrators'; anything else answers 5.
-
-Devices that nobody manages yet answer to scans at 10.99.0.10 to 10.99.0.49. A device lets the account "root" in
+Unmanaged devices answer scans at 10.99.0.10 to 10.99.0.49. A device lets the account "root" in
 with any password of 8 characters or more until one is set, then with that one alone; it denies other accounts,
 and five wrong passwords block the account for a minute. A device in "Set Password" wants a first password before
 anything else. Each device has the accounts "root" and "admin"; a new password of "root" shuts the service out.
@@ -111,21 +98,19 @@ files fit every model. A device has four slots for packages.
 )";
 
 template <typename Number>
-Number numberOf(const std::string &name, const std::string &text, Number least, Number most) {
+Number numberOf(const std::string &name, const std::string &text, Number min, Number max) {
     Number value{};
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    const bool isWithin = value >= least && value <= most;
-    if (error != std::errc() || end != text.data() + text.size() || !isWithin) {
-        throw UsageError(name + " takes a number from " + std::to_string(least) + " to " +
-                         std::to_string(most));
-    }
+    const bool isWithin = value >= min && value <= max;
+    if (error != std::errc() || end != text.data() + text.size() || !isWithin)
+        throw UsageError(name + " takes a number from " + std::to_string(min) + " to " + std::to_string(max));
     return value;
 }
 
 template <typename Number>
-std::function<void(const std::string &)> numberInto(const std::string &name, Number &target, Number most) {
-    return [name, &target, most](const std::string &text) {
-        target = numberOf<Number>(name, text, Number{0}, most);
+std::function<void(const std::string &)> numberInto(const std::string &name, Number &target, Number max) {
+    return [name, &target, max](const std::string &text) {
+        target = numberOf<Number>(name, text, Number{0}, max);
     };
 }
 
@@ -197,7 +182,7 @@ Setters valueSetters(Options &options) {
 std::map<std::string, bool *> switches(Options &options) {
     return {{"--fresh", &options.fresh},
             {"--new-key", &options.newKey},
-            {"--odd-records", &options.oddRecords},
+            {"--malformed-devices", &options.malformedDevices},
             {"--help", &options.help},
             {"--version", &options.version}};
 }
@@ -229,7 +214,11 @@ Options readOptions(const std::vector<std::string> &arguments) {
 }
 
 std::string helpText() {
-    return help;
+    return std::string(optionsHelp) +
+           "\nCommands on standard input, one a line, each with a response on standard error whose last line "
+           "begins "
+           "with\n\"ok\" or \"error\":\n" +
+           controlHelp() + '\n' + notes;
 }
 
 } // namespace emulator

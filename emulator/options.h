@@ -50,7 +50,7 @@ struct Options {
     std::int64_t orbSignInMs = 600000;
     bool fresh = false;
     bool newKey = false;
-    bool oddRecords = false;
+    bool malformedDevices = false;
     bool help = false;
     bool version = false;
 };

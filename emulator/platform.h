@@ -12,7 +12,7 @@ namespace emulator::platform {
 /// waitForStop.
 void prepare();
 
-/// Returns when the program is told to stop, from outside or by requestStop.
+/// Returns when a stop signal arrives or requestStop is called.
 void waitForStop();
 void requestStop();
 

@@ -95,9 +95,9 @@ FileClaim::~FileClaim() {
 }
 
 void cutConnection(int descriptor) {
-    sockaddr nobody{};
-    nobody.sa_family = AF_UNSPEC;
-    ::connect(descriptor, &nobody, sizeof nobody);
+    sockaddr unspecified{};
+    unspecified.sa_family = AF_UNSPEC;
+    ::connect(descriptor, &unspecified, sizeof unspecified);
 }
 
 bool callerHasLeft(int descriptor) {

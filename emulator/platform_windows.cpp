@@ -32,7 +32,7 @@ std::optional<DWORD> bytesWaiting(HANDLE input) {
     DWORD count = 0;
     if (::GetFileType(input) != FILE_TYPE_PIPE)
         return std::nullopt;
-    // A pipe that nobody writes to any more is read as well: that tells its end.
+    // A pipe without a writer is read too, which reports its end.
     return ::PeekNamedPipe(input, nullptr, 0, nullptr, &count, nullptr) ? std::optional(count) : std::nullopt;
 }
 

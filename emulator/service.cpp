@@ -26,7 +26,7 @@ using Clock = std::chrono::steady_clock;
 Service::Service(const Options &options, const std::filesystem::path &storePath)
     : m_genericTokens(options.root),
       m_model(storePath, limitsOf(options)),
-      m_lives(options.lifeMs > 0),
+      m_simulating(options.lifeMs > 0),
       m_tickLength(options.lifeMs > 0 ? options.lifeMs : 1000),
       m_nextTick(Clock::now() + m_tickLength) {
     const bool isNew = prepareFleet(options);
@@ -38,7 +38,7 @@ Service::Service(const Options &options, const std::filesystem::path &storePath)
                               m_model.seed()};
     m_model.alarms.raise(AlarmKind::ServerStarted, nullptr, nowMs());
     m_model.scans.seedNeighbours(m_model.seed());
-    m_life = std::make_unique<FleetSimulator>(m_model);
+    m_simulator = std::make_unique<FleetSimulator>(m_model);
 }
 
 void Service::runDueWork() {
@@ -51,8 +51,8 @@ void Service::runDueWork() {
         return;
     // A tick that comes late is not made up for.
     m_nextTick = std::max(m_nextTick + m_tickLength, Clock::now());
-    if (m_lives)
-        m_life->tick();
+    if (m_simulating)
+        m_simulator->tick();
 }
 
 std::chrono::milliseconds Service::timeUntilNextWork() {
@@ -65,12 +65,12 @@ std::chrono::milliseconds Service::timeUntilNextWork() {
 
 void Service::step() {
     const std::lock_guard lock(m_mutex);
-    m_life->tick();
+    m_simulator->tick();
 }
 
-void Service::letLive(bool lives) {
+void Service::setSimulating(bool on) {
     const std::lock_guard lock(m_mutex);
-    m_lives = lives;
+    m_simulating = on;
 }
 
 void Service::noteStop() {
@@ -84,7 +84,7 @@ bool Service::prepareFleet(const Options &options) {
                   << " devices of its store; --devices, --sites and --seed are not used\n";
         return false;
     }
-    makeFleet(m_model, {options.devices, options.sites, options.seed, options.oddRecords});
+    makeFleet(m_model, {options.devices, options.sites, options.seed, options.malformedDevices});
     return true;
 }
 

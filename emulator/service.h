@@ -15,7 +15,7 @@ namespace emulator {
 
 struct Options;
 
-/// The service behind the endpoints: its knowledge under one lock, and what lives beside it.
+/// The service behind the endpoints: its model under one lock, and the simulation of the fleet.
 class Service {
 public:
     /// Opens the store in the folder, makes the fleet where there is none and says so on standard error.
@@ -30,14 +30,14 @@ public:
 
     const GenericTokenJudge &genericTokens() const { return m_genericTokens; }
 
-    /// Does what has fallen due and, unless life is off, lives a tick when it is time for one.
+    /// Does the work that is due and, unless the simulation is off, a tick of it when its time has come.
     void runDueWork();
-    /// How long nothing needs to be looked after.
+    /// The time until runDueWork must be called again.
     std::chrono::milliseconds timeUntilNextWork();
-    /// Lives one tick, life off or not.
+    /// Simulates one tick, also while the simulation is off.
     void step();
-    void letLive(bool lives);
-    /// To be called once, before the program ends in good order.
+    void setSimulating(bool on);
+    /// To be called once, before the program ends normally.
     void noteStop();
 
 private:
@@ -48,8 +48,8 @@ private:
     GenericTokenJudge m_genericTokens;
     std::mutex m_mutex;
     Model m_model;
-    std::unique_ptr<FleetSimulator> m_life;
-    bool m_lives;
+    std::unique_ptr<FleetSimulator> m_simulator;
+    bool m_simulating;
     std::chrono::milliseconds m_tickLength;
     std::chrono::steady_clock::time_point m_nextTick;
 };

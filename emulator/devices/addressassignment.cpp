@@ -1,7 +1,7 @@
 #include "devices/addressassignment.h"
 
 #include "devices/addressbook.h"
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/records.h"
 #include "tables/tasktable.h"
 
@@ -55,7 +55,7 @@ void AddressAssignment::readDevices(const Json &body) {
     }
 }
 
-DeviceWork AddressAssignment::workFor(const Device &device, AddressBook &addresses) const {
+DeviceWork AddressAssignment::workOf(const Device &device, AddressBook &addresses) const {
     const std::uint32_t address = m_addresses.at(device.id);
     DeviceWork work;
     work.id = device.id;

@@ -22,8 +22,8 @@ public:
 
     const std::vector<std::string> &deviceIds() const { return m_ids; }
 
-    /// A device whose address somebody else keeps, or that could not reach the gateway from there, fails.
-    DeviceWork workFor(const Device &device, AddressBook &addresses) const;
+    /// A device whose address another device has, or that could not reach the gateway from there, fails.
+    DeviceWork workOf(const Device &device, AddressBook &addresses) const;
 
 private:
     void readDevices(const Json &body);

@@ -1,6 +1,6 @@
 #include "devices/certificatefiles.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "simulation/clock.h"
 #include "tables/credentials.h"
 #include "tables/devicetable.h"

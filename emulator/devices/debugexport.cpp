@@ -1,7 +1,7 @@
 #include "devices/debugexport.h"
 
 #include "devices/zipwriter.h"
-#include "http/answer.h"
+#include "http/response.h"
 #include "model.h"
 
 namespace emulator {
@@ -42,15 +42,15 @@ std::string debugExport(const Model &model, Task &task) {
     if (task.type != "deviceExportDeviceInfo" || !isFinal(task.status))
         throw Refusal(Code::Malformed, "task " + task.id + " has exported nothing yet");
     ZipWriter zip(task.updatedAt);
-    std::size_t told = 0;
+    std::size_t written = 0;
     for (const Json &entry : Json::parse(task.devicesText)) {
         if (entry.at("state") == state::done) {
             zip.add(fileName(entry), report(model, entry, task));
-            ++told;
+            ++written;
         }
     }
-    if (told == 0)
-        throw Refusal(Code::Malformed, "no device of task " + task.id + " told anything");
+    if (written == 0)
+        throw Refusal(Code::Malformed, "no device of task " + task.id + " written anything");
     return zip.finish();
 }
 

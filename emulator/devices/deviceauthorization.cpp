@@ -13,10 +13,10 @@ namespace emulator {
 
 namespace {
 
-constexpr std::int64_t answerMs = 800;
+constexpr std::int64_t responseMs = 800;
 constexpr int maxRefusals = 5;
 
-/// Tells whether a password opens devices; those with the same secret are asked once.
+/// Whether a password opens devices. Devices with the same secret are asked once.
 class PasswordTrial {
 public:
     explicit PasswordTrial(const std::string &password) : m_password(password) {}
@@ -48,7 +48,7 @@ void DeviceAuthorization::request(const std::vector<std::string> &ids, const std
         const Offer offer = right                     ? Offer::Right
                             : account == ownerAccount ? Offer::WrongPassword
                                                       : Offer::OtherAccount;
-        m_pending.push_back({nowMs + answerMs, id, offer});
+        m_pending.push_back({nowMs + responseMs, id, offer});
     }
 }
 

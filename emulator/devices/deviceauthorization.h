@@ -20,7 +20,7 @@ public:
     void request(const std::vector<std::string> &ids, const std::string &account, const std::string &password,
                  std::int64_t nowMs);
 
-    /// Lets the service in, whatever the device held against it.
+    /// Authorizes the service, also where the device has denied or blocked it.
     void admit(Device &device);
 
     /// Applies the outcomes that are due.

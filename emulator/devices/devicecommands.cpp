@@ -114,7 +114,7 @@ CommandSeries::CommandSeries(const std::vector<std::string> &commands) {
     }
 }
 
-DeviceWork CommandSeries::workFor(const Device &device, AddressBook &addresses) const {
+DeviceWork CommandSeries::workOf(const Device &device, AddressBook &addresses) const {
     DeviceWork work;
     work.id = device.id;
     work.restarts = !m_action.empty();

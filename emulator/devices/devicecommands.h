@@ -33,7 +33,7 @@ public:
     const std::string &action() const { return m_action; }
 
     /// What the commands mean for a device.
-    DeviceWork workFor(const Device &device, AddressBook &addresses) const;
+    DeviceWork workOf(const Device &device, AddressBook &addresses) const;
 
 private:
     void judgeEdit(const Device &device, const DeviceCommand &command, DeviceWork &work) const;

@@ -1,6 +1,6 @@
 #include "devices/devicecommit.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "model.h"
 #include "simulation/clock.h"
 #include "simulation/devicemaker.h"
@@ -56,7 +56,7 @@ bool fits(const Json &value, Json::value_t type) {
     return type == Json::value_t::number_integer ? value.is_number_integer() : value.type() == type;
 }
 
-/// A value that the service itself handed out may come back, whatever its type.
+/// A value that the service itself sent is accepted, also when its type is wrong.
 void judgeMembers(const Json &record, const Json &known) {
     for (const auto &[name, value] : record.items()) {
         const auto type = knownMembers().find(name);
@@ -91,7 +91,7 @@ std::vector<std::string> withOverview(std::vector<std::string> sites) {
     return sites;
 }
 
-/// A record that was typed in names no class; the service tells it from the model.
+/// A record that was typed in names no class; the service derives it from the model.
 Json classified(Json record) {
     const auto type = record.find("d_svrtype");
     const auto model = record.find("d_model");

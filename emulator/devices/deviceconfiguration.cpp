@@ -1,6 +1,6 @@
 #include "devices/deviceconfiguration.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/records.h"
 
 #include <yaml-cpp/yaml.h>

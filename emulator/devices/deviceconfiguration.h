@@ -8,7 +8,7 @@ namespace emulator {
 
 struct Device;
 
-/// The configuration that a device tells of itself: the sections System, Media, Network, Storage and Custom,
+/// The configuration that a device reports: the sections System, Media, Network, Storage and Custom,
 /// each with its items.
 Json configurationOf(const Device &device);
 

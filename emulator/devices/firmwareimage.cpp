@@ -71,7 +71,7 @@ bool FirmwareImage::fits(const std::string &model) const {
                                            [&](const auto &prefix) { return model.starts_with(prefix); });
 }
 
-DeviceWork FirmwareImage::workFor(const Device &device) const {
+DeviceWork FirmwareImage::workOf(const Device &device) const {
     const Json record = Json::parse(device.body);
     const std::string present = textIn(record, "d_fw");
     DeviceWork work;

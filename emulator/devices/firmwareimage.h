@@ -19,7 +19,7 @@ class FirmwareImage {
 public:
     explicit FirmwareImage(const UploadedFile &file);
 
-    DeviceWork workFor(const Device &device) const;
+    DeviceWork workOf(const Device &device) const;
 
 private:
     void readHeader(const std::string &line);
@@ -27,7 +27,7 @@ private:
 
     bool m_isBroken = false;
     std::vector<std::string> m_models; ///< empty for every model
-    std::string m_version;             ///< empty where nothing tells it
+    std::string m_version;             ///< empty when unknown
 };
 
 } // namespace emulator

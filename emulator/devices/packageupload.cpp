@@ -46,9 +46,9 @@ std::int64_t usageWith(const Json &record, std::uint64_t size) {
 DeviceWork packageWork(const UploadedFile &file, bool onCard, const Device &device) {
     const Json record = Json::parse(device.body);
     auto packages = packagesOf(record);
-    const auto place = std::find(packages.begin(), packages.end(), file.name);
-    const bool isNew = place == packages.end();
-    const auto slot = static_cast<std::size_t>(place - packages.begin()) + 1;
+    const auto known = std::find(packages.begin(), packages.end(), file.name);
+    const bool isNew = known == packages.end();
+    const auto slot = static_cast<std::size_t>(known - packages.begin()) + 1;
     DeviceWork work;
     work.id = device.id;
     work.failure = onCard ? cardFailure(record, std::min(slot, slots)) : std::string();

@@ -1,6 +1,6 @@
 #include "devices/quicksetup.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "simulation/clock.h"
 
 #include <algorithm>

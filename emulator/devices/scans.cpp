@@ -1,6 +1,6 @@
 #include "devices/scans.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "simulation/devicemaker.h"
 #include "simulation/ipv4.h"
 #include "tables/devicetable.h"
@@ -18,10 +18,10 @@ namespace {
 constexpr std::uint64_t firstNeighbour = 1000000;
 constexpr std::uint64_t neighbourCount = 40;
 constexpr std::size_t maxNeighbours = 2000;
-// A search of the whole network meets managed devices too; a few of them are enough to be told apart.
+// A search of the whole network meets managed devices too; a few of them are enough to see the difference.
 constexpr std::size_t managedInSearch = 5;
-constexpr std::int64_t firstAnswerMs = 400;
-constexpr std::int64_t lastAnswerMs = 2000;
+constexpr std::int64_t firstResponseMs = 400;
+constexpr std::int64_t lastResponseMs = 2000;
 
 std::uint32_t checkedAddress(const std::string &text) {
     const auto number = addressNumber(text);
@@ -119,7 +119,7 @@ void Scans::search(const Target &target, std::size_t maxManaged, std::int64_t no
     const auto count = static_cast<std::int64_t>(m_found.size());
     for (std::int64_t i = 0; i < count; ++i) {
         m_found[static_cast<std::size_t>(i)].at =
-            nowMs + firstAnswerMs + (lastAnswerMs - firstAnswerMs) * (i + 1) / count;
+            nowMs + firstResponseMs + (lastResponseMs - firstResponseMs) * (i + 1) / count;
     }
 }
 

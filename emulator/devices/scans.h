@@ -12,12 +12,13 @@ namespace emulator {
 
 class DeviceTable;
 
-/// Looks for devices on the network: some that nobody manages yet, those that were removed, and managed ones.
+/// Looks for devices on the network: some that are not managed yet, those that were removed, and managed
+/// ones.
 class Scans {
 public:
     explicit Scans(const DeviceTable &devices) : m_devices(devices) {}
 
-    /// Puts devices on the network that nobody manages.
+    /// Puts unmanaged devices on the network.
     void seedNeighbours(std::uint64_t seed);
 
     /// Each start forgets what the scan before it found. The addresses are IPv4 texts.

@@ -27,13 +27,13 @@ std::string accountsText(const std::vector<Account> &accounts, Page page) {
     return jsonText({{"total_items", accounts.size()}, {"data", members}});
 }
 
-Answer listAccounts(Service &service, const Call &call) {
+Response listAccounts(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
-    return Answer::secret(
+    return Response::secret(
         service.withModel([&](Model &model) { return accountsText(model.accounts.all(), page); }));
 }
 
-Answer newAccount(Service &service, const Call &call) {
+Response newAccount(Service &service, const Call &call) {
     Account account{filledTextMember(call.body, "email"), optionalText(call.body, "name"),
                     filledTextMember(call.body, "permi"), optionalText(call.body, "desp"),
                     hashPassword(newPassword(call.body, "pass"))};
@@ -49,7 +49,7 @@ Answer newAccount(Service &service, const Call &call) {
     return {};
 }
 
-Answer changePassword(Service &service, const Call &call) {
+Response changePassword(Service &service, const Call &call) {
     const std::string email = filledTextMember(call.body, "email");
     const auto old = plainPassword(textMember(call.body, "old"));
     const PasswordHash replacement = hashPassword(newPassword(call.body, "new"));
@@ -69,9 +69,9 @@ Answer changePassword(Service &service, const Call &call) {
 
 Endpoints accountEndpoints() {
     return {
-        {"POST", "/v1/accm/list", Role::Anybody, &listAccounts},
-        {"POST", "/v1/accm/new", Role::Anybody, &newAccount},
-        {"POST", "/v1/accm/revpas", Role::Anybody, &changePassword},
+        {"POST", "/v1/accm/list", Role::Anyone, &listAccounts},
+        {"POST", "/v1/accm/new", Role::Anyone, &newAccount},
+        {"POST", "/v1/accm/revpas", Role::Anyone, &changePassword},
     };
 }
 

@@ -2,8 +2,7 @@
 #include "http/endpoint.h"
 #include "service.h"
 #include "simulation/clock.h"
-#include "tasks/uploadorders.h"
-#include "tasks/workorders.h"
+#include "tasks/taskwork.h"
 
 #include <charconv>
 
@@ -16,8 +15,8 @@ constexpr std::int64_t maxValidityDays = 36500;
 
 using FileWork = DeviceWork (CertificateFiles::*)(const Device &, const Json &) const;
 
-Answer takeFiles(Service &service, const Call &call, const char *type, FileWork workFor,
-                 bool needsAuthority) {
+Response takeFiles(Service &service, const Call &call, const char *type, FileWork workOf,
+                   bool needsAuthority) {
     const CertificateFiles files(call.files);
     if (call.files.empty() || files.hasAuthority() != needsAuthority)
         throw Refusal(Code::Malformed, "the form lacks a file or has one too many");
@@ -27,34 +26,34 @@ Answer takeFiles(Service &service, const Call &call, const char *type, FileWork 
     order.type = type;
     order.files = call.files;
     startUpload(service, order, [&](const Device &device, const Json &parameters) {
-        return (files.*workFor)(device, parameters);
+        return (files.*workOf)(device, parameters);
     });
     return {};
 }
 
-Answer installCertificates(Service &service, const Call &call) {
+Response installCertificates(Service &service, const Call &call) {
     return takeFiles(service, call, "deviceHttpsCertInstall", &CertificateFiles::install, false);
 }
 
-Answer installWithKeys(Service &service, const Call &call) {
+Response installWithKeys(Service &service, const Call &call) {
     return takeFiles(service, call, "deviceHttpsCertsAndPKeys", &CertificateFiles::installWithKey, false);
 }
 
-Answer securePorts(Service &service, const Call &call) {
+Response securePorts(Service &service, const Call &call) {
     return takeFiles(service, call, "deviceIEEE_EAP_PEAP", &CertificateFiles::portSecurity, true);
 }
 
-Answer securePortsWithKeys(Service &service, const Call &call) {
+Response securePortsWithKeys(Service &service, const Call &call) {
     return takeFiles(service, call, "deviceIEEE_EAP_TLS", &CertificateFiles::portSecurityWithKey, true);
 }
 
 /// A number that comes as one or as a text.
-std::int64_t looseNumber(const Json &body, const char *name, std::int64_t most) {
+std::int64_t looseNumber(const Json &body, const char *name, std::int64_t max) {
     const Json &value = member(body, name);
     const std::string text = value.is_string() ? value.get<std::string>() : jsonText(value);
     std::int64_t number = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (error != std::errc() || end != text.data() + text.size() || number < 1 || number > most)
+    if (error != std::errc() || end != text.data() + text.size() || number < 1 || number > max)
         throw Refusal(Code::Malformed, std::string("\"") + name + "\" is no such number");
     return number;
 }
@@ -77,7 +76,7 @@ std::string ownerText(const Json &body) {
     return country.empty() ? text : text + ",C=" + country;
 }
 
-Answer generateCertificates(Service &service, const Call &call) {
+Response generateCertificates(Service &service, const Call &call) {
     const Json port = looseNumber(call.body, "https_port", 65535);
     const std::int64_t expiresAt = nowMs() + looseNumber(call.body, "validity", maxValidityDays) * dayMs;
     const std::string owner = ownerText(call.body);

@@ -3,7 +3,7 @@
 #include "http/endpoint.h"
 #include "service.h"
 #include "simulation/clock.h"
-#include "tasks/workorders.h"
+#include "tasks/taskwork.h"
 
 namespace emulator {
 
@@ -33,16 +33,16 @@ void checkStored(const Json &commands) {
     }
 }
 
-Answer listCommands(Service &service, const Call &call) {
+Response listCommands(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
     const Json all = service.withModel(&storedCommands);
     Json part = Json::array();
     for (std::size_t i = page.start; i < all.size() && part.size() < page.count; ++i)
         part.push_back(all[i]);
-    return Answer::secret(jsonText(part));
+    return Response::secret(jsonText(part));
 }
 
-Answer commitCommands(Service &service, const Call &call) {
+Response commitCommands(Service &service, const Call &call) {
     const std::string stage = textMember(call.body, "state");
     const Json &commands = arrayMember(call.body, "cgis");
     service.withModel([&](Model &model) {
@@ -73,24 +73,24 @@ std::vector<std::string> commandsOf(const Json &body) {
     return commands;
 }
 
-Json answerAtOnce(Model &model, Device &device, const CommandSeries &series, AddressBook &addresses) {
-    const DeviceWork work = series.workFor(device, addresses);
-    const auto answer = [&](int status, const std::string &body) {
+Json respondAtOnce(Model &model, Device &device, const CommandSeries &series, AddressBook &addresses) {
+    const DeviceWork work = series.workOf(device, addresses);
+    const auto response = [&](int status, const std::string &body) {
         return Json{{"id", device.id}, {"status", status}, {"body", body}};
     };
     switch (doAtOnce(model, device, work)) {
     case Outcome::NoConnection:
-        return answer(503, "no connection");
+        return response(503, "no connection");
     case Outcome::NotAuthorized:
-        return answer(401, "not authorized");
+        return response(401, "not authorized");
     case Outcome::Failed:
-        return answer(400, work.failure);
+        return response(400, work.failure);
     case Outcome::Done:
         break;
     }
     if (!series.action().empty())
         model.engine.restart(device, series.action(), nowMs());
-    return answer(200, "ok");
+    return response(200, "ok");
 }
 
 Json runCommands(Service &service, const Call &call) {
@@ -101,25 +101,25 @@ Json runCommands(Service &service, const Call &call) {
         checkKnownWithoutTask(model, targets);
         AddressBook addresses(model);
         startUnderTasks(model, targets, {},
-                        [&](const Device &device) { return series.workFor(device, addresses); });
-        Json answers = Json::array();
+                        [&](const Device &device) { return series.workOf(device, addresses); });
+        Json responses = Json::array();
         Transaction transaction(model.store.database());
         for (const Target &target : targets)
-            answers.push_back(target.taskId.empty()
-                                  ? answerAtOnce(model, model.devices.get(target.id), series, addresses)
-                                  : Json{{"id", target.id}, {"status", 0}, {"body", ""}});
+            responses.push_back(target.taskId.empty()
+                                    ? respondAtOnce(model, model.devices.get(target.id), series, addresses)
+                                    : Json{{"id", target.id}, {"status", 0}, {"body", ""}});
         transaction.commit();
-        return answers;
+        return responses;
     });
 }
 
-Answer runSilently(Service &service, const Call &call) {
+Response runSilently(Service &service, const Call &call) {
     runCommands(service, call);
     return {};
 }
 
-Answer runTelling(Service &service, const Call &call) {
-    return Answer::plain(jsonText(runCommands(service, call)));
+Response runTelling(Service &service, const Call &call) {
+    return Response::plain(jsonText(runCommands(service, call)));
 }
 
 } // namespace

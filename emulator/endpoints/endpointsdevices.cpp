@@ -3,7 +3,7 @@
 #include "service.h"
 #include "simulation/clock.h"
 #include "tables/credentials.h"
-#include "tasks/workorders.h"
+#include "tasks/taskwork.h"
 
 #include <charconv>
 
@@ -20,25 +20,25 @@ int policyMask(const Json &body) {
     return mask;
 }
 
-Answer listDevices(Service &service, const Call &call) {
+Response listDevices(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
-    return Answer::secret(service.withModel([&](Model &model) {
+    return Response::secret(service.withModel([&](Model &model) {
         model.authorization.settle(nowMs());
         model.engine.settle(nowMs());
         return model.devices.pageText(page);
     }));
 }
 
-Answer listStatuses(Service &service, const Call &call) {
+Response listStatuses(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
-    return Answer::secret(service.withModel([&](Model &model) {
+    return Response::secret(service.withModel([&](Model &model) {
         model.authorization.settle(nowMs());
         model.engine.settle(nowMs());
         return model.devices.statusText(page);
     }));
 }
 
-Answer commitDeviceList(Service &service, const Call &call) {
+Response commitDeviceList(Service &service, const Call &call) {
     const std::string stage = textMember(call.body, "state");
     const Json &devices = arrayMember(call.body, "devices");
     service.withModel([&](Model &model) {
@@ -54,20 +54,20 @@ void checkTimeout(const Json &body) {
         throw Refusal(Code::Malformed, "\"timeout\" must be positive");
 }
 
-Answer scan(Service &service, const Call &call) {
+Response scan(Service &service, const Call &call) {
     checkTimeout(call.body);
     service.withModel([](Model &model) { model.scans.start(nowMs()); });
     return {};
 }
 
-Answer scanAddress(Service &service, const Call &call) {
+Response scanAddress(Service &service, const Call &call) {
     checkTimeout(call.body);
     const std::string address = filledTextMember(call.body, "ip");
     service.withModel([&](Model &model) { model.scans.startAddress(address, nowMs()); });
     return {};
 }
 
-Answer scanRange(Service &service, const Call &call) {
+Response scanRange(Service &service, const Call &call) {
     checkTimeout(call.body);
     const std::string first = filledTextMember(call.body, "ip_start");
     const std::string last = filledTextMember(call.body, "ip_end");
@@ -75,11 +75,11 @@ Answer scanRange(Service &service, const Call &call) {
     return {};
 }
 
-Answer scanResults(Service &service, const Call &) {
-    return Answer::secret(service.withModel([](Model &model) { return model.scans.foundText(nowMs()); }));
+Response scanResults(Service &service, const Call &) {
+    return Response::secret(service.withModel([](Model &model) { return model.scans.foundText(nowMs()); }));
 }
 
-Answer setPolicy(Service &service, const Call &call) {
+Response setPolicy(Service &service, const Call &call) {
     auto targets = targetsOf(call.body);
     DeviceWork work;
     work.changes["d_policy"] = {{"plen", integerMember(call.body, "plen")}, {"type", policyMask(call.body)}};
@@ -90,7 +90,7 @@ Answer setPolicy(Service &service, const Call &call) {
     return {};
 }
 
-Answer authorize(Service &service, const Call &call) {
+Response authorize(Service &service, const Call &call) {
     const auto targets = targetsOf(call.body);
     const std::string account = filledTextMember(call.body, "acc");
     const auto password = plainPassword(textMember(call.body, "pass"));

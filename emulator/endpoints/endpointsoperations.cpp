@@ -4,7 +4,7 @@
 #include "http/endpoint.h"
 #include "service.h"
 #include "simulation/clock.h"
-#include "tasks/workorders.h"
+#include "tasks/taskwork.h"
 
 namespace emulator {
 
@@ -17,7 +17,7 @@ std::vector<Target> underTask(const std::vector<std::string> &ids, const std::st
     return targets;
 }
 
-Answer assignAutomatically(Service &service, const Call &call) {
+Response assignAutomatically(Service &service, const Call &call) {
     const auto targets = underTask(idsOf(targetsOf(call.body)), filledTextMember(call.body, "tid"));
     service.withModel([&](Model &model) {
         model.engine.settle(nowMs());
@@ -28,19 +28,19 @@ Answer assignAutomatically(Service &service, const Call &call) {
     return {};
 }
 
-Answer assignByHand(Service &service, const Call &call) {
+Response assignByHand(Service &service, const Call &call) {
     const AddressAssignment assignment(call.body);
     const auto targets = underTask(assignment.deviceIds(), filledTextMember(call.body, "tid"));
     service.withModel([&](Model &model) {
         model.engine.settle(nowMs());
         AddressBook addresses(model);
         startUnderTasks(model, targets, "deviceAssignIPManual",
-                        [&](const Device &device) { return assignment.workFor(device, addresses); });
+                        [&](const Device &device) { return assignment.workOf(device, addresses); });
     });
     return {};
 }
 
-Answer setUpQuickly(Service &service, const Call &call) {
+Response setUpQuickly(Service &service, const Call &call) {
     const auto targets = targetsOf(call.body);
     DeviceWork work;
     work.changes = quickSetupChanges(call.body, nowMs());

@@ -11,7 +11,7 @@ void note(Model &model, const Call &call, const std::string &what) {
     model.log.add(nowMs(), "System", "Audit", what, call.session.account);
 }
 
-Answer signIn(Service &service, const Call &call) {
+Response signIn(Service &service, const Call &call) {
     const std::string email = filledTextMember(call.body, "email");
     const std::string password = plainPassword(filledTextMember(call.body, "login")).value_or("");
     const Orb::User user = service.withModel([&](Model &model) { return model.orb.user(email); });
@@ -27,12 +27,12 @@ Answer signIn(Service &service, const Call &call) {
     return {};
 }
 
-Answer organizations(Service &service, const Call &) {
-    return Answer::secret(
+Response organizations(Service &service, const Call &) {
+    return Response::secret(
         service.withModel([](Model &model) { return model.orb.organizationsText(nowMs()); }));
 }
 
-Answer addService(Service &service, const Call &call) {
+Response addService(Service &service, const Call &call) {
     const std::string organization = filledTextMember(call.body, "org_id");
     const std::string site = filledTextMember(call.body, "site_id");
     service.withModel([&](Model &model) {
@@ -42,7 +42,7 @@ Answer addService(Service &service, const Call &call) {
     return {};
 }
 
-Answer disconnect(Service &service, const Call &call) {
+Response disconnect(Service &service, const Call &call) {
     service.withModel([&](Model &model) {
         model.orb.disconnect();
         note(model, call, "Remote-access service disconnected");
@@ -50,17 +50,17 @@ Answer disconnect(Service &service, const Call &call) {
     return {};
 }
 
-Answer cachedStatus(Service &service, const Call &) {
-    return Answer::secret(service.withModel([](Model &model) { return model.orb.statusText(); }));
+Response cachedStatus(Service &service, const Call &) {
+    return Response::secret(service.withModel([](Model &model) { return model.orb.statusText(); }));
 }
 
-Answer isAdded(Service &service, const Call &) {
+Response isAdded(Service &service, const Call &) {
     const bool added = service.withModel([](Model &model) { return model.orb.isAdded(); });
-    return Answer::secret(jsonText({{"is_orb_service_added", added}}));
+    return Response::secret(jsonText({{"is_orb_service_added", added}}));
 }
 
 /// The state that holds afterwards travels as an object of its own, shaped like the one in the status.
-Answer setRemoteAccess(Service &service, const Call &call) {
+Response setRemoteAccess(Service &service, const Call &call) {
     const Json &wanted = member(call.body, "enable");
     if (!wanted.is_boolean())
         throw Refusal(Code::Malformed, "\"enable\" is no boolean");
@@ -68,7 +68,7 @@ Answer setRemoteAccess(Service &service, const Call &call) {
         model.orb.setRemoteAccess(wanted.get<bool>());
         note(model, call, wanted.get<bool>() ? "Remote access switched on" : "Remote access switched off");
     });
-    return Answer::secret(jsonText({{"enable", wanted}}));
+    return Response::secret(jsonText({{"enable", wanted}}));
 }
 
 } // namespace

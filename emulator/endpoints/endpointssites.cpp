@@ -11,33 +11,33 @@ std::string parentOf(const Json &body) {
     return parent.empty() ? std::string(rootSiteId) : parent;
 }
 
-Answer newSite(Service &service, const Call &call) {
+Response newSite(Service &service, const Call &call) {
     const std::string name = filledTextMember(call.body, "sitename");
     const std::string parent = parentOf(call.body);
     const std::string id =
         service.withModel([&](Model &model) { return model.sites.add(name, parent, nowMs()); });
-    return Answer::secret(jsonText({{"siteid", id}}));
+    return Response::secret(jsonText({{"siteid", id}}));
 }
 
-Answer updateSite(Service &service, const Call &call) {
+Response updateSite(Service &service, const Call &call) {
     const std::string id = filledTextMember(call.body, "siteid");
     const std::string name = filledTextMember(call.body, "sitename");
     service.withModel([&](Model &model) { model.sites.rename(id, name); });
     return {};
 }
 
-Answer dropSite(Service &service, const Call &call) {
+Response dropSite(Service &service, const Call &call) {
     const std::string id = filledTextMember(call.body, "siteid");
     service.withModel([&](Model &model) { removeSite(model, id); });
     return {};
 }
 
-Answer listSites(Service &service, const Call &call) {
+Response listSites(Service &service, const Call &call) {
     const Page page = pageOf(call.body);
-    return Answer::secret(service.withModel([&](Model &model) { return model.sites.pageText(page); }));
+    return Response::secret(service.withModel([&](Model &model) { return model.sites.pageText(page); }));
 }
 
-Answer commitSiteList(Service &service, const Call &call) {
+Response commitSiteList(Service &service, const Call &call) {
     const std::string stage = textMember(call.body, "state");
     const Json &sites = arrayMember(call.body, "sites");
     service.withModel([&](Model &model) {

@@ -1,9 +1,8 @@
-#include "devices/devicetargets.h"
 #include "devices/firmwareimage.h"
 #include "devices/packageupload.h"
 #include "http/endpoint.h"
 #include "http/utf8path.h"
-#include "tasks/uploadorders.h"
+#include "tasks/taskwork.h"
 
 namespace emulator {
 
@@ -26,16 +25,16 @@ const UploadedFile &imageOf(const Call &call) {
 
 void startFirmware(Service &service, const UploadOrder &order, const UploadedFile &file) {
     const FirmwareImage image(file);
-    startUpload(service, order, [&](const Device &device, const Json &) { return image.workFor(device); });
+    startUpload(service, order, [&](const Device &device, const Json &) { return image.workOf(device); });
 }
 
-Answer uploadFirmware(Service &service, const Call &call) {
+Response uploadFirmware(Service &service, const Call &call) {
     startFirmware(service, orderOf(call, "deviceFWUpgrade"), imageOf(call));
     return {};
 }
 
 /// The caller runs on this machine and names the file instead of sending it.
-Answer readFirmware(Service &service, const Call &call) {
+Response readFirmware(Service &service, const Call &call) {
     const UploadedFile file =
         localFile(pathOf(filledTextMember(call.body, "local")), filledTextMember(call.body, "localn"));
     UploadOrder order = orderOf(call, "deviceFWUpgrade");
@@ -44,7 +43,7 @@ Answer readFirmware(Service &service, const Call &call) {
     return {};
 }
 
-Answer uploadConfiguration(Service &service, const Call &call) {
+Response uploadConfiguration(Service &service, const Call &call) {
     UploadOrder order = orderOf(call, "deviceConfigFileUpload");
     order.deviceIds = idsOf(targetsOf(call.body, "device_ids"));
     const bool isEmpty = imageOf(call).size == 0;
@@ -58,7 +57,7 @@ Answer uploadConfiguration(Service &service, const Call &call) {
     return {};
 }
 
-Answer uploadPackage(Service &service, const Call &call) {
+Response uploadPackage(Service &service, const Call &call) {
     UploadOrder order = orderOf(call, "devicePackageUpload");
     order.deviceIds = idsOf(targetsOf(call.body, "device_ids"));
     const Json &onCard = member(call.body, "sd_card");

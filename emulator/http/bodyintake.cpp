@@ -16,7 +16,7 @@ constexpr std::uint64_t maxKept = 64U << 20;
 
 } // namespace
 
-BodyIntake::BodyIntake(IncomingRequest &incoming, const BodyLimits &limits, Watch watch)
+BodyIntake::BodyIntake(Request &incoming, const BodyLimits &limits, Watch watch)
     : m_incoming(incoming), m_limits(limits), m_watch(std::move(watch)) {}
 
 BodyIntake::Result BodyIntake::readText(const httplib::ContentReader &reader) {

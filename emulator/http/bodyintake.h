@@ -16,7 +16,7 @@ class ContentReader;
 
 namespace emulator {
 
-struct IncomingRequest;
+struct Request;
 
 /// Bounds of a request's body, in bytes.
 struct BodyLimits {
@@ -29,10 +29,10 @@ struct BodyLimits {
 class BodyIntake {
 public:
     enum class Result { Whole, Broken, TooLong };
-    /// Is told of each piece; false ends the reading.
+    /// Is called with each piece; false ends the reading.
     using Watch = std::function<bool(std::size_t)>;
 
-    BodyIntake(IncomingRequest &incoming, const BodyLimits &limits, Watch watch);
+    BodyIntake(Request &incoming, const BodyLimits &limits, Watch watch);
 
     /// Called once, when the parameters of a form are there and its files follow.
     void setOnParameters(std::function<void()> onParameters) { m_onParameters = std::move(onParameters); }
@@ -47,7 +47,7 @@ private:
     void endPart();
     Result resultOf(bool whole) const;
 
-    IncomingRequest &m_incoming;
+    Request &m_incoming;
     BodyLimits m_limits;
     Watch m_watch;
     std::function<void()> m_onParameters;

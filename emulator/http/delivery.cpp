@@ -1,10 +1,12 @@
 #include "http/delivery.h"
 
+#include "http/faults.h"
+#include "http/jsonaccess.h"
+#include "http/response.h"
 #include "platform.h"
 #include "stopsignal.h"
 
 #include <httplib.h>
-
 #include <openssl/ssl.h>
 
 #include <memory>
@@ -35,6 +37,60 @@ void deliverPart(const httplib::Request &request, httplib::Response &response, s
             cutConnection(descriptor);
             return false;
         });
+}
+
+constexpr std::string_view dataMember = R"(,"data":)";
+
+Json otherType(const Json &value);
+
+/// Keeps the containers that hold the members and gives every member another type.
+Json withCorruptMembers(const Json &value) {
+    Json corrupted = value;
+    for (Json &element : corrupted)
+        element = value.is_array() && element.is_object() ? withCorruptMembers(element) : otherType(element);
+    return corrupted;
+}
+
+Json otherType(const Json &value) {
+    switch (value.type()) {
+    case Json::value_t::string:
+        return 42;
+    case Json::value_t::array:
+        return {{"first", value.empty() ? Json() : value.front()}};
+    case Json::value_t::object:
+        return Json::array({value});
+    case Json::value_t::boolean:
+        return "yes";
+    default:
+        return "a text";
+    }
+}
+
+void corruptTypes(Response &response, const std::string &where) {
+    if (response.data.empty())
+        return;
+    const Json data = Json::parse(response.data);
+    const bool wholly = where == "data" || !data.is_structured();
+    response.data = jsonText(wholly ? otherType(data) : withCorruptMembers(data));
+}
+
+void replaceFirst(std::string &text, std::string_view what, std::string_view with) {
+    if (const auto at = text.find(what); at != std::string::npos)
+        text.replace(at, what.size(), with);
+}
+
+/// An envelope ends with its data, and a quote within its message is escaped.
+void cutData(std::string &body) {
+    body.erase(body.find(dataMember));
+    body += '}';
+}
+
+void breakCipher(std::string &body) {
+    const auto start = body.find(std::string(dataMember) + "\"D1:");
+    if (start != std::string::npos) {
+        char &middle = body[(start + body.size()) / 2];
+        middle = middle == 'A' ? 'B' : 'A';
+    }
 }
 
 } // namespace
@@ -69,6 +125,25 @@ void deliverDripping(httplib::Response &response, std::string body, const char *
         kept->size(), type, [kept, &stop](std::size_t offset, std::size_t, httplib::DataSink &sink) {
             return sink.write(kept->data() + offset, 1) && !stop.waitFor(milliseconds(1000));
         });
+}
+
+std::string corruptedBody(Response response, const Fault &fault) {
+    if (fault.kind == FaultKind::NotJson)
+        return "<html><body>Please sign in to this network.</body></html>";
+    if (response.isFile)
+        return std::move(response.data);
+    if (fault.kind == FaultKind::WrongTypes && fault.where != "code")
+        corruptTypes(response, fault.where);
+    std::string body = envelope(response);
+    if (fault.kind == FaultKind::WrongTypes && fault.where == "code") {
+        const std::string code = std::to_string(response.code);
+        replaceFirst(body, R"("code":)" + code, R"("code":")" + code + '"');
+    } else if (fault.kind == FaultKind::NoData) {
+        cutData(body);
+    } else if (fault.kind == FaultKind::BadCipher) {
+        breakCipher(body);
+    }
+    return body;
 }
 
 } // namespace emulator

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "http/endpoint.h"
+#include "http/jsonaccess.h"
 
 #include <string>
 #include <unordered_map>
@@ -9,7 +10,7 @@
 namespace emulator {
 
 /// A request as it came over the wire.
-struct IncomingRequest {
+struct Request {
     std::string verb;
     std::string path;
     std::string authorization;
@@ -28,13 +29,13 @@ public:
     const Endpoint *find(const std::string &path) const;
 
     /// Never throws for what a caller did; an exception is a defect.
-    Answer answer(const Endpoint &endpoint, const IncomingRequest &incoming, bool alwaysRenew);
+    Response respond(const Endpoint &endpoint, const Request &incoming, bool alwaysRenew);
 
 private:
-    Answer granted(const Endpoint &endpoint, const IncomingRequest &incoming, bool alwaysRenew);
-    Call callOf(const Endpoint &endpoint, const IncomingRequest &incoming);
-    SessionToken sessionOf(const IncomingRequest &incoming, const Json &body, Role gate);
-    void renewToken(Answer &answer, const std::string &authorization, bool always);
+    Response granted(const Endpoint &endpoint, const Request &incoming, bool alwaysRenew);
+    Call callOf(const Endpoint &endpoint, const Request &incoming);
+    SessionToken sessionOf(const Request &incoming, const Json &body, Role role);
+    void renewToken(Response &response, const std::string &authorization, bool always);
 
     Service &m_service;
     std::unordered_map<std::string, Endpoint> m_endpoints;

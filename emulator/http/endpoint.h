@@ -1,7 +1,7 @@
 #pragma once
 
-#include "http/answer.h"
 #include "http/jsonaccess.h"
+#include "http/response.h"
 #include "http/uploadedfile.h"
 #include "tables/records.h"
 
@@ -15,9 +15,9 @@ class Service;
 
 /// Who may call an endpoint.
 enum class Role {
-    Anybody, ///< with a generic token
-    Reader,  ///< any session
-    Writer,  ///< a session whose account may change things
+    Anyone, ///< with a generic token
+    Reader, ///< any session
+    Writer, ///< a session whose account may change things
     Administrator,
 };
 
@@ -27,19 +27,19 @@ enum class Body {
     Form, ///< parameters as JSON in the part "text", and files
 };
 
-/// A request that has passed its gate.
+/// A request that its endpoint's role permits.
 struct Call {
     Json body;
     std::span<const UploadedFile> files;
-    SessionToken session; ///< empty at the gate for anybody
+    SessionToken session; ///< empty for a request with a generic token
 };
 
 /// One path of the service. The handler throws Refusal for a request that it does not grant.
 struct Endpoint {
     const char *verb;
     const char *path;
-    Role gate;
-    Answer (*handle)(Service &, const Call &);
+    Role role;
+    Response (*handle)(Service &, const Call &);
     Body body = Body::Text;
 };
 

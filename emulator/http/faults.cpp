@@ -18,7 +18,7 @@ struct KindName {
 };
 
 constexpr std::array<KindName, 15> kinds = {{
-    {"no-answer", FaultKind::NoAnswer, Value::None},
+    {"no-answer", FaultKind::NoResponse, Value::None},
     {"late", FaultKind::Late, Value::Number},
     {"reset", FaultKind::Reset, Value::None},
     {"status", FaultKind::Status, Value::Number},
@@ -26,7 +26,7 @@ constexpr std::array<KindName, 15> kinds = {{
     {"wrong-types", FaultKind::WrongTypes, Value::Where},
     {"no-data", FaultKind::NoData, Value::None},
     {"bad-cipher", FaultKind::BadCipher, Value::None},
-    {"code", FaultKind::AnswerCode, Value::Number},
+    {"code", FaultKind::ResponseCode, Value::Number},
     {"renew", FaultKind::Renew, Value::None},
     {"expire", FaultKind::Expire, Value::None},
     {"drip", FaultKind::Drip, Value::None},

@@ -12,7 +12,7 @@
 namespace emulator {
 
 enum class FaultKind {
-    NoAnswer,
+    NoResponse,
     Late,
     Reset,
     Status,
@@ -20,7 +20,7 @@ enum class FaultKind {
     WrongTypes,
     NoData,
     BadCipher,
-    AnswerCode,
+    ResponseCode,
     Renew,
     Expire,
     Drip,
@@ -31,7 +31,7 @@ enum class FaultKind {
 
 /// One way to answer badly, and when.
 struct Fault {
-    FaultKind kind = FaultKind::NoAnswer;
+    FaultKind kind = FaultKind::NoResponse;
     int number = 0;    ///< of the kinds that have one
     std::string where; ///< of wrong-types
     std::string path;  ///< beginning of the paths it is for

@@ -1,6 +1,5 @@
 #include "http/httpsserver.h"
 
-#include "http/corruption.h"
 #include "http/delivery.h"
 #include "http/dispatcher.h"
 #include "http/faults.h"
@@ -19,7 +18,7 @@ namespace emulator {
 
 namespace {
 
-// Requests that are held without an answer keep their thread.
+// Requests that are held without a response keep their thread.
 constexpr std::size_t threads = 64;
 constexpr auto jsonType = "application/json";
 constexpr auto fileType = "application/octet-stream";
@@ -32,7 +31,7 @@ void fail(httplib::Response &response, int status, const std::string &why) {
 
 void configure(httplib::SSLServer &server) {
     SSL_CTX_set_min_proto_version(server.ssl_context(), TLS1_2_VERSION);
-    // Callers come back with a fresh connection each time; tickets that nobody reads would only disturb
+    // Callers come back with a fresh connection each time; unread tickets would only disturb
     // the close of a connection.
     SSL_CTX_set_num_tickets(server.ssl_context(), 0);
     // The library would share the port with another server that asks for it; only a port whose last
@@ -125,7 +124,7 @@ void HttpsServer::route() {
 
 void HttpsServer::handle(const httplib::Request &request, httplib::Response &response,
                          const httplib::ContentReader *reader) {
-    IncomingRequest incoming;
+    Request incoming;
     incoming.verb = request.method;
     incoming.path = request.path;
     incoming.authorization = request.get_header_value("Authorization");
@@ -147,16 +146,16 @@ void HttpsServer::handle(const httplib::Request &request, httplib::Response &res
 }
 
 BodyIntake::Result HttpsServer::readBody(const httplib::Request &request,
-                                         const httplib::ContentReader &reader, IncomingRequest &incoming,
+                                         const httplib::ContentReader &reader, Request &incoming,
                                          const FaultPlan &plan, std::optional<WorkArrival> &arrival) {
     using Clock = std::chrono::steady_clock;
     const auto start = Clock::now();
     const bool cuts = plan.main && plan.main->kind == FaultKind::CutBody;
-    const auto most = cuts ? static_cast<std::uint64_t>(plan.main->number) : UINT64_MAX;
+    const auto max = cuts ? static_cast<std::uint64_t>(plan.main->number) : UINT64_MAX;
     std::uint64_t size = 0;
     const auto watch = [&](std::size_t count) {
         size += count;
-        if (size >= most) {
+        if (size >= max) {
             cutConnectionOf(request);
             return false;
         }
@@ -172,14 +171,14 @@ BodyIntake::Result HttpsServer::readBody(const httplib::Request &request,
     return isForm ? intake.readForm(reader) : intake.readText(reader);
 }
 
-void HttpsServer::judge(const httplib::Request &request, httplib::Response &response,
-                        const IncomingRequest &incoming, const FaultPlan &plan) {
+void HttpsServer::judge(const httplib::Request &request, httplib::Response &response, const Request &incoming,
+                        const FaultPlan &plan) {
     const int delay = m_latencyMs + plan.lateMs;
     if (delay > 0 && m_stop.waitFor(std::chrono::milliseconds(delay)))
         return fail(response, 503, "the service stops");
     if (plan.expire)
         m_service.withModel([](Model &model) { model.sessions.closeAll(); });
-    if (plan.main && plan.main->kind == FaultKind::NoAnswer)
+    if (plan.main && plan.main->kind == FaultKind::NoResponse)
         return holdUnanswered(request, m_stop);
     if (plan.main && plan.main->kind == FaultKind::Status) {
         response.status = plan.main->number;
@@ -192,20 +191,20 @@ void HttpsServer::judge(const httplib::Request &request, httplib::Response &resp
         response.set_header("Allow", endpoint->verb);
         return fail(response, 405, "no such verb here");
     }
-    answer(request, response, incoming, plan);
+    respond(request, response, incoming, plan);
 }
 
-void HttpsServer::answer(const httplib::Request &request, httplib::Response &response,
-                         const IncomingRequest &incoming, const FaultPlan &plan) {
-    if (plan.main && plan.main->kind == FaultKind::AnswerCode)
-        return response.set_content(envelope(Answer::refused(plan.main->number, "fault")), jsonType);
-    Answer answer = m_dispatcher->answer(*m_dispatcher->find(incoming.path), incoming, plan.renew);
-    if (!answer.token.empty())
-        response.set_header("Authorization", answer.token);
-    const char *type = answer.isFile ? fileType : jsonType;
-    std::string body = plan.main       ? spoiledBody(std::move(answer), *plan.main)
-                       : answer.isFile ? std::move(answer.data)
-                                       : envelope(answer);
+void HttpsServer::respond(const httplib::Request &request, httplib::Response &response,
+                          const Request &incoming, const FaultPlan &plan) {
+    if (plan.main && plan.main->kind == FaultKind::ResponseCode)
+        return response.set_content(envelope(Response::refused(plan.main->number, "fault")), jsonType);
+    Response result = m_dispatcher->respond(*m_dispatcher->find(incoming.path), incoming, plan.renew);
+    if (!result.token.empty())
+        response.set_header("Authorization", result.token);
+    const char *type = result.isFile ? fileType : jsonType;
+    std::string body = plan.main       ? corruptedBody(std::move(result), *plan.main)
+                       : result.isFile ? std::move(result.data)
+                                       : envelope(result);
     if (plan.main && plan.main->kind == FaultKind::Reset)
         deliverHalf(request, response, std::move(body), type);
     else if (plan.main && plan.main->kind == FaultKind::Drip)

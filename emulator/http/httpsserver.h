@@ -2,7 +2,7 @@
 
 #include "http/bodyintake.h"
 #include "http/certificate.h"
-#include "tasks/workarrival.h"
+#include "tasks/taskwork.h"
 
 #include <memory>
 #include <optional>
@@ -22,11 +22,11 @@ class Faults;
 class Service;
 class StopSignal;
 struct FaultPlan;
-struct IncomingRequest;
+struct Request;
 
-/// What the server does beside what its requests ask for.
+/// Settings of the server that hold for every request.
 struct ServerRules {
-    int latencyMs = 0; ///< added to each answer
+    int latencyMs = 0; ///< added to each response
     BodyLimits limits;
 };
 
@@ -52,12 +52,12 @@ private:
     void handle(const httplib::Request &request, httplib::Response &response,
                 const httplib::ContentReader *reader);
     BodyIntake::Result readBody(const httplib::Request &request, const httplib::ContentReader &reader,
-                                IncomingRequest &incoming, const FaultPlan &plan,
+                                Request &incoming, const FaultPlan &plan,
                                 std::optional<WorkArrival> &arrival);
-    void judge(const httplib::Request &request, httplib::Response &response, const IncomingRequest &incoming,
+    void judge(const httplib::Request &request, httplib::Response &response, const Request &incoming,
                const FaultPlan &plan);
-    void answer(const httplib::Request &request, httplib::Response &response, const IncomingRequest &incoming,
-                const FaultPlan &plan);
+    void respond(const httplib::Request &request, httplib::Response &response, const Request &incoming,
+                 const FaultPlan &plan);
 
     Service &m_service;
     Faults &m_faults;

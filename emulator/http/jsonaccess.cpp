@@ -1,6 +1,6 @@
 #include "http/jsonaccess.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 
 #include <algorithm>
 

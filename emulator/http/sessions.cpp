@@ -1,6 +1,6 @@
 #include "http/sessions.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/store.h"
 
 #include <algorithm>

@@ -1,6 +1,6 @@
 #include "http/uploadedfile.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/credentials.h"
 
 #include <algorithm>

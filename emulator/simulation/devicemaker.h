@@ -8,7 +8,7 @@
 
 namespace emulator {
 
-/// What a device on the network shows to anybody: model, address, MAC and ports.
+/// What a device on the network shows without authorization: model, address, MAC and ports.
 struct Appearance {
     std::string model;
     std::string ip;
@@ -35,7 +35,8 @@ Json firstRecord(const Appearance &appearance);
 /// A device with some members of its record changed; null takes one out.
 Device withMembers(const Device &device, const Json &members);
 
-/// Takes a record apart into the form in which it is kept: the id, the MAC and the address beside the text.
+/// Splits a record into the columns that are stored: the id, the MAC address, the IP address and the whole
+/// text.
 void setRecord(Device &device, Json record);
 
 } // namespace emulator

@@ -2,8 +2,8 @@
 
 #include "model.h"
 #include "simulation/devicemaker.h"
-#include "simulation/malformeddevices.h"
 #include "simulation/random.h"
+#include "tables/devicetable.h"
 
 #include <array>
 #include <cstdio>
@@ -95,19 +95,19 @@ std::string slugOf(const std::string &name) {
     return slug;
 }
 
-/// Places for the devices of no site, and a few names as people outside of ASCII give them.
+/// Locations for the devices of no site, and a few names as people outside of ASCII give them.
 std::string placeWithoutSite(Random &random) {
-    static constexpr std::array places = {"hall", "gate-east", "dock",       "stairs",
-                                          "roof", "yard",      "fence-north"};
+    static constexpr std::array locations = {"hall", "gate-east", "dock",       "stairs",
+                                             "roof", "yard",      "fence-north"};
     static constexpr std::array farPlaces = {"eingang-süd", "entrée-nord", "入口", "склад", "παρκινγκ"};
     return random.chance(0.03) ? farPlaces[random.below(farPlaces.size())]
-                               : places[random.below(places.size())];
+                               : locations[random.below(locations.size())];
 }
 
-std::string numbered(const std::string &place, std::size_t number) {
+std::string numbered(const std::string &location, std::size_t number) {
     std::array<char, 24> tail{};
     std::snprintf(tail.data(), tail.size(), "-%02zu", number);
-    return place + tail.data();
+    return location + tail.data();
 }
 
 class DeviceFactory {
@@ -171,6 +171,57 @@ std::vector<std::uint32_t> shuffledAddresses(std::size_t count, std::uint64_t se
     return addresses;
 }
 
+constexpr std::uint64_t malformedSeed = 0x0dd;
+
+Json validRecord(std::uint64_t n) {
+    Appearance appearance = appearanceOf(malformedSeed, n);
+    appearance.ip = "10.98.0." + std::to_string(n + 1);
+    Json record = firstRecord(appearance);
+    fillDetails(record, "odd-" + std::to_string(n));
+    return record;
+}
+
+void corrupt(Json &record, const Json &malformations) {
+    for (const auto &[name, value] : malformations.items())
+        record[name] = value;
+}
+
+Json wrongTypes() {
+    return {{"d_model", 4210},      {"d_http", "80"},       {"d_https", nullptr},
+            {"d_sdusage", "full"},  {"https_enable", "on"}, {"d_hostname", Json::array({"a", "b"})},
+            {"d_policy", "strong"}, {"d_powerfreq", 50.5},  {"d_cert_expires", "soon"}};
+}
+
+void add(DeviceTable &devices, Json record, bool sitesAsText = false) {
+    Device device;
+    device.id = devices.newId();
+    device.sites = {overviewId};
+    device.sitesAsText = sitesAsText;
+    device.authorization = Authorization::Authorized;
+    setRecord(device, std::move(record));
+    devices.add(std::move(device));
+}
+
+/// Adds records such as old or broken devices leave in a service: members missing, of wrong types, hostile.
+void addMalformedDevices(DeviceTable &devices) {
+    add(devices, Json::object());
+    const Json malformations[] = {
+        wrongTypes(),
+        {{"d_ip", "not-an-address"}},
+        {{"d_model", "<b>NC-4210</b><img src=\"http://10.98.0.1/x.png\">"}},
+        {{"d_model", std::string(10000, 'N')}},
+        {{"d_hostname", "line one\nline two\t\x01"}, {"d_fw", nullptr}},
+        {{"d_hostname", "%n%s%1"}, {"d_sdusage", -7}, {"d_http", 99999999}},
+    };
+    std::uint64_t n = 0;
+    for (const Json &malformation : malformations) {
+        Json record = validRecord(n++);
+        corrupt(record, malformation);
+        add(devices, std::move(record));
+    }
+    add(devices, validRecord(n), true);
+}
+
 } // namespace
 
 void makeFleet(Model &model, const FleetPlan &plan) {
@@ -180,8 +231,8 @@ void makeFleet(Model &model, const FleetPlan &plan) {
     const auto addresses = shuffledAddresses(plan.devices, plan.seed);
     for (std::size_t n = 0; n < plan.devices; ++n)
         factory.make(n, addresses[n]);
-    if (plan.oddRecords)
-        addOddRecords(model.devices);
+    if (plan.malformedDevices)
+        addMalformedDevices(model.devices);
     model.fleetWasMade(plan.seed, plan.devices);
     transaction.commit();
 }

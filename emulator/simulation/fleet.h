@@ -11,7 +11,7 @@ struct FleetPlan {
     std::size_t devices = 500;
     std::size_t sites = 12;
     std::uint64_t seed = 1;
-    bool oddRecords = false;
+    bool malformedDevices = false;
 };
 
 /// Fills an empty model with sites and devices and keeps them in its store.

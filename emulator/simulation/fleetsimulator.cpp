@@ -44,7 +44,7 @@ void FleetSimulator::tick() {
     transaction.commit();
 }
 
-/// Devices that are away at the start have nobody yet who brings them back.
+/// Schedules the return of devices that are unreachable at the start.
 void FleetSimulator::resume() {
     for (std::size_t i = 0; i < m_model.devices.size(); ++i) {
         const Device &device = m_model.devices.at(i);
@@ -138,7 +138,7 @@ void FleetSimulator::after(std::uint64_t ticks, Turn turn) {
     m_turns[m_tick + ticks].push_back(std::move(turn));
 }
 
-/// A generator that starts anew with each tick survives a restart without being stored.
+/// A new generator for each tick, so that its state need not be stored for a restart.
 std::uint64_t FleetSimulator::draw(std::uint64_t limit) {
     return mixed(mixed(m_seed ^ 0x11fe) ^ mixed(m_tick) ^ ++m_draws) % limit;
 }

@@ -3,7 +3,7 @@
 #include "model.h"
 #include "simulation/clock.h"
 #include "simulation/random.h"
-#include "tables/taskcodes.h"
+#include "tables/tasktable.h"
 
 #include <algorithm>
 #include <array>

@@ -9,7 +9,7 @@ std::optional<std::uint32_t> addressNumber(const std::string &text) {
     const char *at = text.data();
     const char *const end = at + text.size();
     for (int part = 0; part < 4; ++part) {
-        // Some take a leading zero for another base, so nobody writes one.
+        // Some parsers read a leading zero as octal, so none is accepted.
         const bool isPadded = end - at > 1 && at[0] == '0' && at[1] >= '0' && at[1] <= '9';
         std::uint8_t value = 0;
         const auto [rest, error] = std::from_chars(at, end, value);

@@ -1,6 +1,6 @@
 #include "tables/accounts.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/store.h"
 
 #include <algorithm>

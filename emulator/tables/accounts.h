@@ -10,19 +10,19 @@ namespace emulator {
 
 class Store;
 
-/// The accounts of the service. A service that nobody has set up yet holds the factory account alone.
+/// The accounts of the service. A service before its set-up holds the factory account alone.
 class Accounts {
 public:
     explicit Accounts(Store &store);
 
-    /// The account of an e-mail, whatever its case.
+    /// The account of an e-mail, without regard to case.
     std::optional<Account> find(const std::string &email) const;
     const std::vector<Account> &all() const { return m_accounts; }
 
     bool isFactoryFresh() const;
     void addFactoryAccount(PasswordHash password);
 
-    /// Adds an account; the first one takes the place of the factory account. Throws Refusal for a taken
+    /// Adds an account; the first one replaces the factory account. Throws Refusal for a taken
     /// e-mail, an unknown permission and a first account that is no administrator.
     void add(Account account);
     void setPassword(const std::string &email, PasswordHash password);

@@ -1,6 +1,6 @@
 #include "tables/alarmtable.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/logtable.h"
 #include "tables/records.h"
 #include "tables/store.h"

@@ -12,7 +12,7 @@ namespace emulator {
 class LogTable;
 struct Device;
 
-/// What an alarm tells of; the numbers travel.
+/// The kinds of alarms; the numbers are sent.
 enum class AlarmKind {
     ServerStarted = 1,
     LostConnection = 2,
@@ -22,7 +22,7 @@ enum class AlarmKind {
     AuthorizationLost = 6,
 };
 
-/// The alarms that nobody has removed yet.
+/// The alarms that have not been removed.
 class AlarmTable {
 public:
     AlarmTable(Store &store, LogTable &log);
@@ -48,7 +48,7 @@ private:
 /// What people call a device: its host name, or else its address.
 std::string displayName(const Device &device);
 
-/// The words of an alarm about somebody.
+/// The text of an alarm about an account or a device.
 std::string descriptionOf(AlarmKind kind, const std::string &name);
 
 } // namespace emulator

@@ -1,6 +1,6 @@
 #include "tables/batches.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 
 #include <iterator>
 #include <utility>

@@ -79,7 +79,7 @@ std::optional<std::string> plainPassword(std::string_view cipher) {
 std::string cipheredData(std::string_view plain) {
     auto text = call(&dataToCypher, plain);
     if (!text)
-        throw std::runtime_error("the answer's data cannot be ciphered");
+        throw std::runtime_error("the response's data cannot be ciphered");
     return std::move(*text);
 }
 

@@ -9,10 +9,10 @@ namespace emulator {
 /// The plain secret of a ciphered password, nothing for a text that does not authenticate.
 std::optional<std::string> plainPassword(std::string_view cipher);
 
-/// The ciphered form of an answer's data. Throws std::runtime_error when the cipher library fails.
+/// The ciphered form of a response's data. Throws std::runtime_error when the cipher library fails.
 std::string cipheredData(std::string_view plain);
 
-/// True when the key that the cipher library is told to use is usable.
+/// True when the cipher library can use its key.
 bool ciphersWork();
 
 /// A salted, slow hash of a password, which is all that is kept of it.

@@ -1,6 +1,6 @@
 #include "tables/devicetable.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "simulation/random.h"
 #include "tables/store.h"
 

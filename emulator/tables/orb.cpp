@@ -1,6 +1,6 @@
 #include "tables/orb.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/store.h"
 
 #include <algorithm>
@@ -19,9 +19,9 @@ Json organization(int number, const std::string &name, bool remoteAccess, std::s
                  {"enableRemoteAccess", remoteAccess},
                  {"sites", Json::array()}};
     for (const char *site : siteNames) {
-        const std::size_t place = made["sites"].size();
-        if (place < sites)
-            made["sites"].push_back({{"id", id + "-S" + std::to_string(place + 1)}, {"name", site}});
+        const std::size_t index = made["sites"].size();
+        if (index < sites)
+            made["sites"].push_back({{"id", id + "-S" + std::to_string(index + 1)}, {"name", site}});
     }
     return made;
 }
@@ -82,7 +82,7 @@ void Orb::forgetSignIn() {
 const Json &Orb::signedIn(std::int64_t nowMs) const {
     const auto signIn = m_state.find("sign_in");
     if (signIn == m_state.end() || signIn->at("until").get<std::int64_t>() <= nowMs)
-        throw Refusal(Code::NotAccepted, "nobody is signed in to the remote-access service");
+        throw Refusal(Code::NotAccepted, "no user is signed in to the remote-access service");
     return m_state.at("organizations");
 }
 

@@ -30,9 +30,9 @@ public:
     void signIn(const std::string &email, std::int64_t nowMs);
     void forgetSignIn();
 
-    /// The organizations of the user who is signed in. Throws Refusal(NotAccepted) when nobody is any more.
+    /// The organizations of the user who is signed in. Throws Refusal(NotAccepted) when no user is signed in.
     std::string organizationsText(std::int64_t nowMs) const;
-    /// As many organizations as wanted; the usual three for a negative number.
+    /// As many organizations as wanted; the default three for a negative number.
     void makeOrganizations(int count);
 
     /// Links the service with a site. Throws Refusal for an ended sign-in and for unknown ids.

@@ -6,9 +6,9 @@
 
 namespace emulator {
 
-RecordList::RecordList(Store &store, const std::string &table, std::size_t most)
+RecordList::RecordList(Store &store, const std::string &table, std::size_t max)
     : m_store(store),
-      m_max(most),
+      m_max(max),
       m_insert(store.database(), ("INSERT INTO " + table + " VALUES(?,?,?)").c_str()),
       m_remove(store.database(), ("DELETE FROM " + table + " WHERE row=?").c_str()),
       m_lastRow(store.lastRow(table)) {

@@ -21,7 +21,7 @@ public:
         std::string body;    ///< JSON text
     };
 
-    RecordList(Store &store, const std::string &table, std::size_t most);
+    RecordList(Store &store, const std::string &table, std::size_t max);
 
     /// The row of the next record, which no record has or had.
     std::int64_t nextRow() const { return m_lastRow + 1; }

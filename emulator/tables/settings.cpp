@@ -1,6 +1,6 @@
 #include "tables/settings.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/store.h"
 
 #include <algorithm>
@@ -13,19 +13,19 @@ constexpr auto storeKey = "settings";
 constexpr std::size_t maxPathLength = 4096;
 constexpr std::size_t maxLanguageLength = 16;
 
-/// A setting as a new service has it. A number lies between least and most, a text is no longer than most.
+/// A setting as a new service has it. A number lies between min and max, a text is no longer than max.
 struct Setting {
     const char *name;
     Json value;
-    std::int64_t least = 0;
-    std::int64_t most = 0;
+    std::int64_t min = 0;
+    std::int64_t max = 0;
 
     bool takes(const Json &wanted) const {
         if (value.is_number_integer())
-            return wanted.is_number_integer() && wanted >= least && wanted <= most;
+            return wanted.is_number_integer() && wanted >= min && wanted <= max;
         return wanted.type() == value.type() &&
                (!wanted.is_string() ||
-                wanted.get_ref<const std::string &>().size() <= static_cast<std::size_t>(most));
+                wanted.get_ref<const std::string &>().size() <= static_cast<std::size_t>(max));
     }
 };
 

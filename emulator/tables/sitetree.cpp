@@ -1,6 +1,6 @@
 #include "tables/sitetree.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/store.h"
 
 #include <algorithm>
@@ -13,7 +13,7 @@ namespace {
 
 constexpr int maxDepth = 5;
 
-/// A copy of the tree that is changed and judged before it takes the tree's place.
+/// A copy of the tree that is changed and checked before it replaces the tree.
 class Draft {
 public:
     explicit Draft(std::vector<Site> sites) : m_sites(std::move(sites)) {

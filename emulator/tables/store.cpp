@@ -8,7 +8,7 @@ namespace emulator {
 
 namespace {
 
-// The order of accounts, sites and devices is that of their rows; an upsert keeps the row's place.
+// The order of accounts, sites and devices is that of their rows; an upsert keeps the row.
 constexpr auto schema = R"(
 CREATE TABLE IF NOT EXISTS value(key TEXT PRIMARY KEY, value TEXT NOT NULL);
 CREATE TABLE IF NOT EXISTS account(row INTEGER PRIMARY KEY, email TEXT UNIQUE NOT NULL, name TEXT NOT NULL,

@@ -1,10 +1,13 @@
 #include "tables/tasktable.h"
 
-#include "http/answer.h"
+#include "http/response.h"
+#include "simulation/random.h"
 #include "tables/records.h"
 #include "tables/store.h"
 
 #include <algorithm>
+#include <iterator>
+#include <sstream>
 #include <utility>
 
 namespace emulator {
@@ -35,7 +38,7 @@ std::string workText(const Task &task) {
 
 TaskDevice::Phase phaseOf(const Json &kept) {
     using Phase = TaskDevice::Phase;
-    // What ran when the program ended is done anew.
+    // Work that ran when the program ended starts again.
     return kept.value("ended", false) ? Phase::Ended : kept.at("there") ? Phase::Queued : Phase::WithoutWork;
 }
 
@@ -84,6 +87,11 @@ Task taskOf(const Json &head) {
     task.updatedAt = head.at("updated_at");
     task.scheduledAt = head.at("scheduled_at");
     return task;
+}
+
+std::vector<std::string> wordsOf(const char *text) {
+    std::istringstream stream(text);
+    return {std::istream_iterator<std::string>(stream), {}};
 }
 
 } // namespace
@@ -204,6 +212,30 @@ std::size_t TaskTable::touch(std::size_t count) {
         task.progress = (task.progress + 1) % 101;
     }
     return touched;
+}
+
+const std::vector<std::string> &taskTypes() {
+    static const auto types =
+        wordsOf("deviceConfigFileUpload deviceFWUpgrade deviceGenSelfSignedCert deviceHttpsCertInstall "
+                "deviceHttpsCertsAndPKeys deviceIEEE_EAP_PEAP deviceIEEE_EAP_TLS devicePackageUpload "
+                "deviceAssignIPAuto deviceAssignIPManual deviceExportDeviceInfo deviceQuickSetup "
+                "deviceRestart deviceRestore deviceChangePass devicePassPolicy deviceCreateTemplate "
+                "deviceSetTemplate deviceCustomCommand");
+    return types;
+}
+
+std::string failureCode(Random &random) {
+    // Those that end in an underscore go on with the number of a slot.
+    static const auto codes = wordsOf(
+        "pTaskMismatchingStatus pTaskUnsupportedMethod pTaskMismatchingPrivateKeyAndCertificate "
+        "pTaskInvalidFileOrPublicKey pTaskCertificateNotInstalled pTaskNotInstalled "
+        "pTaskDeviceResponseTimeout pTaskDeviceResponseTimeoutEx pTaskFailedToConnectToDevice "
+        "pTaskFailedToConnectToDeviceEx pTaskFailedToSetPassword pTaskInvalidFileForThisModelGroup "
+        "pTaskIncompatibleFirmware pTaskNoSdCardDetected pTaskSdCardError_ pTaskMaxPackageUploadLimit_ "
+        "pTaskInsufficientStorage_ pTaskBrokenFile_ pInternalProcessError_");
+    const std::string &code = codes[random.below(codes.size())];
+    const std::uint64_t slot = 1 + random.below(16);
+    return code.ends_with('_') ? code + (slot < 10 ? "0" : "") + std::to_string(slot) : code;
 }
 
 } // namespace emulator

@@ -13,10 +13,11 @@
 
 namespace emulator {
 
+class Random;
 class Store;
 struct Device;
 
-/// The states of tasks and of their devices, beside the failure codes.
+/// The states of tasks and of their devices, without the failure codes.
 namespace state {
 inline constexpr auto init = "pTaskInitState";
 inline constexpr auto queued = "pTaskQueueState";
@@ -52,7 +53,7 @@ struct TaskDevice {
 
     DeviceWork work; ///< what it has to do, once that is there
 
-    // How the work stands; begun anew after a restart.
+    // State of the work; not stored, so it starts again after a restart of the program.
     int step = 0;
     int steps = 0;
     int failsAt = 0;
@@ -74,7 +75,7 @@ struct Task {
     std::string devicesText;         ///< the devices as they travel; empty when they have changed
 
     std::int64_t startsAt = 0;
-    std::vector<std::size_t> running; ///< which devices hold the places of those that run
+    std::vector<std::size_t> running; ///< indices of the devices that run
 };
 
 /// The beginning of a device's entry in a task: a JSON object that is still open.
@@ -115,5 +116,11 @@ private:
     std::unordered_map<std::string, Task *> m_byId;
     std::int64_t m_lastRow;
 };
+
+/// The types of tasks that the service has.
+const std::vector<std::string> &taskTypes();
+
+/// One of the codes in which work on a device fails.
+std::string failureCode(Random &random);
 
 } // namespace emulator

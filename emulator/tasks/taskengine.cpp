@@ -1,16 +1,16 @@
 #include "tasks/taskengine.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "simulation/random.h"
 #include "tables/devicetable.h"
 #include "tables/logtable.h"
 #include "tables/settings.h"
 #include "tables/store.h"
-#include "tables/taskcodes.h"
-#include "tasks/taskprogress.h"
+#include "tables/tasktable.h"
 #include "tasks/taskrequest.h"
 
 #include <algorithm>
+#include <array>
 #include <optional>
 #include <utility>
 
@@ -31,6 +31,46 @@ constexpr int outageSteps = 3;
 
 bool isRestart(const std::string &type) {
     return type == "deviceRestart" || type == "deviceRestore";
+}
+
+bool isFirmware(const Task &task) {
+    return task.type == "deviceFWUpgrade";
+}
+
+/// The state of a device that is at work.
+const char *runningState(const Task &task, const TaskDevice &device) {
+    static constexpr std::array phases = {state::uploading, state::updating, state::reconnecting};
+    if (!isFirmware(task) || device.step == 0)
+        return state::processing;
+    return phases[static_cast<std::size_t>(device.step) * phases.size() /
+                  static_cast<std::size_t>(device.steps)];
+}
+
+std::optional<std::size_t> nextQueued(const Task &task) {
+    for (std::size_t i = 0; i < task.devices.size(); ++i)
+        if (task.devices[i].phase == Phase::Queued)
+            return i;
+    return std::nullopt;
+}
+
+bool any(const Task &task, Phase phase) {
+    return std::any_of(task.devices.begin(), task.devices.end(),
+                       [&](const TaskDevice &device) { return device.phase == phase; });
+}
+
+int meanProgress(const Task &task) {
+    std::size_t sum = 0;
+    for (const TaskDevice &device : task.devices)
+        sum += static_cast<std::size_t>(device.progress);
+    return static_cast<int>(sum / std::max<std::size_t>(task.devices.size(), 1));
+}
+
+/// The state of a task of which some devices run.
+std::string shownState(const Task &task) {
+    const std::string first = task.devices[*std::min_element(task.running.begin(), task.running.end())].state;
+    // A device that follows another one does not begin the task a second time.
+    const bool again = isFirmware(task) && first == state::processing && any(task, Phase::Ended);
+    return again ? state::uploading : first;
 }
 
 } // namespace
@@ -170,31 +210,31 @@ bool TaskEngine::dropOverdue(Task &task, std::int64_t nowMs) const {
 bool TaskEngine::run(Task &task, std::int64_t nowMs) {
     // After a restart of the program the time begins with the first look.
     task.startsAt = task.startsAt == 0 ? nowMs : task.startsAt;
-    bool changed = fillPlaces(task, nowMs);
-    for (std::size_t place = 0; place < task.running.size();) {
-        TaskDevice &device = task.devices[task.running[place]];
+    bool changed = fillSlots(task, nowMs);
+    for (std::size_t index = 0; index < task.running.size();) {
+        TaskDevice &device = task.devices[task.running[index]];
         if (device.dueAt > nowMs) {
-            ++place;
+            ++index;
             continue;
         }
         changed = true;
         advance(task, device);
-        const bool hasPlace = device.phase == Phase::Ended && task.running.size() <= placesOf(task);
-        const auto next = hasPlace ? nextQueued(task) : std::nullopt;
+        const bool hasSlot = device.phase == Phase::Ended && task.running.size() <= slotsOf(task);
+        const auto next = hasSlot ? nextQueued(task) : std::nullopt;
         if (device.phase != Phase::Ended) {
             device.dueAt += m_rules.paceMs;
         } else if (next) {
-            task.running[place] = *next;
+            task.running[index] = *next;
             begin(task, *next, device.dueAt);
         } else {
-            task.running.erase(task.running.begin() + static_cast<std::ptrdiff_t>(place));
+            task.running.erase(task.running.begin() + static_cast<std::ptrdiff_t>(index));
         }
     }
     return changed;
 }
 
 /// How many devices of a task may run at a time; the settings bound those that get firmware, of all tasks.
-std::size_t TaskEngine::placesOf(const Task &task) const {
+std::size_t TaskEngine::slotsOf(const Task &task) const {
     const std::size_t limit = isFirmware(task) ? m_settings.firmwareLimit() : 0;
     if (limit == 0)
         return maxParallel;
@@ -204,9 +244,9 @@ std::size_t TaskEngine::placesOf(const Task &task) const {
     return std::min(maxParallel, limit - std::min(limit, elsewhere));
 }
 
-bool TaskEngine::fillPlaces(Task &task, std::int64_t nowMs) {
+bool TaskEngine::fillSlots(Task &task, std::int64_t nowMs) {
     bool filled = false;
-    while (task.running.size() < placesOf(task)) {
+    while (task.running.size() < slotsOf(task)) {
         const auto next = nextQueued(task);
         if (!next)
             break;

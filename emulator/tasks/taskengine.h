@@ -1,9 +1,11 @@
 #pragma once
 
-#include "devices/deviceoutages.h"
+#include "devices/devicework.h"
 #include "tables/tasktable.h"
 
+#include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <unordered_map>
 #include <unordered_set>
@@ -51,7 +53,7 @@ public:
     /// Does everything that has fallen due.
     void settle(std::int64_t nowMs);
 
-    /// Restarts a device for nobody's task.
+    /// Restarts a device without a task.
     void restart(Device &device, const std::string &action, std::int64_t nowMs);
 
     /// Ends what devices that are to go still do. Tasks without any other device go with them.
@@ -62,8 +64,8 @@ private:
     static void wake(Task &task, std::int64_t nowMs);
     bool dropOverdue(Task &task, std::int64_t nowMs) const;
     bool run(Task &task, std::int64_t nowMs);
-    std::size_t placesOf(const Task &task) const;
-    bool fillPlaces(Task &task, std::int64_t nowMs);
+    std::size_t slotsOf(const Task &task) const;
+    bool fillSlots(Task &task, std::int64_t nowMs);
     void begin(Task &task, std::size_t index, std::int64_t nowMs);
     void advance(const Task &task, TaskDevice &device);
     void succeed(const Task &task, TaskDevice &device);

@@ -1,8 +1,8 @@
 #include "tasks/taskrequest.h"
 
-#include "http/answer.h"
+#include "http/response.h"
 #include "tables/devicetable.h"
-#include "tables/taskcodes.h"
+#include "tables/tasktable.h"
 
 #include <algorithm>
 #include <charconv>

@@ -78,7 +78,7 @@ private slots:
     void init() {
         m_service.command("faults clear");
         m_service.command("orb disconnect");
-        tell("orb orgs usual");
+        tell("orb orgs default");
         logIn("boss@x");
         m_frame = std::make_unique<QWidget>();
         m_frame->resize(900, 600);

@@ -43,10 +43,10 @@ QString EmulatorProcess::command(const QString &line) {
     m_process.write(line.toUtf8() + '\n');
     const QDeadlineTimer deadline(patienceMs);
     while (!deadline.hasExpired() && isRunning()) {
-        const QString answer = readLine(m_process, deadline);
-        if (answer.startsWith("ok") || answer.startsWith("error"))
-            return answer;
-        m_diagnostics += answer + '\n';
+        const QString response = readLine(m_process, deadline);
+        if (response.startsWith("ok") || response.startsWith("error"))
+            return response;
+        m_diagnostics += response + '\n';
     }
     return {};
 }

@@ -19,10 +19,10 @@ public:
     int port() const { return m_port; }
     qint64 processId() const { return m_process.processId(); }
     QString readyLine() const { return m_readyLine; }
-    /// What it has written to standard error and was no answer to a command.
+    /// What it has written to standard error that is not a response to a command.
     QString diagnostics() const { return m_diagnostics; }
 
-    /// Sends a command and gives its answer; empty when there is none in time.
+    /// Sends a command and returns its response; empty when there is none in time.
     QString command(const QString &line);
     void closeInput() { m_process.closeWriteChannel(); }
     /// How it stands with the process, for the report of a failure.

@@ -11,7 +11,7 @@ void FleetTest::start(const QStringList &arguments) {
 void FleetTest::fresh(const QStringList &more) {
     m_emulator = std::make_unique<EmulatorProcess>();
     start(QStringList{"--devices", "40", "--task-pace", "80"} + more);
-    QVERIFY(tell("admit all").startsWith("ok"));
+    QVERIFY(command("admit all").startsWith("ok"));
     m_devices = m_caller.list("/v1/dev/list");
 }
 
@@ -64,7 +64,7 @@ std::size_t FleetTest::withStatus(const char *name, const char *value) {
 
 void FleetTest::setStatus(std::size_t index, const char *authorization, const char *connection) {
     const QString id = QString::fromStdString(m_devices.at(index).at("id"));
-    QVERIFY(tell(QString("status %1 \"%2\" %3 -").arg(id, authorization, connection)).startsWith("ok"));
+    QVERIFY(command(QString("status %1 \"%2\" %3 -").arg(id, authorization, connection)).startsWith("ok"));
 }
 
 std::size_t FleetTest::count(const Json &records, const char *name, const Json &value) {

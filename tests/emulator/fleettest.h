@@ -31,7 +31,7 @@ protected:
     Json record(std::size_t index) { return m_caller.list("/v1/dev/list").at(index); }
     std::string authorization(std::size_t index);
     std::size_t withStatus(const char *name, const char *value);
-    QString tell(const QString &command) { return m_emulator->command(command); }
+    QString command(const QString &line) { return m_emulator->command(line); }
     /// Sets the authorization or the connection of a device; "-" leaves it.
     void setStatus(std::size_t index, const char *authorization, const char *connection = "-");
 

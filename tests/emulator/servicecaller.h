@@ -19,8 +19,8 @@ struct Request;
 
 /// What came back for one request.
 struct Reply {
-    std::string error;   ///< why no whole answer came
-    int status = 0;      ///< HTTP status, 0 where no whole answer came
+    std::string error;   ///< why no whole response came
+    int status = 0;      ///< HTTP status, 0 where no whole response came
     int code = -1;       ///< "code", -1 where the body has no such integer
     bool secret = false; ///< "data" came ciphered
     Json body;           ///< the body as JSON, discarded where it is none

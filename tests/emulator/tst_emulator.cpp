@@ -86,7 +86,7 @@ private slots:
     void nothingPlainAtRest();
     void sameSeed_data();
     void sameSeed();
-    void oddRecords();
+    void malformedDevices();
     void pageSize();
     void commands();
 };
@@ -238,9 +238,9 @@ void EmulatorTest::sameSeed() {
     QCOMPARE(ofLeft.list("/v1/dstatus/list") == ofRight.list("/v1/dstatus/list"), same);
 }
 
-void EmulatorTest::oddRecords() {
+void EmulatorTest::malformedDevices() {
     EmulatorProcess emulator;
-    QVERIFY(emulator.start({"--odd-records"}));
+    QVERIFY(emulator.start({"--malformed-devices"}));
     ServiceCaller caller = admin(emulator);
     const Json devices = caller.list("/v1/dev/list");
     const auto any = [&](const auto &condition) {
@@ -292,6 +292,14 @@ void EmulatorTest::commands() {
     QCOMPARE(caller.list("/v1/dev/list").size(), std::size_t{23});
     QCOMPARE(emulator.command("expire-sessions"), QString("ok"));
     QCOMPARE(caller.call("/v1/config/get").code, 105);
+
+    // A command comes with its own help, and says how it is used when its arguments do not fit.
+    QCOMPARE(emulator.command("help"), QString("ok"));
+    QVERIFY(emulator.diagnostics().contains("orb orgs N|default "));
+    QCOMPARE(emulator.command("task deviceRestart"), QString("error usage: task TYPE COUNT [DELAY_MS]"));
+    QCOMPARE(emulator.command("alarm 1 2 3"), QString("error usage: alarm DESPID [COUNT]"));
+    QVERIFY(emulator.command("life maybe").startsWith("error"));
+    QVERIFY(emulator.command("orb").startsWith("error no such command"));
 }
 
 NVLDM_GUILESS_TEST(EmulatorTest)

@@ -22,8 +22,8 @@ private slots:
     void init();
     void cleanup();
 
-    void answer_data();
-    void answer();
+    void response_data();
+    void response();
     void wrongTypes_data();
     void wrongTypes();
     void reset();
@@ -58,7 +58,7 @@ void EmulatorFaultsTest::put(const char *fault) {
     QCOMPARE(m_emulator.command(QString("fault ") + fault), QString("ok"));
 }
 
-void EmulatorFaultsTest::answer_data() {
+void EmulatorFaultsTest::response_data() {
     QTest::addColumn<QString>("fault");
     QTest::addColumn<int>("status");
     QTest::addColumn<int>("code");
@@ -73,7 +73,7 @@ void EmulatorFaultsTest::answer_data() {
     QTest::newRow("code as text") << "wrong-types=code" << 200 << -1 << true << true;
 }
 
-void EmulatorFaultsTest::answer() {
+void EmulatorFaultsTest::response() {
     QFETCH(QString, fault);
     QFETCH(bool, json);
     QFETCH(bool, hasData);

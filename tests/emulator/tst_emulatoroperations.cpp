@@ -39,7 +39,7 @@ QStringList filesOfZip(const std::string &zip) {
 
 } // namespace
 
-/// What devices do for operations: passwords, restores, addresses, settings, and what they tell.
+/// What devices do for operations: passwords, restores, addresses, settings, and what they report.
 class EmulatorOperationsTest : public FleetTest {
     Q_OBJECT
 
@@ -47,7 +47,7 @@ private slots:
     void init() {
         if (!m_emulator)
             fresh(quick);
-        QVERIFY(tell("admit all").startsWith("ok"));
+        QVERIFY(command("admit all").startsWith("ok"));
         m_devices = m_caller.list("/v1/dev/list");
     }
 
@@ -141,7 +141,7 @@ private slots:
         setStatus(1, "-", "Unreachable");
         const Json task = newTask("deviceRestart", 5);
         const QString removed = QString::fromStdString(m_devices[2].at("id"));
-        QCOMPARE(tell("remove " + removed), QString("ok 1 device"));
+        QCOMPARE(command("remove " + removed), QString("ok 1 device"));
         QCOMPARE(runUnder(task, setParameters + "system_reset=0").size(), std::size_t{5});
         const Json expected = {"pTaskMismatchingStatus", "pTaskFailedToConnectToDevice", "pTaskNotInstalled",
                                "pTaskDone", "pTaskDone"};

@@ -219,7 +219,7 @@ void EmulatorServiceTest::renewedToken() {
     const std::string renewed = boss.token();
     boss.setToken(old);
     QCOMPARE(boss.call("/v1/config/get").code, 0);
-    // A request that was under way meanwhile renews nothing: the caller may take the answers in any order.
+    // A request that was under way meanwhile renews nothing: the caller may take the responses in any order.
     QCOMPARE(boss.token(), old);
     QTRY_COMPARE(boss.call("/v1/config/get").code, 105);
     boss.setToken(renewed);

@@ -69,7 +69,7 @@ private slots:
     void init() {
         if (!m_emulator)
             fresh({"--task-pace", "20", "--upload-limit", "50000000"});
-        QCOMPARE(tell("faults clear"), QString("ok"));
+        QCOMPARE(command("faults clear"), QString("ok"));
     }
 
     void firmware_data() {
@@ -266,12 +266,12 @@ private slots:
         const Json entries =
             m_caller.call("/v1/logs/list", {{"start_time", "0"}, {"end_time", "99999999999999"}})
                 .data.at("items");
-        const auto told = [&](const Json &entry) {
+        const auto isLogged = [&](const Json &entry) {
             const QString text = QString::fromStdString(entry.at("description"));
             return text.contains("\"ä.cfg\"") && text.contains(QString::number(content.size()) + " bytes") &&
                    text.endsWith(hash.toHex());
         };
-        QVERIFY(std::any_of(entries.begin(), entries.end(), told));
+        QVERIFY(std::any_of(entries.begin(), entries.end(), isLogged));
 #if !defined(__SANITIZE_ADDRESS__) && !defined(__SANITIZE_THREAD__) // these keep what is freed
         QFile status(QString("/proc/%1/status").arg(m_emulator->processId()));
         QVERIFY(status.open(QIODevice::ReadOnly));
@@ -318,7 +318,7 @@ private slots:
         QFETCH(int, size);
         QFETCH(QString, parameters);
         if (!fault.isEmpty())
-            QCOMPARE(tell("fault " + fault + "@/v1/fwupl"), QString("ok"));
+            QCOMPARE(command("fault " + fault + "@/v1/fwupl"), QString("ok"));
         Json members = {{"tid", newTask("deviceFWUpgrade", 1).at("tid")}};
         members.update(Json::parse(parameters.toStdString()));
         const Reply reply =
@@ -349,9 +349,9 @@ private slots:
             const Json task = newTask("deviceFWUpgrade", 5);
             QCOMPARE(send("/v1/fwupl", {{"tid", task.at("tid")}}, {{"fimage", "i", "x"}}), 0);
         }
-        std::size_t most = 0;
-        QTRY_VERIFY_WITH_TIMEOUT((most = std::max(most, running()), inState("pTaskDone") >= 2), 10000);
-        QCOMPARE(most, std::size_t{3});
+        std::size_t max = 0;
+        QTRY_VERIFY_WITH_TIMEOUT((max = std::max(max, running()), inState("pTaskDone") >= 2), 10000);
+        QCOMPARE(max, std::size_t{3});
     }
 
 private:

@@ -5,7 +5,7 @@
 
 namespace emulator {
 
-/// The codes of an answer, apart from 0.
+/// The codes of a response, apart from 0.
 enum class Code {
     Malformed = 3,
     UnknownId = 4,
@@ -15,10 +15,10 @@ enum class Code {
     EmailTaken = 107,
     NoMoreSessions = 108, ///< of the remote-access login: the password has expired
     UnknownRemoteUser = 110,
-    NoDeviceAnswer = 111, ///< a device is away or does not let the service in
+    NoDeviceResponse = 111, ///< a device is away or does not let the service in
 };
 
-/// Thrown wherever a request is found wanting; becomes the answer's code.
+/// Thrown wherever a request is found wanting; becomes the response's code.
 class Refusal : public std::runtime_error {
 public:
     Refusal(Code code, const std::string &why) : std::runtime_error(why), m_code(code) {}
@@ -30,7 +30,7 @@ private:
 };
 
 /// What an endpoint answers, before it is put on the wire.
-struct Answer {
+struct Response {
     int code = 0;
     std::string msg = "ok";
     std::string data;      ///< JSON text; empty for none
@@ -38,14 +38,14 @@ struct Answer {
     bool isFile = false;   ///< data are the bytes of a file, which travel alone
     std::string token;     ///< a session token for the "Authorization" header; empty for none
 
-    static Answer plain(std::string data);
-    static Answer secret(std::string data);
-    static Answer file(std::string bytes);
-    static Answer refused(int code, std::string why);
+    static Response plain(std::string data);
+    static Response secret(std::string data);
+    static Response file(std::string bytes);
+    static Response refused(int code, std::string why);
 };
 
-/// The body of an answer: the envelope with its data, ciphered where it must be. Throws std::runtime_error
+/// The body of a response: the envelope with its data, ciphered where it must be. Throws std::runtime_error
 /// when the cipher fails.
-std::string envelope(const Answer &answer);
+std::string envelope(const Response &response);
 
 } // namespace emulator
