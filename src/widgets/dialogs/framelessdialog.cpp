@@ -10,6 +10,7 @@
 #include <QLabel>
 #include <QToolButton>
 #include <QVBoxLayout>
+#include <QWindow>
 
 namespace {
 constexpr int titleHeight = 44;
@@ -17,6 +18,9 @@ constexpr int titleHeight = 44;
 constexpr int placingMs = 2000;
 /// One that wants the window elsewhere gets its way after these.
 constexpr int maxCorrections = 5;
+/// After a change of its geometry the dialog checks its native window's position so often.
+constexpr int positionCheckMs = 50;
+constexpr int maxPositionChecks = 20;
 } // namespace
 
 FramelessDialog::FramelessDialog(QWidget *parent)
@@ -44,6 +48,8 @@ FramelessDialog::FramelessDialog(QWidget *parent)
     m_close->setFocusPolicy(Qt::NoFocus);
     connect(m_close, &QToolButton::clicked, this, &QDialog::reject);
     connect(dragger, &WindowDragger::dragged, this, [this] { m_dragged = true; });
+    m_positionTimer.setInterval(positionCheckMs);
+    connect(&m_positionTimer, &QTimer::timeout, this, &FramelessDialog::checkNativePosition);
 
     auto *titleLayout = new QHBoxLayout(dragger);
     titleLayout->setContentsMargins(16, 0, 8, 0);
@@ -90,9 +96,8 @@ void FramelessDialog::centreOverParent() {
         move(preferredPlace(size().expandedTo(minimumSizeHint())).topLeft());
 }
 
-/// On X11 a window that is moved between its making and its mapping often does not fillDetails where the
-/// window manager has put it: its lists then open elsewhere. So its place is set before there is a native
-/// window.
+/// On X11 a window that is moved between its making and its mapping often does not know where the window
+/// manager has put it: its lists then open elsewhere. So its place is set before there is a native window.
 void FramelessDialog::prepareToShow() {
     ensurePolished();
     layout()->activate();
@@ -101,6 +106,7 @@ void FramelessDialog::prepareToShow() {
     centreOverParent();
     m_sinceShown.start();
     m_corrections = maxCorrections;
+    startPositionChecks();
 }
 
 void FramelessDialog::moveEvent(QMoveEvent *event) {
@@ -117,6 +123,24 @@ void FramelessDialog::correctPlace() {
         return;
     --m_corrections;
     move(place);
+}
+
+void FramelessDialog::startPositionChecks() {
+    m_positionChecks = maxPositionChecks;
+    m_positionTimer.start();
+}
+
+/// A window manager resizes and moves in two steps. Qt may note the position between the two for the native
+/// window, and sends no move event for it because it is the position before the change. Lists would open
+/// there.
+void FramelessDialog::checkNativePosition() {
+    QWindow *window = windowHandle();
+    if (--m_positionChecks <= 0 || !isVisible() || !window) {
+        m_positionTimer.stop();
+        return;
+    }
+    if (window->position() != pos())
+        window->setPosition(pos());
 }
 
 void FramelessDialog::setVisible(bool visible) {
@@ -147,6 +171,8 @@ void FramelessDialog::fitContent() {
     const QSize wanted = sizeHint().expandedTo(minimumSizeHint());
     const QRect grown(QPoint(before.center().x() - wanted.width() / 2, before.top()), wanted);
     const QRect place = m_dragged ? grown : preferredPlace(wanted);
-    if (place != before)
-        setGeometry(place);
+    if (place == before)
+        return;
+    setGeometry(place);
+    startPositionChecks();
 }

@@ -2,6 +2,7 @@
 
 #include <QDialog>
 #include <QElapsedTimer>
+#include <QTimer>
 
 #include <memory>
 
@@ -46,6 +47,8 @@ protected:
 private:
     void fitContent();
     void correctPlace();
+    void startPositionChecks();
+    void checkNativePosition();
 
     QLabel *m_title;
     QToolButton *m_close;
@@ -54,6 +57,8 @@ private:
     bool m_dragged = false;
     QElapsedTimer m_sinceShown;
     int m_corrections = 0; ///< how many are left for this showing
+    QTimer m_positionTimer;
+    int m_positionChecks = 0; ///< how many are left after the last change of the geometry
 };
 
 /// The parts of a form, set up in a widget: for members that need them before the constructor's body.
