@@ -54,6 +54,18 @@ private slots:
         QCOMPARE(tree->topLevelItemCount(), sites);
     }
 
+    void slowFirstListIsReadOnce() {
+        m_service.start({"--devices", "20"});
+        QSignalSpy readings(m_window->findChild<InventoryUpdater *>(), &InventoryUpdater::read);
+        // Beyond the first beat of the polls, to which every device would be unknown.
+        tell("fault late=3500@/v1/dev/list,times=1");
+        m_window->startWork();
+        QTRY_COMPARE_WITH_TIMEOUT(readings.size(), 1, patienceMs);
+        QTest::qWait(1000);
+        QCOMPARE(readings.size(), 1);
+        QCOMPARE(rowsOfAllTables(), 20);
+    }
+
     void sameDifferenceIsReadOnce() {
         m_service.start({"--devices", "5"});
         DeviceInventory inventory;

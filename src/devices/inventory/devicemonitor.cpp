@@ -51,7 +51,8 @@ void DeviceMonitor::monitorLoop() {
 }
 
 void DeviceMonitor::poll() {
-    if (m_busy)
+    // Without devices there is nothing to show, and the poll would only delay the first reading of the list.
+    if (m_busy || m_inventory.snapshot()->size() == 0)
         return;
     const auto read = [snapshot = m_inventory.snapshot(), codes = m_inventory.statuses(),
                        cache = m_statusCache](ServiceSession &session) {
