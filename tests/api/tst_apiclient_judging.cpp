@@ -225,6 +225,7 @@ void TestApiClientJudging::listsLongerThanAskedFor() {
     JSON alarms;
     QCOMPARE(client(m_peer.port())->listAlarmInfo(0, 2, alarms), unsigned(ApiOk));
     QCOMPARE(alarms.dump(), R"({"items":[1,2],"total_items":3})");
+    QCOMPARE(log.count("CApiClient > 3 records came, those after the first 2 are dropped"), 1);
 }
 
 void TestApiClientJudging::longHead_data() {

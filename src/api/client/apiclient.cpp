@@ -134,8 +134,10 @@ unsigned CApiClient::postForPage(const Call &call, int nStart, int nCount, JSON 
 }
 
 void CApiClient::cutTo(JSON &list, int nCount) {
-    if (list.is_array() && std::cmp_greater(list.size(), nCount))
-        list.erase(list.begin() + std::max(nCount, 0), list.end());
+    if (!list.is_array() || !std::cmp_greater(list.size(), nCount))
+        return;
+    qWarning("CApiClient > %zu records came, those after the first %d are dropped", list.size(), nCount);
+    list.erase(list.begin() + std::max(nCount, 0), list.end());
 }
 
 unsigned CApiClient::post(const Call &call, const JSON &body, const Output &output) {

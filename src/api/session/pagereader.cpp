@@ -15,13 +15,18 @@ namespace PageReader {
 namespace {
 /// A service whose pages never end is not followed for ever.
 constexpr int recordLimit = 200'000;
+
+/// Called when every page was full.
+void warnOfLimit() {
+    qWarning("%d records were read; what the service has beyond is left out", recordLimit);
+}
 } // namespace
 
 unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
                  const std::function<void(JSON &)> &take, const GoOn &goOn) {
     for (int start = 0; start < recordLimit; start += pageSize) {
         if (start > 0 && goOn && !goOn())
-            break;
+            return ApiOk;
         RequestTurn::passOn();
         JSON records;
         const unsigned result =
@@ -33,8 +38,9 @@ unsigned readAll(ServiceSession &session, ListCall list, int pageSize,
         const std::size_t count = records.size();
         take(records);
         if (count < static_cast<std::size_t>(pageSize))
-            break;
+            return ApiOk;
     }
+    warnOfLimit();
     return ApiOk;
 }
 
@@ -53,12 +59,13 @@ unsigned readTexts(ServiceSession &session, TextCall list,
             const std::vector<std::string_view> records = elementTexts(text);
             std::for_each(records.begin(), records.end(), take);
             if (records.size() < recordsOfPage)
-                break;
+                return ApiOk;
         } catch (const std::exception &error) {
             qWarning("A page of records cannot be read: %s", error.what());
             return ApiException;
         }
     }
+    warnOfLimit();
     return ApiOk;
 }
 
