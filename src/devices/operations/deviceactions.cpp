@@ -122,46 +122,6 @@ std::shared_ptr<DeviceOperations::Outcome> notBegun() {
 
 } // namespace
 
-void DeviceActions::restart(const QStringList &deviceIds) {
-    start({TaskType::title(TaskType::restart), deviceIds, &DeviceOperations::restart, {}, {}});
-}
-
-void DeviceActions::restore(const QStringList &deviceIds, const DeviceOperations::RestoreOptions &options) {
-    start({TaskType::title(TaskType::restore),
-           deviceIds,
-           [options](ServiceSession &session, const QStringList &ids) {
-               return DeviceOperations::restore(session, ids, options);
-           },
-           {},
-           {}});
-}
-
-void DeviceActions::changePassword(const QStringList &deviceIds, const QString &name,
-                                   const QString &password) {
-    start({TaskType::title(TaskType::changePassword),
-           deviceIds,
-           [name, password](ServiceSession &session, const QStringList &ids) {
-               return DeviceOperations::changePassword(session, ids, name, password);
-           },
-           [actions = QPointer(this)](const QStringList &ids) {
-               if (actions)
-                   emit actions->inputNeeded(TaskType::changePassword, ids);
-           },
-           {}});
-}
-
-void DeviceActions::setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy,
-                                      NetTask *runner, const std::function<void()> &begun) {
-    start({TaskType::title(TaskType::passwordPolicy),
-           deviceIds,
-           [policy](ServiceSession &session, const QStringList &ids) {
-               return DeviceOperations::setPasswordPolicy(session, ids, policy);
-           },
-           {},
-           {}},
-          runner, begun);
-}
-
 void DeviceActions::authorize(const QStringList &deviceIds, const QString &name, const QString &password) {
     const QString title = tr("Authorize Device");
     const auto known = notBegun();
@@ -171,12 +131,12 @@ void DeviceActions::authorize(const QStringList &deviceIds, const QString &name,
             return *known = DeviceOperations::authorize(session, deviceIds, name, password);
         },
         [this, title, deviceIds](const DeviceOperations::Outcome &outcome) {
-            const QString leftOut = leftOutText(outcome.vanished.size());
+            const QString leftOut = leftOutText(outcome.missing.size());
             if (outcome.result != ApiOk)
                 return emit failed(
                     joined({tr("%1 failed: %2.").arg(title, apiResultText(outcome.result)), leftOut}));
             QStringList asked = deviceIds;
-            asked.removeIf([&](const QString &id) { return outcome.vanished.contains(id); });
+            asked.removeIf([&](const QString &id) { return outcome.missing.contains(id); });
             emit done(joined({tr("The credentials are on their way to %n device(s).", nullptr,
                                  static_cast<int>(asked.size())),
                               leftOut}));
@@ -339,62 +299,72 @@ void DeviceActions::exportList(const QString &path, const DeviceSnapshotPtr &dev
         emit failed(tr("The device list could not be exported."));
 }
 
-void DeviceActions::start(const PendingOperation &errand) {
-    start(errand, NetJob::createRunner(qUtf8Printable(errand.name)), {});
+void DeviceActions::start(const PendingOperation &operation) {
+    start(operation, NetJob::createRunner(qUtf8Printable(operation.title())), {});
 }
 
-void DeviceActions::start(const PendingOperation &errand, NetTask *runner,
+void DeviceActions::start(const PendingOperation &operation, NetTask *runner,
                           const std::function<void()> &begun) {
     const auto known = notBegun();
     const bool started = ServiceRequest::post(
         runner, this,
-        [operation = errand.operation, ids = errand.deviceIds, known](ServiceSession &session) {
-            return *known = operation(session, ids);
+        [operation, known, retry = retryFor(operation)](ServiceSession &session) {
+            return *known = operation.run({session, operation.type, operation.deviceIds, retry});
         },
-        [this, errand, begun](const DeviceOperations::Outcome &outcome) {
-            if (!outcome.tid.isEmpty())
-                remember(outcome.tid, errand);
-            else if (!errand.repeatOf.isEmpty())
-                remember(errand.repeatOf, errand);
-            const QString leftOut = leftOutText(outcome.vanished.size());
+        [this, operation, begun](const DeviceOperations::Outcome &outcome) {
+            if (outcome.tid.isEmpty())
+                allowRetry(operation);
+            const QString leftOut = leftOutText(outcome.missing.size());
             if (outcome.result != ApiOk)
-                return emit failed(joined({failureText(errand.name, outcome), leftOut}));
+                return emit failed(joined({failureText(operation.title(), outcome), leftOut}));
             if (!leftOut.isEmpty())
                 emit failed(leftOut);
             if (begun)
                 begun();
         },
-        [this, errand, known, login = CLocalStore::instance().loginInfo()](JobOutcome end) {
+        [this, operation, known, login = CLocalStore::instance().loginInfo()](JobOutcome end) {
             if (end == JobOutcome::SessionGone)
-                reportSessionEnd(login, errand.name, errand.deviceIds.size(), *known,
-                                 [again = againFor(errand), ids = errand.deviceIds] { again(ids, {}); });
-            if (end == JobOutcome::NotRun && !errand.repeatOf.isEmpty())
-                remember(errand.repeatOf, errand);
+                reportSessionEnd(login, operation.title(), operation.deviceIds.size(), *known,
+                                 [retry = retryFor(operation), ids = operation.deviceIds] {
+                                     retry(QString()).again(ids);
+                                 });
+            if (end == JobOutcome::NotRun)
+                allowRetry(operation);
             if (end == JobOutcome::NotRun || end == JobOutcome::Failed)
-                emit failed(failureText(errand.name, end));
+                emit failed(failureText(operation.title(), end));
         });
     if (!started)
-        emit failed(failureText(errand.name, JobOutcome::NotRun));
+        emit failed(failureText(operation.title(), JobOutcome::NotRun));
 }
 
-/// An operation with a password is not kept: its dialog asks for it again.
-DeviceActions::Again DeviceActions::againFor(const PendingOperation &errand) {
-    if (errand.again)
-        return [other = errand.again](const QStringList &ids, const QString &) { other(ids); };
-    return [actions = QPointer(this), name = errand.name,
-            operation = errand.operation](const QStringList &ids, const QString &repeatOf) {
-        if (actions)
-            actions->start({name, ids, operation, {}, repeatOf});
-    };
+QString DeviceActions::PendingOperation::title() const {
+    return TaskType::title(type);
 }
 
-void DeviceActions::remember(const QString &tid, const PendingOperation &errand) {
-    const bool needsInput = static_cast<bool>(errand.again);
-    const auto again = [tid, needsInput, again = againFor(errand)](const QStringList &ids) {
-        // The new task is the one to repeat from now on, unless it cannot be made.
-        if (!needsInput)
+/// The retry of the task that a failed retry was for.
+void DeviceActions::allowRetry(const PendingOperation &operation) {
+    if (!operation.retryOf.isEmpty())
+        RetryRegistry::instance().remember(operation.retryOf, retryFor(operation)(operation.retryOf));
+}
+
+/// An operation with a password is not kept: its dialog asks for it again. Otherwise the new task is the one
+/// to retry from then on, unless it cannot be made.
+DeviceActions::Retry DeviceActions::retryFor(const PendingOperation &operation) {
+    const QPointer actions(this);
+    if (operation.needsInput)
+        return [actions, type = operation.type](const QString &) {
+            const auto ask = [actions, type](const QStringList &ids) {
+                if (actions)
+                    emit actions->inputNeeded(type, ids);
+            };
+            return RetryRegistry::Repeat{ask, true};
+        };
+    return [actions, operation](const QString &tid) {
+        const auto again = [actions, operation, tid](const QStringList &ids) {
             RetryRegistry::instance().take(tid);
-        again(ids, tid);
+            if (actions)
+                actions->start({operation.type, ids, operation.run, false, tid});
+        };
+        return RetryRegistry::Repeat{again, false};
     };
-    RetryRegistry::instance().remember(tid, {again, needsInput});
 }

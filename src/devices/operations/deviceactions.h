@@ -18,14 +18,23 @@ class DeviceActions : public QObject {
 public:
     using QObject::QObject;
 
-    void restart(const QStringList &deviceIds);
-    void restore(const QStringList &deviceIds, const DeviceOperations::RestoreOptions &options);
+    /// An operation that makes a task.
+    struct PendingOperation {
+        QString type; ///< of the task
+        QStringList deviceIds;
+        /// On the runner; see DeviceOperations::runTask.
+        std::function<DeviceOperations::Outcome(const DeviceOperations::DeviceTask &)> run;
+        bool needsInput = false; ///< holds a password, which is not kept for a retry
+        QString retryOf = {};    ///< the task whose failed devices it is for; empty for none
+
+        QString title() const;
+    };
+
+    void start(const PendingOperation &operation);
+    /// runner: carries the request. begun: called when the operation has begun.
+    void start(const PendingOperation &operation, NetTask *runner, const std::function<void()> &begun);
     /// Gives the service the credentials of the devices.
     void authorize(const QStringList &deviceIds, const QString &name, const QString &password);
-    void changePassword(const QStringList &deviceIds, const QString &name, const QString &password);
-    /// runner: carries the request. begun: called when the task of it has begun.
-    void setPasswordPolicy(const QStringList &deviceIds, const PasswordPolicy &policy, NetTask *runner,
-                           const std::function<void()> &begun);
 
     /// Deletes devices from the service for good. Here and below, what changes are the records that the
     /// service has at that moment, and what is done is told with how many devices were not there any more.
@@ -54,20 +63,7 @@ signals:
     void failed(const QString &message);
 
 private:
-    using Operation =
-        std::function<DeviceOperations::Outcome(ServiceSession &, const QStringList &deviceIds)>;
-
-    /// An operation that has a task.
-    struct PendingOperation {
-        QString name; ///< for messages
-        QStringList deviceIds;
-        Operation operation;
-        /// Does the same for other devices, where the operation itself cannot be kept for that.
-        std::function<void(const QStringList &deviceIds)> again;
-        QString repeatOf; ///< the task whose failed devices it is for; empty for none
-    };
-    /// repeatOf: as above.
-    using Again = std::function<void(const QStringList &deviceIds, const QString &repeatOf)>;
+    using Retry = std::function<RetryRegistry::Repeat(const QString &tid)>;
 
     /// The records to commit, made on the runner from the present ones, and what to say when they are.
     struct Change;
@@ -77,10 +73,8 @@ private:
     static CommitResult rebaseAndSend(ServiceSession &session, const QStringList &deviceIds,
                                       const std::function<Change(const JSON &)> &change);
 
-    void start(const PendingOperation &errand);
-    void start(const PendingOperation &errand, NetTask *runner, const std::function<void()> &begun);
-    Again againFor(const PendingOperation &errand);
-    void remember(const QString &tid, const PendingOperation &errand);
+    Retry retryFor(const PendingOperation &operation);
+    void allowRetry(const PendingOperation &operation);
     /// leftOut: a sentence about the devices that were not asked; empty for none.
     void tellAuthorized(const QStringList &deviceIds, const QString &leftOut);
 };

@@ -4,10 +4,7 @@
 #include "api/session/pagereader.h"
 #include "api/session/servicesession.h"
 #include "platform/log/messagelog.h"
-#include "tasks/queue/taskmaker.h"
-#include "tasks/service/existingdevices.h"
-#include "tasks/service/taskinfopool.h"
-#include "tasks/service/tasktype.h"
+#include "tasks/service/tasktargets.h"
 
 #include <QDebug>
 #include <QSet>
@@ -23,70 +20,6 @@ namespace {
 
 /// Devices take commands in a buffer of this size, with the zero at the end.
 constexpr std::size_t commandSize = 256;
-
-JSON idsOf(const QStringList &deviceIds) {
-    JSON ids = JSON::array();
-    for (const QString &id : deviceIds)
-        ids.push_back(id.toStdString());
-    return ids;
-}
-
-/// Makes a task for the devices; the outcome's task is empty where the service made none.
-Outcome makeTask(ServiceSession &session, const QString &type, const QStringList &deviceIds) {
-    std::string tid;
-    const unsigned result = ApiLog::logged(
-        "newTaskState", TaskMaker::make(session, type.toUtf8().constData(), idsOf(deviceIds), tid));
-    return {result, QString::fromStdString(tid), {}};
-}
-
-/// Does something for devices, and once more for the rest when the service refuses because some of them are
-/// gone meanwhile.
-template <typename Attempt>
-Outcome withoutVanished(ServiceSession &session, QStringList &deviceIds, Attempt attempt) {
-    Outcome outcome = attempt();
-    if (outcome.result != ApiServerError)
-        return outcome;
-    const ExistingDevices left = ExistingDevices::among(deviceIds, session);
-    deviceIds = left.ids;
-    if (left.canRetry())
-        outcome = attempt();
-    outcome.vanished = left.vanished;
-    return outcome;
-}
-
-/// Makes a task, shows it in the task list, and then has its work done for the devices that are left.
-template <typename Work>
-Outcome runUnderTask(ServiceSession &session, const QString &type, QStringList deviceIds, Work work) {
-    Outcome outcome = withoutVanished(session, deviceIds, [&] { return makeTask(session, type, deviceIds); });
-    if (outcome.result != ApiOk)
-        return outcome;
-    CTaskInfoPool::instance().fetchTaskStatuses(session);
-    outcome.result = work(deviceIds, outcome.tid.toStdString());
-    outcome.mayHaveBegun = session.isUnanswered();
-    return outcome;
-}
-
-/// Runs a command on devices under a task of their own.
-Outcome runCommand(ServiceSession &session, const QString &type, const QStringList &deviceIds,
-                   const QByteArray &command) {
-    return runUnderTask(session, type, deviceIds, [&](const QStringList &ids, const std::string &tid) {
-        JSON targets = JSON::array();
-        for (const QString &id : ids)
-            targets.push_back({{"id", id.toStdString()}, {"tid", tid}});
-        JSON answers;
-        return ApiLog::logged("runCustomCgisEx", session.call([&](CApiClient &client) {
-            return client.runCustomCgisEx(JSON::array({command.toStdString()}), targets, answers);
-        }));
-    });
-}
-
-QByteArray dumpOf(const QStringList &deviceIds) {
-    return QByteArray::fromStdString(dumpJson(idsOf(deviceIds)));
-}
-
-int countOf(const QStringList &deviceIds) {
-    return static_cast<int>(deviceIds.size());
-}
 
 /// A command in the buffer that devices have for it: what is longer is cut.
 template <typename... Values>
@@ -119,53 +52,51 @@ QByteArray restoreCommand(const RestoreOptions &options) {
                      network, daylightSaving, language, nadp, focus, lens);
 }
 
-Outcome restart(ServiceSession &session, const QStringList &deviceIds) {
-    return runCommand(session, TaskType::restart, deviceIds, "/cgi-bin/admin/setparam.cgi?system_reset=0");
+Outcome runTask(const DeviceTask &task, const Work &work) {
+    QStringList ids = task.deviceIds;
+    ServiceTask::Steps steps;
+    steps.type = task.type;
+    steps.ids = ids;
+    steps.devices = [&ids] { return TaskTargets::ids(ids); };
+    steps.keepOnly = [&ids](const ExistingDevices &existing) { ids = existing.ids; };
+    steps.retry = task.retry;
+    steps.work = [&](const QString &tid) { return work(ids, tid); };
+    return ServiceTask::run(task.session, steps);
 }
 
-Outcome restore(ServiceSession &session, const QStringList &deviceIds, const RestoreOptions &options) {
-    qDebug("restore device: device id count[%d], dump[%s], net[%d], dst[%d], lang[%d], nadp[%d], focus[%d], "
-           "len[%d]",
-           countOf(deviceIds), dumpOf(deviceIds).constData(), options.network, options.daylightSaving,
-           options.language, options.nadp, options.focus, options.lens);
-    return runCommand(session, TaskType::restore, deviceIds, restoreCommand(options));
-}
-
-Outcome changePassword(ServiceSession &session, const QStringList &deviceIds, const QString &name,
-                       const QString &password) {
-    qDebug("set password: device id count[%d], dump[%s], name[%s], password[%s]", countOf(deviceIds),
-           dumpOf(deviceIds).constData(), qUtf8Printable(name), MessageLog::secret(password).constData());
-    return runCommand(session, TaskType::changePassword, deviceIds, passwordCommand(name, password));
-}
-
-Outcome setPasswordPolicy(ServiceSession &session, const QStringList &deviceIds,
-                          const PasswordPolicy &policy) {
-    const Outcome outcome = runUnderTask(
-        session, TaskType::passwordPolicy, deviceIds, [&](const QStringList &ids, const std::string &tid) {
-            return session.call([&](CApiClient &client) {
-                return client.setPassPolicy(idsOf(ids), std::to_string(policy.rules).c_str(), policy.length,
-                                            tid.c_str());
-            });
-        });
-    qDebug(outcome.result == ApiOk ? "apply password policy successfully!" : "apply password policy failed!");
-    return outcome;
+Outcome runCommand(const DeviceTask &task, const QByteArray &command) {
+    return runTask(task, [&](const QStringList &ids, const QString &tid) {
+        const JSON targets = TaskTargets::withTask(TaskTargets::ids(ids), tid.toStdString());
+        JSON responses;
+        return ApiLog::logged("runCustomCgisEx", task.session.call([&](CApiClient &client) {
+            return client.runCustomCgisEx(JSON::array({command.toStdString()}), targets, responses);
+        }));
+    });
 }
 
 Outcome authorize(ServiceSession &session, const QStringList &deviceIds, const QString &name,
                   const QString &password) {
-    qDebug("authorize device: device id count[%d], dump[%s], name[%s], password[%s]", countOf(deviceIds),
-           dumpOf(deviceIds).constData(), qUtf8Printable(name), MessageLog::secret(password).constData());
+    qDebug("authorize device: device id count[%d], dump[%s], name[%s], password[%s]",
+           static_cast<int>(deviceIds.size()), dumpIds(deviceIds).constData(), qUtf8Printable(name),
+           MessageLog::secret(password).constData());
     QStringList ids = deviceIds;
-    const Outcome outcome = withoutVanished(session, ids, [&] {
-        Outcome made;
-        made.result = session.call([&](CApiClient &client) {
-            return client.authDevices(idsOf(ids), name.toUtf8().constData(), password.toUtf8().constData());
+    const auto attempt = [&] {
+        Outcome outcome;
+        outcome.result = session.call([&](CApiClient &client) {
+            return client.authDevices(TaskTargets::ids(ids), name.toUtf8().constData(),
+                                      password.toUtf8().constData());
         });
-        made.mayHaveBegun = session.isUnanswered();
-        return made;
-    });
+        outcome.mayHaveBegun = session.isUnanswered();
+        return outcome;
+    };
+    const Outcome outcome = ServiceTask::withoutMissing(
+        session, deviceIds, [&](const ExistingDevices &existing) { ids = existing.ids; }, attempt);
     qDebug(outcome.result == ApiOk ? "http api(authDevices) successfully!" : "http api(authDevices) failed!");
     return outcome;
+}
+
+QByteArray dumpIds(const QStringList &deviceIds) {
+    return QByteArray::fromStdString(dumpJson(TaskTargets::ids(deviceIds)));
 }
 
 std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStringList &deviceIds) {

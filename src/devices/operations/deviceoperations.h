@@ -1,28 +1,34 @@
 #pragma once
 
-#include "api/client/apiresult.h"
 #include "devices/inventory/devicestatus.h"
-#include "devices/inventory/passwordpolicy.h"
+#include "tasks/queue/servicetask.h"
 
 #include <QStringList>
 
+#include <functional>
 #include <map>
 
 class ServiceSession;
 
-/// What operations do on the service, one function each. For a runner's thread.
+/// What operations have the service do. For a runner's thread.
 namespace DeviceOperations {
 
-/// How an operation began; how it goes on shows in its task.
-struct Outcome {
-    unsigned result = ApiOk;
-    QString tid;               ///< the operation's task; empty where none could be made
-    QStringList vanished;      ///< ids that the service does not know any more; the others went on
-    bool mayHaveBegun = false; ///< it failed for want of an answer: the service may be at work all the same
+using ServiceTask::Outcome;
+
+/// An operation that makes a task for devices.
+struct DeviceTask {
+    ServiceSession &session;
+    QString type;
+    QStringList deviceIds;
+    std::function<RetryRegistry::Repeat(const QString &tid)> retry;
 };
 
-/// Has the devices restart.
-Outcome restart(ServiceSession &session, const QStringList &deviceIds);
+using Work = std::function<unsigned(const QStringList &deviceIds, const QString &tid)>;
+
+/// Makes the task and does the work under it, for the devices that the service still has.
+Outcome runTask(const DeviceTask &task, const Work &work);
+/// The same where the work is a command to the devices.
+Outcome runCommand(const DeviceTask &task, const QByteArray &command);
 
 /// What a restore to factory default does with parts of the settings, in the values that devices take: 1
 /// keeps a part, -1 resets it.
@@ -34,17 +40,6 @@ struct RestoreOptions {
     int focus = -1;
     int lens = -1;
 };
-
-/// Has the devices restore their settings to factory default.
-Outcome restore(ServiceSession &session, const QStringList &deviceIds, const RestoreOptions &options);
-
-/// Changes the password of an account on the devices.
-Outcome changePassword(ServiceSession &session, const QStringList &deviceIds, const QString &name,
-                       const QString &password);
-
-/// Sets the rules that the devices hold passwords to.
-Outcome setPasswordPolicy(ServiceSession &session, const QStringList &deviceIds,
-                          const PasswordPolicy &policy);
 
 /// Gives the service the credentials for the devices. There is no task for it; what the devices say to the
 /// credentials shows in their states, some time later.
@@ -58,6 +53,8 @@ std::map<DeviceStatusCode, int> readStates(ServiceSession &session, const QStrin
 QByteArray passwordCommand(const QString &name, const QString &password);
 /// How many bytes name and password may have together without being cut.
 int roomInPasswordCommand();
+/// Ids as they are logged.
+QByteArray dumpIds(const QStringList &deviceIds);
 /// The command that restores settings.
 QByteArray restoreCommand(const RestoreOptions &options);
 

@@ -1,11 +1,14 @@
 #include "devices/operations/deviceactions.h"
 #include "devices/operations/operations.h"
 #include "devices/operations/targetsummary.h"
+#include "tasks/service/tasktype.h"
 #include "widgets/dialogs/confirmdialog.h"
 
 #include <QDebug>
 
 namespace {
+
+constexpr auto restartCommand = "/cgi-bin/admin/setparam.cgi?system_reset=0";
 
 QDialog *on_restartButton_clicked(OperationContext &context, OperationRequest request) {
     auto *confirm = new ConfirmDialog(ConfirmDialog::Kind::RestartDevices, context.dialogParent());
@@ -19,7 +22,9 @@ QDialog *on_restartButton_clicked(OperationContext &context, OperationRequest re
                      [confirm, box] { confirm->setAcceptable(box->tickedCount() > 0); });
     QObject::connect(confirm, &QDialog::accepted, context.actions(), [actions = context.actions(), box] {
         qDebug("on_restartButton_clicked accepted");
-        actions->restart(box->tickedIds());
+        actions->start({TaskType::restart, box->tickedIds(), [](const DeviceOperations::DeviceTask &task) {
+                            return DeviceOperations::runCommand(task, restartCommand);
+                        }});
     });
     return confirm;
 }

@@ -3,6 +3,7 @@
 #include "devices/operations/deviceactions.h"
 #include "devices/operations/operations.h"
 #include "devices/operations/targetsummary.h"
+#include "tasks/service/tasktype.h"
 
 #include <QCheckBox>
 #include <QLabel>
@@ -89,12 +90,24 @@ void RestoreDeviceDialog::apply() {
 
 namespace {
 
+DeviceOperations::Outcome restoreSettings(const DeviceOperations::DeviceTask &task,
+                                          const DeviceOperations::RestoreOptions &options) {
+    qDebug("restore device: device id count[%d], dump[%s], net[%d], dst[%d], lang[%d], nadp[%d], focus[%d], "
+           "len[%d]",
+           static_cast<int>(task.deviceIds.size()), DeviceOperations::dumpIds(task.deviceIds).constData(),
+           options.network, options.daylightSaving, options.language, options.nadp, options.focus,
+           options.lens);
+    return DeviceOperations::runCommand(task, DeviceOperations::restoreCommand(options));
+}
+
 void onRestoreDevice(DeviceActions *actions, const QStringList &ids,
                      const DeviceOperations::RestoreOptions &options) {
     const auto &[network, daylightSaving, language, nadp, focus, lens] = options;
     qDebug("onRestoreDevice: network: %d, daylight: %d, lan: %d, nadp: %d, focus: %d, lens: %d", network,
            daylightSaving, language, nadp, focus, lens);
-    actions->restore(ids, options);
+    actions->start({TaskType::restore, ids, [options](const DeviceOperations::DeviceTask &task) {
+                        return restoreSettings(task, options);
+                    }});
 }
 
 QDialog *openFactoryDefault(OperationContext &context, OperationRequest request) {

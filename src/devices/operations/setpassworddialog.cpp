@@ -1,5 +1,6 @@
 #include "devices/operations/setpassworddialog.h"
 
+#include "api/session/servicesession.h"
 #include "devices/operations/credentialfields.h"
 #include "devices/operations/credentialrules.h"
 #include "devices/operations/deviceactions.h"
@@ -9,6 +10,8 @@
 #include "devices/operations/passwordpolicydialog.h"
 #include "devices/operations/targetsummary.h"
 #include "platform/log/messagelog.h"
+#include "tasks/service/tasktargets.h"
+#include "tasks/service/tasktype.h"
 #include "widgets/controls/passwordedit.h"
 
 #include <QComboBox>
@@ -39,6 +42,18 @@ QString strengthText(Passwords::Strength strength) {
         return SetPasswordDialog::tr("Strength: strong");
     }
     return SetPasswordDialog::tr("Strength: --");
+}
+
+DeviceOperations::Outcome setPolicy(const DeviceOperations::DeviceTask &task, const PasswordPolicy &policy) {
+    const auto work = [&](const QStringList &ids, const QString &tid) {
+        return task.session.call([&](CApiClient &client) {
+            return client.setPassPolicy(TaskTargets::ids(ids), std::to_string(policy.rules).c_str(),
+                                        policy.length, tid.toUtf8().constData());
+        });
+    };
+    const DeviceOperations::Outcome outcome = DeviceOperations::runTask(task, work);
+    qDebug(outcome.result == ApiOk ? "apply password policy successfully!" : "apply password policy failed!");
+    return outcome;
 }
 
 } // namespace
@@ -184,9 +199,7 @@ bool SetPasswordDialog::areFieldsGood() {
 void SetPasswordDialog::apply() {
     if (!areFieldsGood())
         return;
-    JSON devices = JSON::array();
-    for (const QString &id : targets().tickedIds())
-        devices.push_back(id.toStdString());
+    JSON devices = TaskTargets::ids(targets().tickedIds());
     emit setPassword(devices, m_name->currentText(), m_password->text());
     accept();
 }
@@ -208,19 +221,28 @@ void SetPasswordDialog::onApplyPolicy(int length, int type) {
             dialog->m_policies[static_cast<std::size_t>(target)] = policy;
         dialog->showPolicy();
     };
-    m_actions->setPasswordPolicy(targets().tickedIds(), policy, m_netTask.get(), begun);
+    const auto run = [policy](const DeviceOperations::DeviceTask &task) { return setPolicy(task, policy); };
+    m_actions->start({TaskType::passwordPolicy, targets().tickedIds(), run}, m_netTask.get(), begun);
 }
 
 namespace {
+
+DeviceOperations::Outcome changePassword(const DeviceOperations::DeviceTask &task, const QString &name,
+                                         const QString &password) {
+    qDebug("set password: device id count[%d], dump[%s], name[%s], password[%s]",
+           static_cast<int>(task.deviceIds.size()), DeviceOperations::dumpIds(task.deviceIds).constData(),
+           qUtf8Printable(name), MessageLog::secret(password).constData());
+    return DeviceOperations::runCommand(task, DeviceOperations::passwordCommand(name, password));
+}
 
 void onSetPassword(DeviceActions *actions, const JSON &devices, const QString &name,
                    const QString &password) {
     qDebug("onSetPassword: name: %s, password: %s", qUtf8Printable(name),
            MessageLog::secret(password).constData());
-    QStringList ids;
-    for (const JSON &id : devices)
-        ids += QString::fromStdString(id.get<std::string>());
-    actions->changePassword(ids, name, password);
+    const auto run = [name, password](const DeviceOperations::DeviceTask &task) {
+        return changePassword(task, name, password);
+    };
+    actions->start({TaskType::changePassword, TaskTargets::idTexts(devices), run, true});
 }
 
 QDialog *openSetPassword(OperationContext &context, OperationRequest request) {

@@ -14,15 +14,6 @@ namespace TaskMaker {
 
 namespace {
 
-QSet<QString> idsOf(const JSON &devices) {
-    QSet<QString> ids;
-    for (const JSON &id : TaskTargets::ids(devices)) {
-        if (id.is_string())
-            ids.insert(QString::fromStdString(id.get_ref<const std::string &>()));
-    }
-    return ids;
-}
-
 bool isFor(const TaskRecord &task, const QSet<QString> &ids) {
     return static_cast<qsizetype>(task.devices.size()) == ids.size() &&
            std::all_of(task.devices.begin(), task.devices.end(),
@@ -32,7 +23,8 @@ bool isFor(const TaskRecord &task, const QSet<QString> &ids) {
 /// The task of the list that came since the earlier one and fits; empty unless there is exactly one.
 std::string newTask(const TaskList &earlier, const ServiceSession &session, const char *serviceType,
                     const JSON &devices) {
-    const QSet<QString> ids = idsOf(devices);
+    const QStringList texts = TaskTargets::idTexts(devices);
+    const QSet<QString> ids(texts.begin(), texts.end());
     const QString type = QString::fromLatin1(serviceType);
     std::string found;
     for (const TaskRecordPtr &task : CTaskInfoPool::instance().taskList()->records()) {

@@ -5,7 +5,6 @@
 #include "api/transport/transfer.h"
 #include "platform/log/messagelog.h"
 #include "tasks/queue/failedoperations.h"
-#include "tasks/queue/taskmaker.h"
 #include "tasks/service/existingdevices.h"
 #include "tasks/service/retryregistry.h"
 #include "tasks/service/taskinfopool.h"
@@ -54,15 +53,6 @@ QSet<QString> macsOf(const QString &tid, const QStringList &deviceIds) {
     return macs;
 }
 
-QStringList idTexts(const JSON &devices) {
-    QStringList texts;
-    for (const JSON &id : TaskTargets::ids(devices)) {
-        if (id.is_string())
-            texts += QString::fromStdString(id.get_ref<const std::string &>());
-    }
-    return texts;
-}
-
 /// Takes the other devices out of a record, and the files of theirs.
 void keepOnly(const TaskKind &family, JSON &record, const QStringList &deviceIds, const QSet<QString> &macs) {
     JSON &devices = record[family.targets];
@@ -97,13 +87,6 @@ QString nameOf(const TaskKind &family, const TaskContext &step) {
 }
 
 } // namespace
-
-/// How a step ended.
-struct TaskQueue::Outcome {
-    unsigned result = ApiException;
-    bool made = false;       ///< there is a task on the service
-    bool unanswered = false; ///< the service may be at work under it all the same
-};
 
 TaskQueue::TaskQueue(std::span<const TaskKind> families, const char *iterationError)
     : m_families(families), m_walkError(iterationError), m_timer(new QTimer(this)) {
@@ -185,73 +168,66 @@ void TaskQueue::runStep(const TaskKind &family, JSON &record) {
     TaskContext step{session, record, std::make_shared<Transfer>()};
     setSending({nameOf(family, step), step.transfer, {}});
     setState(family, record, family.workingState());
-    Outcome outcome;
+    ServiceTask::Outcome outcome{ApiException, {}, {}};
     try {
         outcome = perform(family, step, record);
     } catch (const std::exception &error) {
         qWarning("%s%s", family.lines.exception, error.what());
-        outcome.made = !step.tid.empty();
+        outcome.tid = QString::fromStdString(step.tid);
     } catch (...) {
         qWarning("%sUnknown exception", family.lines.exception);
-        outcome.made = !step.tid.empty();
+        outcome.tid = QString::fromStdString(step.tid);
     }
     setSending({});
     finish(family, step, outcome);
 }
 
-TaskQueue::Outcome TaskQueue::perform(const TaskKind &family, TaskContext &step, JSON &record) {
+ServiceTask::Outcome TaskQueue::perform(const TaskKind &family, TaskContext &step, JSON &record) {
     const LoginInfo &login = step.session.login();
     qDebug("API access info ip: %s, port: %d, account: %s, token: %s", qUtf8Printable(login.address),
            static_cast<int>(login.port), qUtf8Printable(login.account),
            MessageLog::secret(login.token).constData());
-    unsigned result = makeTask(family, step, record);
-    if (result != ApiOk) {
-        qWarning("HTTP API(newTaskState) failed! (%u)", result);
-        return {result, false};
-    }
-    // The new task is to be seen before its work begins, and a repetition is only kept for tasks in the list.
-    CTaskInfoPool::instance().fetchTaskStatuses(step.session);
-    const QString tid = QString::fromStdString(step.tid);
-    setSending({nameOf(family, step), step.transfer, tid});
-    tell(step, [this, &family, ctid = stringMember(step.record, "ctid"), tid] {
-        rememberRepeat(family, ctid, tid);
-        emit serviceTaskMade(ctid, tid);
+    ServiceTask::Steps steps;
+    steps.type = QString::fromLatin1(family.serviceType);
+    steps.devices = [&] { return family.devices(record); };
+    steps.ids = TaskTargets::idTexts(record.at(family.targets));
+    steps.keepOnly = [&](const ExistingDevices &existing) {
+        keepOnly(family, record, existing.ids, existing.macs);
+    };
+    const QString ctid = stringMember(record, "ctid");
+    steps.retry = [this, &family, ctid](const QString &tid) { return retryOf(family, ctid, tid); };
+    steps.made = [&](const ServiceTask::Outcome &made) { onTaskMade(family, step, made); };
+    steps.work = [&](const QString &) { return work(family, step); };
+    ServiceTask::Outcome outcome = ServiceTask::run(step.session, steps);
+    outcome.mayHaveBegun = outcome.mayHaveBegun && step.hasBegun;
+    // The service would wait for the rest of it until it gives up.
+    if (outcome.result != ApiOk && !outcome.tid.isEmpty() && step.transfer->isCancelled() &&
+        step.session.isPresent())
+        CTaskInfoPool::instance().updateTaskState(step.session, outcome.tid, TaskState::aborted);
+    return outcome;
+}
+
+void TaskQueue::onTaskMade(const TaskKind &family, TaskContext &step, const ServiceTask::Outcome &made) {
+    step.tid = made.tid.toStdString();
+    setSending({nameOf(family, step), step.transfer, made.tid});
+    tell(step, [this, made, ctid = stringMember(step.record, "ctid")] {
+        if (!made.missing.isEmpty())
+            emit devicesLeftOut(ctid, static_cast<int>(made.missing.size()));
+        emit serviceTaskMade(ctid, made.tid);
     });
+}
+
+unsigned TaskQueue::work(const TaskKind &family, TaskContext &step) {
     family.announce(step);
-    result = family.work(step);
-    const bool unanswered = step.hasBegun && step.session.isUnanswered();
+    const unsigned result = family.work(step);
     if (result == ApiOk)
         logLine(QtDebugMsg, family.lines.success, result);
     else
         logLine(QtWarningMsg, family.lines.failure, result);
-    // The service would wait for the rest of it until it gives up.
-    if (result != ApiOk && step.transfer->isCancelled() && step.session.isPresent())
-        CTaskInfoPool::instance().updateTaskState(step.session, tid, TaskState::aborted);
-    return {result, true, unanswered};
-}
-
-/// Makes the record's task, if need be without the devices that the service has no more: these leave the
-/// record then.
-unsigned TaskQueue::makeTask(const TaskKind &family, TaskContext &step, JSON &record) {
-    const auto attempt = [&] {
-        return TaskMaker::make(step.session, family.serviceType, family.devices(record), step.tid);
-    };
-    unsigned result = attempt();
-    if (result != ApiServerError)
-        return result;
-    const ExistingDevices left = ExistingDevices::among(idTexts(record.at(family.targets)), step.session);
-    if (!left.canRetry())
-        return result;
-    keepOnly(family, record, left.ids, left.macs);
-    result = attempt();
-    if (result == ApiOk)
-        tell(step, [this, ctid = stringMember(record, "ctid"), count = left.vanished.size()] {
-            emit devicesLeftOut(ctid, static_cast<int>(count));
-        });
     return result;
 }
 
-void TaskQueue::finish(const TaskKind &family, const TaskContext &step, const Outcome &outcome) {
+void TaskQueue::finish(const TaskKind &family, const TaskContext &step, const ServiceTask::Outcome &outcome) {
     const bool over = step.session.isLost() || !step.session.isPresent();
     if (step.session.isLost())
         tell(step, [generation = step.session.login().generation] {
@@ -259,13 +235,13 @@ void TaskQueue::finish(const TaskKind &family, const TaskContext &step, const Ou
         });
     if (outcome.result == ApiOk)
         setState(family, step.record, family.successState());
-    else if (outcome.made || over)
+    else if (!outcome.tid.isEmpty() || over)
         setState(family, step.record, family.failureState());
     if (outcome.result != ApiOk && (over || !step.transfer->isCancelled())) {
         FailedSubmission failure = failureOf(family, step.record);
         failure.reason = over ? sessionEndedText() : reasonOf(outcome.result, *step.transfer);
         failure.tid = QString::fromStdString(step.tid);
-        failure.mayHaveBegun = outcome.unanswered;
+        failure.mayHaveBegun = outcome.mayHaveBegun;
         report(step.session.login(), std::move(failure));
     }
     complete(outcome.result);
@@ -333,12 +309,12 @@ QString TaskQueue::stateOf(const QString &ctid) const {
     return stringMember(m_records.find(ctid.toStdString()), "state");
 }
 
-void TaskQueue::rememberRepeat(const TaskKind &family, const QString &ctid, const QString &tid) {
-    RetryRegistry::instance().remember(tid, {[queue = QPointer(this), ctid, tid](const QStringList &ids) {
-                                                 if (queue)
-                                                     queue->repeat(ctid, tid, ids);
-                                             },
-                                             family.asksAgain});
+RetryRegistry::Repeat TaskQueue::retryOf(const TaskKind &family, const QString &ctid, const QString &tid) {
+    const auto retry = [queue = QPointer(this), ctid, tid](const QStringList &ids) {
+        if (queue)
+            queue->repeat(ctid, tid, ids);
+    };
+    return {retry, family.asksAgain};
 }
 
 void TaskQueue::repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds) {
@@ -368,7 +344,7 @@ void TaskQueue::startAgain(const QString &ctid) {
     // While its task has not been made a record still has what it was inserted with.
     if (family->asksAgain && textMember(record, "state") != family->workingState())
         return emit dialogNeeded(QString::fromLatin1(family->serviceType),
-                                 idTexts(record.at(family->targets)));
+                                 TaskTargets::idTexts(record.at(family->targets)));
     insertAgain(*family, std::move(record));
     dismiss(ctid);
 }

@@ -4,6 +4,7 @@
 #include "store/localstore.h"
 #include "tasks/queue/failedsubmission.h"
 #include "tasks/queue/queuedrecords.h"
+#include "tasks/queue/servicetask.h"
 #include "tasks/queue/taskkind.h"
 
 #include <QObject>
@@ -81,8 +82,6 @@ protected:
     bool insert(const char *type, JSON record, QString *ctid = nullptr);
 
 private:
-    struct Outcome;
-
     void onTimeout();
     void onSessionEnded();
     void onTaskListUpdated();
@@ -90,9 +89,10 @@ private:
 
     const TaskKind *familyOf(std::string_view type) const;
     void runStep(const TaskKind &family, JSON &record);
-    Outcome perform(const TaskKind &family, TaskContext &step, JSON &record);
-    unsigned makeTask(const TaskKind &family, TaskContext &step, JSON &record);
-    void finish(const TaskKind &family, const TaskContext &step, const Outcome &outcome);
+    ServiceTask::Outcome perform(const TaskKind &family, TaskContext &step, JSON &record);
+    void onTaskMade(const TaskKind &family, TaskContext &step, const ServiceTask::Outcome &made);
+    unsigned work(const TaskKind &family, TaskContext &step);
+    void finish(const TaskKind &family, const TaskContext &step, const ServiceTask::Outcome &outcome);
     void startTimer();
     void complete(quint32 error);
     void setSending(Sending sending);
@@ -100,7 +100,7 @@ private:
     void abandonOtherSessions(const TaskKind &family, const JSON &record);
     void report(const LoginInfo &login, FailedSubmission failure);
     bool setState(const TaskKind &family, const JSON &record, const char *state);
-    void rememberRepeat(const TaskKind &family, const QString &ctid, const QString &tid);
+    RetryRegistry::Repeat retryOf(const TaskKind &family, const QString &ctid, const QString &tid);
     void repeat(const QString &ctid, const QString &tid, const QStringList &deviceIds);
     void insertAgain(const TaskKind &family, JSON record);
     template <typename Told>

@@ -43,6 +43,15 @@ JSON ids(const QStringList &ids) {
     return array;
 }
 
+QStringList idTexts(const JSON &devices) {
+    QStringList texts;
+    for (const JSON &id : ids(devices)) {
+        if (id.is_string())
+            texts += QString::fromStdString(id.get_ref<const std::string &>());
+    }
+    return texts;
+}
+
 JSON withTask(const JSON &devices, const std::string &tid) {
     return converted(devices, [&](JSON id) { return JSON{{"id", std::move(id)}, {"tid", tid}}; });
 }

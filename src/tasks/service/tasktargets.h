@@ -14,6 +14,8 @@ namespace TaskTargets {
 /// ["DV…", …]
 JSON ids(const JSON &devices);
 JSON ids(const QStringList &ids);
+/// The ids as texts; elements without one are left out.
+QStringList idTexts(const JSON &devices);
 /// [{"id","tid"}, …]
 JSON withTask(const JSON &devices, const std::string &tid);
 /// [{"id", and the members of the record}, …]; members that the record lacks are left out.
