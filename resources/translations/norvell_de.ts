@@ -1983,20 +1983,12 @@
         <translation>Die Geräte werden nicht mehr verwaltet.</translation>
     </message>
     <message>
-        <source>The device states could not be read. Try again.</source>
-        <translation>Die Gerätezustände konnten nicht gelesen werden. Bitte erneut versuchen.</translation>
-    </message>
-    <message>
         <source>The device is not managed any more.</source>
         <translation>Das Gerät wird nicht mehr verwaltet.</translation>
     </message>
     <message>
         <source>The device cannot be shown.</source>
         <translation>Das Gerät kann nicht angezeigt werden.</translation>
-    </message>
-    <message>
-        <source>The device states could not be read: the client is busy, try again.</source>
-        <translation>Die Gerätezustände konnten nicht gelesen werden: Das Programm ist beschäftigt, versuchen Sie es erneut.</translation>
     </message>
 </context>
 <context>
@@ -4352,6 +4344,17 @@
     <message>
         <source>Norvell Device Manager Service Control is not running on this computer. Please check the status of local server or connect to a remote server.</source>
         <translation>Norvell Device Manager Service Control läuft auf diesem Computer nicht. Bitte den Zustand des lokalen Servers prüfen oder mit einem Remoteserver verbinden.</translation>
+    </message>
+</context>
+<context>
+    <name>StateRefresh</name>
+    <message>
+        <source>The device states could not be read. Try again.</source>
+        <translation>Die Gerätezustände konnten nicht gelesen werden. Bitte erneut versuchen.</translation>
+    </message>
+    <message>
+        <source>The device states could not be read: the client is busy, try again.</source>
+        <translation>Die Gerätezustände konnten nicht gelesen werden: Das Programm ist beschäftigt, versuchen Sie es erneut.</translation>
     </message>
 </context>
 <context>

@@ -1949,20 +1949,12 @@
         <translation>デバイスは管理されなくなっています。</translation>
     </message>
     <message>
-        <source>The device states could not be read. Try again.</source>
-        <translation>デバイスの状態を読み取れませんでした。もう一度お試しください。</translation>
-    </message>
-    <message>
         <source>The device is not managed any more.</source>
         <translation>デバイスは管理されなくなっています。</translation>
     </message>
     <message>
         <source>The device cannot be shown.</source>
         <translation>デバイスを表示できません。</translation>
-    </message>
-    <message>
-        <source>The device states could not be read: the client is busy, try again.</source>
-        <translation>デバイスの状態を読み取れませんでした。クライアントがビジー状態です。もう一度お試しください。</translation>
     </message>
 </context>
 <context>
@@ -4300,6 +4292,17 @@
     <message>
         <source>Norvell Device Manager Service Control is not running on this computer. Please check the status of local server or connect to a remote server.</source>
         <translation>このコンピューターで Norvell Device Manager Service Control が実行されていません。ローカルサーバーの状態を確認するか、リモートサーバーに接続してください。</translation>
+    </message>
+</context>
+<context>
+    <name>StateRefresh</name>
+    <message>
+        <source>The device states could not be read. Try again.</source>
+        <translation>デバイスの状態を読み取れませんでした。もう一度お試しください。</translation>
+    </message>
+    <message>
+        <source>The device states could not be read: the client is busy, try again.</source>
+        <translation>デバイスの状態を読み取れませんでした。クライアントがビジー状態です。もう一度お試しください。</translation>
     </message>
 </context>
 <context>

@@ -1,6 +1,5 @@
 #include "devices/page/devicewindow.h"
 
-#include "api/session/servicerequest.h"
 #include "devices/inventory/devicelog.h"
 #include "devices/inventory/devicemonitor.h"
 #include "devices/inventory/inventoryupdater.h"
@@ -16,13 +15,12 @@
 #include "devices/page/mainconsoletable.h"
 #include "devices/page/noticebar.h"
 #include "devices/page/reconnectingdialog.h"
-#include "devices/page/refreshdevicedialog.h"
+#include "devices/page/staterefresh.h"
 #include "devices/sites/sitecommit.h"
 #include "devices/sites/sitetree.h"
 #include "tasks/queue/uploadtaskmgr.h"
 #include "tasks/service/taskinfopool.h"
 
-#include <QApplication>
 #include <QDebug>
 #include <QHBoxLayout>
 #include <QHeaderView>
@@ -34,13 +32,11 @@
 #include <QVBoxLayout>
 
 #include <chrono>
-#include <thread>
 
 using namespace std::chrono_literals;
 
 namespace {
 
-constexpr auto refreshDelay = 2000ms;
 constexpr auto selectionLogDelay = 200ms;
 constexpr int siteTreeWidth = 248;
 
@@ -57,6 +53,7 @@ DeviceWindow::DeviceWindow(QWidget *parent)
           m_inventory, [this] { return m_siteTree->edits().commitCount(); }, this)),
       m_actions(new DeviceActions(this)),
       m_placement(new DeviceSiteActions(m_actions, this)),
+      m_refresh(new StateRefresh(m_inventory, this)),
       m_toolBar(new DeviceToolBar(m_console)),
       m_noticeBar(new NoticeBar(m_console)),
       m_tabs(new DeviceTabs(m_inventory, m_console)),
@@ -110,6 +107,9 @@ void DeviceWindow::connectParts() {
     connect(m_updater, &InventoryUpdater::statesSettled, this, [this] { m_monitor->forceRefresh(); });
     connect(&CTaskInfoPool::instance(), &CTaskInfoPool::taskListUpdated, this,
             &DeviceWindow::onTaskListUpdated);
+    connect(m_refresh, &StateRefresh::statesRead, this, &DeviceWindow::onUpdateDeviceStatus);
+    connect(m_refresh, &StateRefresh::failed, this, &DeviceWindow::showError);
+    connect(m_refresh, &StateRefresh::ended, this, &DeviceWindow::onRefreshDone);
     connect(m_siteTree, &SiteTree::currentSiteChanged, this, &DeviceWindow::onSiteChanged);
     connect(m_siteTree, &SiteTree::sitesEdited, this, [this] {
         m_noticeBar->setVisible(m_siteTree->edits().isDirty());
@@ -185,8 +185,7 @@ void DeviceWindow::stopWork() {
     clearFilter();
     if (m_reconnecting)
         m_reconnecting->close();
-    if (m_refreshing)
-        m_refreshing->close();
+    m_refresh->close();
     m_updater->stop();
     m_tasksRunning = false;
     m_online = false;
@@ -326,15 +325,14 @@ void DeviceWindow::onServerAnswered() {
         m_reconnecting->close();
     }
     // A name that is being typed is not interrupted; the next answer comes soon enough.
-    if (!m_online && !m_refreshing && !m_siteTree->isTyping())
+    if (!m_online && !m_refresh->isOpen() && !m_siteTree->isTyping())
         refreshStates();
     else
         m_updater->reloadAfterRest();
 }
 
 void DeviceWindow::onServerLost() {
-    if (m_refreshing)
-        m_refreshing->close();
+    m_refresh->close();
     // Last, since the end of a refresh counts as an answer.
     m_online = false;
     if (m_reconnecting && m_reconnecting->isVisible())
@@ -349,52 +347,7 @@ void DeviceWindow::onServerLost() {
 }
 
 void DeviceWindow::refreshStates() {
-    if (m_refreshing)
-        return;
-    QWidget *modal = QApplication::activeModalWidget();
-    m_refreshing = new RefreshDeviceDialog(modal ? modal : this);
-    m_refreshing->setAttribute(Qt::WA_DeleteOnClose);
-    connect(m_refreshing, &RefreshDeviceDialog::refresh, this, &DeviceWindow::onRefreshAll);
-    connect(m_refreshing, &RefreshDeviceDialog::refreshDone, this, &DeviceWindow::onRefreshDone);
-    connect(m_refreshing, &QDialog::rejected, this, &DeviceWindow::onRefreshDone);
-    m_refreshing->open();
-}
-
-void DeviceWindow::onRefreshAll() {
-    if (onRefreshDevice(m_refreshing))
-        return;
-    m_refreshing->finish();
-    showError(tr("The device states could not be read: the client is busy, try again."));
-}
-
-/// Reads the states for a dialog. On a runner of its own, since that of a refresh which was cancelled may
-/// still be at work. False when there is none.
-bool DeviceWindow::onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog) {
-    qDebug("onRefreshDevice@@@@@");
-    const auto read = [snapshot = m_inventory.snapshot(),
-                       codes = m_inventory.statuses()](ServiceSession &session) {
-        return InventoryReader::readStatus(session, snapshot, codes);
-    };
-    return ServiceRequest::post(
-        NetJob::createRunner("refreshing the device states", NetTask::Turn::Reading), this, read,
-        [this, dialog](const std::optional<DeviceStatusUpdate> &update) {
-            if (update)
-                onUpdateDeviceStatus(*update);
-            else if (dialog)
-                showError(tr("The device states could not be read. Try again."));
-        },
-        [this, dialog](JobOutcome end) {
-            // Whoever has cancelled it does not wait for its outcome.
-            if (!dialog)
-                return;
-            dialog->finish();
-            if (end == JobOutcome::NotRun)
-                showError(tr("The device states could not be read: the client is busy, try again."));
-            else if (end == JobOutcome::Failed)
-                showError(tr("The device states could not be read. Try again."));
-        },
-        // The devices need a moment to settle; the wait must not keep other jobs from their turn.
-        [] { std::this_thread::sleep_for(refreshDelay); });
+    m_refresh->open();
 }
 
 void DeviceWindow::onRefreshDone() {

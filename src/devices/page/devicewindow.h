@@ -21,9 +21,9 @@ class NoticeBar;
 class QSplitter;
 class QTimer;
 class ReconnectingDialog;
-class RefreshDeviceDialog;
 class SiteCommit;
 class SiteTree;
+class StateRefresh;
 
 /// The device console: the site tree, the tool bar, the three device tables and what keeps them current.
 class DeviceWindow : public QWidget, public OperationContext {
@@ -110,8 +110,6 @@ private:
     QHash<QString, QString> siteNames() const;
     OperationTargets::List targetsOf(const std::vector<DeviceRecordPtr> &devices) const;
 
-    void onRefreshAll();
-    bool onRefreshDevice(const QPointer<RefreshDeviceDialog> &dialog);
     void onRefreshDone();
 
     void showContent();
@@ -128,6 +126,7 @@ private:
     InventoryUpdater *m_updater;
     DeviceActions *m_actions;
     DeviceSiteActions *m_placement;
+    StateRefresh *m_refresh;
     DeviceToolBar *m_toolBar;
     NoticeBar *m_noticeBar;
     DeviceTabs *m_tabs;
@@ -135,7 +134,6 @@ private:
     QTimer *m_selectionLogDelay;
 
     QPointer<ReconnectingDialog> m_reconnecting;
-    QPointer<RefreshDeviceDialog> m_refreshing;
     QHash<QString, QString> m_searchedSites; ///< the names by which the search knows sites
     bool m_tasksRunning = false;
     bool m_online = false;
