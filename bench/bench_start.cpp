@@ -1,4 +1,4 @@
-// The client's start up to its first frame, against the least that a window of this toolkit costs.
+// The client's start up to its first frame, against the least that a window of Qt costs.
 //   bench_start PROGRAM REFERENCE
 
 #include <QCoreApplication>

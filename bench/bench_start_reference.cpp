@@ -1,4 +1,4 @@
-// The least that a window of this toolkit costs.
+// The least that a window of Qt costs.
 
 #include "firstframe.h"
 

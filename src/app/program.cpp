@@ -75,7 +75,7 @@ int run(int argc, char *argv[], const std::function<void(QWidget &frame)> &shown
         qDebug("An instance of this application is running!");
         return 0;
     }
-    // The log's place depends on the identity, and the toolkit logs from the application's construction on.
+    // The log's place depends on the identity, and Qt logs from the application's construction on.
     setIdentity();
     MessageLog::install();
     ProcessSetup::keepMemoryPrivate();

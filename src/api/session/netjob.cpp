@@ -23,7 +23,7 @@ bool start(NetTask *runner, QObject *receiver, std::function<void()> job, std::f
     runner->setUp(
         reinterpret_cast<quintptr>(receiver), [job = std::move(job)](quintptr) { job(); },
         std::move(preparation));
-    // Queued to the receiver: the toolkit drops the call when the receiver is destroyed first.
+    // Queued to the receiver: Qt drops the call when the receiver is destroyed first.
     QObject::connect(runner, &QThread::finished, receiver, std::move(finished),
                      static_cast<Qt::ConnectionType>(Qt::QueuedConnection | Qt::SingleShotConnection));
     runner->start();

@@ -50,7 +50,7 @@ void InterfaceLanguage::use(const QString &wish) {
     }
     if (!m_texts.load(QStringLiteral(":/translations/norvell_%1.qm").arg(language)))
         qWarning("There are no texts for the language \"%s\"", qUtf8Printable(language));
-    // A machine may have the toolkit without its translations.
+    // A machine may have Qt without its translations.
     static_cast<void>(m_toolkit.load(QStringLiteral("qtbase_%1").arg(language),
                                      QLibraryInfo::path(QLibraryInfo::TranslationsPath)));
 }

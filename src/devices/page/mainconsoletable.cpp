@@ -515,7 +515,7 @@ bool MainConsoleTable::selectDevice(int place) {
         return false;
     const QModelIndex index = model()->index(static_cast<int>(found - m_order.begin()), 0);
     selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
-    // The toolkit scrolls to no cell of a hidden column.
+    // Qt scrolls to no cell of a hidden column.
     executeDelayedItemsLayout();
     const int above = (viewport()->height() - Theme::rowHeight) / 2;
     verticalScrollBar()->setValue(index.row() * Theme::rowHeight - above);

@@ -401,7 +401,7 @@ void SiteTree::deleteSite(const QString &siteId) {
     emit sitesEdited();
 }
 
-// Nothing looks at how the drag ends: the drop has built the rows anew, and the toolkit would delete one.
+// Nothing looks at how the drag ends: the drop has built the rows anew, and Qt would delete one.
 void SiteTree::startDrag(Qt::DropActions) {
     const QList<QTreeWidgetItem *> items = selectedItems();
     QMimeData *mime = mimeData(items);
@@ -447,7 +447,7 @@ QString SiteTree::siteAt(const QPoint &position, bool mayBeBetween) const {
     if (!isSite(item))
         return {};
     const QRect row = visualItemRect(item);
-    // As much of the row as the toolkit takes to show the line between two.
+    // As much of the row as Qt takes to show the line between two.
     const int margin = mayBeBetween ? qBound(2, qRound(row.height() / 5.5), 12) : 0;
     if (position.y() - row.top() >= margin && row.bottom() - position.y() >= margin)
         return siteIdOf(item);
@@ -487,7 +487,7 @@ void SiteTree::dragMoveEvent(QDragMoveEvent *event) {
     if (m_draggedSite.isEmpty() && !m_draggedDevices)
         return event->ignore();
     const DropPlan plan = planOf(event);
-    // The toolkit opens rows, scrolls at the edges and marks the place; the rest is decided here.
+    // Qt opens rows, scrolls at the edges and marks the place; the rest is decided here.
     setDropIndicatorShown(plan.problem.isEmpty());
     QTreeWidget::dragMoveEvent(event);
     if (plan.tip.isEmpty())
@@ -541,7 +541,7 @@ void SiteTree::endDrag() {
     setDropIndicatorShown(true);
     if (state() != DraggingState)
         return;
-    // The toolkit's own end of a drag: no more scrolling and no mark.
+    // Qt's own end of a drag: no more scrolling and no mark.
     QDragLeaveEvent leave;
     QTreeWidget::dragLeaveEvent(&leave);
 }

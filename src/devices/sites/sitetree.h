@@ -15,7 +15,7 @@ class QToolButton;
 /// The navigation pane of the console: the device overview and the hierarchy of sites, with device counts.
 ///
 /// The user edits the sites here and drops devices on them. Edits of sites stay here until they are
-/// committed; drops of devices are only told. The rows are always built from the records: the toolkit moves
+/// committed; drops of devices are only told. The rows are always built from the records: Qt moves
 /// none.
 class SiteTree : public QTreeWidget {
     Q_OBJECT

@@ -18,7 +18,7 @@ namespace {
 
 #ifdef Q_OS_WIN
 
-// The toolkit's permissions leave in force what the folder above grants to everybody.
+// Qt's permissions leave in force what the folder above grants to everybody.
 bool makeFolder(const QString &folder) {
     return WindowsAcl::makeFolder(QDir::toNativeSeparators(folder).toStdWString());
 }

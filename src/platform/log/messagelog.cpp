@@ -165,7 +165,7 @@ void write(QtMsgType type, const QMessageLogContext &context, const QString &mes
 
 void handle(QtMsgType type, const QMessageLogContext &context, const QString &message) {
     write(type, context, message);
-    // The toolkit would end the process here too, on some systems without a word to who catches crashes.
+    // Qt would end the process here too, on some systems without a word to who catches crashes.
     if (type == QtFatalMsg)
         std::abort();
 }

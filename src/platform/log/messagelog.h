@@ -8,7 +8,7 @@
 /// message is one line; what would end it, or steer a terminal, is written in letters ("\n", "\u001b").
 namespace MessageLog {
 
-/// Routes every toolkit message through the log. To be called before the application object exists.
+/// Routes every Qt message through the log. To be called before the application object exists.
 /// Files of days long ago are removed.
 void install();
 

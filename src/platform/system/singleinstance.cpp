@@ -27,7 +27,7 @@ QString nativeName(const QString &key) {
 
 /// Whether another user has made the segment. Its creator counts: an owner can give it away.
 bool isForeign(const QString &name) {
-    constexpr int project = 'Q'; // the one that the toolkit makes its keys with
+    constexpr int project = 'Q'; // the one that Qt makes its keys with
     const int id = ::shmget(::ftok(QFile::encodeName(name).constData(), project), 0, 0);
     shmid_ds segment{};
     if (id < 0 || ::shmctl(id, IPC_STAT, &segment) != 0)

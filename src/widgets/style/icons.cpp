@@ -73,7 +73,7 @@ QPixmap rendered(const QString &resource, QSize pixels, const QColor &colour) {
     if (!file.open(QIODevice::ReadOnly))
         return {};
     const QByteArray content = file.readAll();
-    // Where the toolkit cannot draw this format the build has done it, under the same names.
+    // Where Qt cannot draw this format the build has done it, under the same names.
     const bool isDrawn = content.startsWith("\x89PNG");
     picture = QPixmap::fromImage(isDrawn ? drawn(resource, pixels, colour)
                                          : drawnFromSvg(coloured(content, colour), pixels));
