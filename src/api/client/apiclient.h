@@ -139,7 +139,7 @@ public:
     //
     // They are read while they are sent, so their size costs no memory. A file has to be a plain one with
     // something in it, and has to stay as it is until it is sent: ApiException otherwise. Why a transfer
-    // failed is told by the Transfer, if one was set. It may take long: run it beside the turn of other jobs.
+    // failed is told by the Transfer, if one was set. Slow: run it outside the lock of other jobs.
     // szPath: full path. szFileName: what it is called at the service. Texts are UTF-8. devices: array of
     // ids.
 

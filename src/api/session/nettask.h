@@ -10,7 +10,7 @@
 /// Set up with a job and started, from the user-interface thread; a long-lived runner takes the next job when
 /// its thread is not running. Jobs wait at most 30 s for their turn and are dropped after that. Those of a
 /// runner for readings let what a user does go first, also between the pages of a list, so that a click waits
-/// for one request of theirs at most. A runner beside the turn does not wait: it is for the polls of tasks
+/// for one request of theirs at most. A runner outside the lock does not wait: it is for the polls of tasks
 /// and alarms, for transfers, and for work that sends no requests.
 class NetTask : public QThread {
     Q_OBJECT

@@ -207,7 +207,7 @@ void AddDeviceDialog::onFound(const DeviceDiscovery::Search &search,
         m_warning.setText(tr("No device was found from %1 to %2.").arg(search.from, search.to));
 }
 
-/// Runs a job on a file beside the turn of the requests.
+/// Runs a job on a file outside the lock of the requests.
 template <typename Work, typename Done>
 void AddDeviceDialog::runOnFile(const QString &path, Work work, Done done) {
     LastFolder::rememberFile(path);
